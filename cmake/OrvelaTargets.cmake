@@ -1,0 +1,27 @@
+# What every target of the project shares: the language level, the warnings, the exactness of floating-point
+# arithmetic and the sanitizers of the chosen preset.
+
+set(ORVELA_SANITIZE "" CACHE STRING "Sanitizers to build with, such as address,undefined or thread")
+
+add_library(orvela_options INTERFACE)
+target_compile_features(orvela_options INTERFACE cxx_std_20)
+# Contracted multiply-adds would round once where the filters' arithmetic is defined to round twice.
+target_compile_options(orvela_options INTERFACE -Wall -Wextra -Wpedantic -ffp-contract=off)
+if(ORVELA_SANITIZE)
+    target_compile_options(orvela_options INTERFACE -fsanitize=${ORVELA_SANITIZE} -fno-omit-frame-pointer
+                                                    -fno-sanitize-recover=all)
+    target_link_options(orvela_options INTERFACE -fsanitize=${ORVELA_SANITIZE})
+endif()
+target_compile_definitions(orvela_options INTERFACE QT_NO_KEYWORDS)
+
+# orvela_library(NAME FOLDER...): a static library of every source below the given folders.
+function(orvela_library name)
+    set(sources)
+    foreach(folder IN LISTS ARGN)
+        file(GLOB_RECURSE found CONFIGURE_DEPENDS ${folder}/*.cpp ${folder}/*.h)
+        list(APPEND sources ${found})
+    endforeach()
+    add_library(${name} STATIC ${sources})
+    set_target_properties(${name} PROPERTIES POSITION_INDEPENDENT_CODE ON AUTOMOC ON)
+    target_link_libraries(${name} PUBLIC orvela_options)
+endfunction()

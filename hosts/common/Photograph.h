@@ -1,0 +1,60 @@
+#pragma once
+
+#include <cstdint>
+#include <filesystem>
+#include <stdexcept>
+#include <string>
+#include <vector>
+
+/// A photograph that cannot be read or written: the text names the file, the cause and what to do.
+class PhotographError : public std::runtime_error {
+public:
+    using std::runtime_error::runtime_error;
+};
+
+/// The target cannot be written (permission, disk full): see PhotographError.
+class TargetError : public PhotographError {
+public:
+    using PhotographError::PhotographError;
+};
+
+enum class ColorModel { Grey, GreyAlpha, Rgb, RgbAlpha, Cmyk };
+
+/// Number of samples per pixel.
+constexpr int samplesPerPixel(ColorModel model) {
+    switch (model) {
+    case ColorModel::Grey:
+        return 1;
+    case ColorModel::GreyAlpha:
+        return 2;
+    case ColorModel::Rgb:
+        return 3;
+    default:
+        return 4;
+    }
+}
+
+enum class FileFormat { Jpeg, Png, Tiff, WebP, Psd, Heif };
+
+/// How the source was encoded, so that the result can be written alike.
+struct Encoding {
+    FileFormat format = FileFormat::Png;
+    int quality = 0;              ///< JPEG, WebP and HEIF quality 1 to 100; 0 when unknown
+    bool chromaSubsampled = true; ///< JPEG chroma at half resolution
+    bool lossless = false;        ///< WebP without loss
+    std::string compression;      ///< TIFF compression by its library name, such as "lzw"
+    bool progressive = false;     ///< interlaced or progressive
+};
+
+/// A photograph in memory: interleaved samples, rows from the top without padding, 8 bits or native 16 bits
+/// each. CMYK samples are raw ink values as the file holds them.
+struct Photograph {
+    int width = 0;
+    int height = 0;
+    int depth = 8; ///< bits per sample, 8 or 16 (0 to 65535)
+    ColorModel model = ColorModel::Rgb;
+    std::vector<std::uint8_t> samples;    ///< width * height * samplesPerPixel(model) * depth / 8 bytes
+    std::vector<std::uint8_t> iccProfile; ///< empty when there is none
+    Encoding encoding;
+    std::filesystem::path source; ///< the file it was read from; its metadata is copied from there on writing
+};

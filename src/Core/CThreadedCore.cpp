@@ -1,0 +1,110 @@
+#include "Core/CThreadedCore.h"
+
+#include "Utility/CGenericEx.h"
+#include "Utility/Logger.h"
+
+#include <QCoreApplication>
+#include <QThread>
+
+namespace {
+
+// Events and percentages are served at most this often while rows are worked on: often enough for a stop to
+// be felt at once, seldom enough to cost a pass nothing.
+constexpr qint64 kServiceMilliseconds = 8;
+
+} // namespace
+
+CThreadedCore::CThreadedCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* parent)
+    : QObject(parent), mInPlane(inPlane), mOutPlane(outPlane) {}
+
+CThreadedCore::~CThreadedCore() = default;
+
+void CThreadedCore::setParams(const CUserParamsPhotoshop& params) {
+    mParams = params;
+}
+
+void CThreadedCore::run() {
+    mTotalSteps = 0;
+    mCurrentStep = 0;
+    mRunThread = QThread::currentThread();
+    mSinceService.start();
+    mParams.mProgressCallback = [this](int percent) { reportProgress(percent); };
+    mLastProcessingDone = false;
+
+    announce(0, 1, "Duplicating Input Plane");
+    emitPercentDone(0);
+    if (runPipeline()) {
+        announce(1, 1, "All Done");
+        emitPercentDone(100);
+        mLastProcessingDone = true;
+    } else {
+        announce(0, 1, "Failed");
+        emitPercentDone(0);
+    }
+}
+
+bool CThreadedCore::runPipeline() {
+    mOutPlane->copyFrom(*mInPlane);
+    try {
+        return doRun();
+    } catch (...) {
+        Log::log(LogLevel::Info, "%s %d", "Core/CThreadedCore", 50);
+        ExceptionStack::clear();
+        return false;
+    }
+}
+
+void CThreadedCore::stop() {
+    mParams.mCancelRequested = true;
+    mSemaphore.release();
+}
+
+void CThreadedCore::stepHandled() {
+    mSemaphore.release();
+}
+
+void CThreadedCore::setObserver(std::function<void(const TaskReport&)> observer) {
+    mObserver = std::move(observer);
+}
+
+bool CThreadedCore::lastProcessingDone() const {
+    return mLastProcessingDone;
+}
+
+void CThreadedCore::emitPercentDone(int percent) {
+    if (percent == mLastPercent)
+        return;
+    mLastPercent = percent;
+    Q_EMIT percentDone(percent);
+}
+
+void CThreadedCore::announce(int step, int total, const char* name) {
+    Q_EMIT stepDone(step, total, QString::fromLatin1(name));
+    QCoreApplication::processEvents();
+    // The permit may come from a handler on this very thread, so waiting must let its events through.
+    while (!mSemaphore.tryAcquire(1, 10))
+        QCoreApplication::processEvents();
+}
+
+void CThreadedCore::runTask(const PipelineTask& task) {
+    if (!task.condition || task.condition(mParams)) {
+        QElapsedTimer timer;
+        timer.start();
+        const bool applied = task.make(&mParams, mInPlane, mOutPlane)->Apply();
+        if (mObserver)
+            mObserver({task.name, task.kind, applied, static_cast<double>(timer.nsecsElapsed()) / 1e6});
+    }
+    if (task.afterwards)
+        task.afterwards(mParams);
+}
+
+// Called for every row, from any thread. Only the thread of the run processes events and emits; the others
+// leave their percentage for it.
+void CThreadedCore::reportProgress(int percent) {
+    mReportedPercent.store(percent, std::memory_order_relaxed);
+    if (QThread::currentThread() != mRunThread || !mSinceService.hasExpired(kServiceMilliseconds))
+        return;
+    QCoreApplication::processEvents();
+    emitPercentDone(mReportedPercent.load(std::memory_order_relaxed));
+    mSinceService.start();
+}

@@ -1,0 +1,97 @@
+#pragma once
+
+#include "Core/PipelineTable.h"
+#include "Utility/CARGBPlane.h"
+#include "Utility/CUserParams.h"
+
+#include <QElapsedTimer>
+#include <QObject>
+#include <QSemaphore>
+
+#include <atomic>
+#include <functional>
+
+class QThread;
+
+/// What one task of a run did.
+struct TaskReport {
+    const char* name; ///< class name of the task
+    TaskKind kind;
+    bool applied; ///< false when it did not apply, failed or was cancelled
+    double milliseconds;
+};
+
+/// Runs one enhancement of a whole image: a fixed sequence of tasks, announced step by step.
+///
+/// The run executes on the thread that calls run(). Pending events of that thread are processed at every
+/// announcement and while rows are worked on, so that its handlers can stop the run. One run at a time.
+class CThreadedCore : public QObject {
+    Q_OBJECT
+
+public:
+    /// The planes are not owned. After a run both hold the result.
+    CThreadedCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* parent = nullptr);
+    ~CThreadedCore() override;
+
+    /// Copies the parameters for the next run, which also forgets an earlier stop.
+    void setParams(const CUserParamsPhotoshop& params);
+    /// The parameters as the last run left them.
+    const CUserParamsPhotoshop& params() const { return mParams; }
+
+    /// Runs the pipeline; the result is told by lastProcessingDone() and the last announcement, "All Done" or
+    /// "Failed". A stopped run walks on through its announcements and ends with "All Done".
+    void run();
+
+    /// Asks the run to end: rows not yet begun are not worked on. From any thread.
+    void stop();
+
+    /// Releases the permit that the run waits for after each stepDone().
+    void stepHandled();
+
+    /// Calls `observer` after every task, on the thread of the run, before the next one starts.
+    void setObserver(std::function<void(const TaskReport&)> observer);
+
+    /// True only after a run that ended with "All Done".
+    Q_INVOKABLE bool lastProcessingDone() const;
+
+Q_SIGNALS:
+    /// Step number, number of steps, name of the step that starts now. The receiver answers with
+    /// stepHandled().
+    void stepDone(int Step, int TotalSteps, QString NextStepName = QString());
+    void percentDone(int Percent);
+    void finished();
+    void started();
+    void terminated();
+
+public Q_SLOTS:
+    /// Emits percentDone() unless the value is the last one sent.
+    void emitPercentDone(int percent);
+
+protected:
+    /// The pipeline; true when it reached its end.
+    virtual bool doRun() = 0;
+
+    /// Emits stepDone(), processes events and waits until the step was handled.
+    void announce(int step, int total, const char* name);
+
+    /// Makes, applies and destroys one task.
+    void runTask(const PipelineTask& task);
+
+    CARGBPlane* mInPlane;
+    CARGBPlane* mOutPlane;
+    int mTotalSteps = 0;
+    int mCurrentStep = 0;
+    CUserParamsPhotoshop mParams;
+
+private:
+    bool runPipeline();
+    void reportProgress(int percent);
+
+    QSemaphore mSemaphore;
+    bool mLastProcessingDone = false;
+    int mLastPercent = 0;
+    std::atomic<int> mReportedPercent = 0; ///< latest percentage of any row
+    QThread* mRunThread = nullptr;
+    QElapsedTimer mSinceService;
+    std::function<void(const TaskReport&)> mObserver;
+};

@@ -1,0 +1,36 @@
+#include "Core/CThreadedCore_FinalTouch.h"
+
+#include "Utility/CGenericEx.h"
+#include "Utility/Logger.h"
+
+namespace {
+constexpr char kSource[] = "Core/CThreadedCore_FinalTouch";
+}
+
+CThreadedCore_FinalTouch::CThreadedCore_FinalTouch(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* parent)
+    : CThreadedCore(inPlane, outPlane, parent) {
+    try {
+        mOriginalPlane = std::make_unique<CARGBPlane>(*inPlane, QString());
+    } catch (...) {
+        Log::log(LogLevel::Error, "Unable to create the Original plane from Input plane.");
+        throw COutOfMemoryEx(QStringLiteral("Unable to create the Original plane from Input plane."), kSource,
+                             11);
+    }
+}
+
+CThreadedCore_FinalTouch::~CThreadedCore_FinalTouch() = default;
+
+bool CThreadedCore_FinalTouch::doRun() {
+    Log::log(LogLevel::Info, "The core is now creating it's Original plane.");
+    mParams.Final_Touch_Mode_Enabled = true;
+    try {
+        mInPlane->copyFrom(*mOriginalPlane);
+        mOutPlane->copyFrom(*mOriginalPlane);
+        for (const PipelineTask& task : PipelineTable::finalTouchTasks())
+            runTask(task);
+    } catch (...) {
+        Log::scopeExit(LogLevel::Error, "Unable to complete the 16th filters block.");
+        throw CGenericEx(QStringLiteral("Unable to complete the 16th filters block."), kSource, 168);
+    }
+    return true;
+}

@@ -1,0 +1,142 @@
+#include "Core/PipelineTable.h"
+
+#include "Filters/COrv_II_Iter.h"
+#include "Filters/COrv_I_Iter.h"
+#include "Filters/Super_ORV.h"
+#include "Filters/Super_ORV_II.h"
+#include "Histograms/CHistogram0.h"
+#include "Histograms/CHistogram_III.h"
+#include "Histograms/CHistogram_IV.h"
+#include "Histograms/CHistogram_Luma_Final.h"
+#include "Histograms/CHistogram_Luma_after_Orv.h"
+#include "Histograms/CHistogram_VII.h"
+#include "Histograms/CHistogram_VIII.h"
+#include "Utility/Logger.h"
+
+#include <algorithm>
+#include <cstring>
+
+namespace {
+
+template <typename Task>
+std::unique_ptr<TaskBase> makeFilter(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane) {
+    return std::make_unique<Task>(params, inPlane, outPlane);
+}
+
+template <typename Task>
+std::unique_ptr<TaskBase> makeMeasurement(CUserParams* params, CARGBPlane* inPlane, CARGBPlane*) {
+    return std::make_unique<Task>(params, inPlane);
+}
+
+// The class is named once; its text is the name of the entry.
+#define FILTER(Class)                                                                                        \
+    { #Class, TaskKind::Filter, &makeFilter < Class> }
+#define FILTER_WHEN(Class, condition)                                                                        \
+    { #Class, TaskKind::Filter, &makeFilter < Class>, condition }
+#define FILTER_THEN(Class, afterwards)                                                                       \
+    { #Class, TaskKind::Filter, &makeFilter < Class>, nullptr, afterwards }
+#define HISTOGRAM(Class)                                                                                     \
+    { #Class, TaskKind::Histogram, &makeMeasurement < Class> }
+#define HISTOGRAM_THEN(Class, afterwards)                                                                    \
+    { #Class, TaskKind::Histogram, &makeMeasurement < Class>, nullptr, afterwards }
+#define ANALYZER(Class)                                                                                      \
+    { #Class, TaskKind::Analyzer, &makeMeasurement < Class> }
+
+bool removesSpots(const CUserParams& params) {
+    return params.mSliderParams.SaltPepperEnabled;
+}
+
+// The comparison decides only the log line: from here on every main run counts as dark in the middle.
+[[maybe_unused]] void testDarkness(CUserParams& params) {
+    if (2 * params.m_Middle_Acu < params.m_Dark_Acu && 5 * params.m_Light_Acu < params.m_Dark_Acu)
+        Log::log(LogLevel::Debug, "CMedian_Salt_Pepper determined that the picture is very dark.");
+    params.Dark_middle = true;
+}
+
+[[maybe_unused]] void logAutoContrast(CUserParams& params) {
+    Log::log(LogLevel::Debug, "AUTOCONTRAST MODE DETECTED %d", params.mSliderParams.AutoContrast_Enabled);
+    if (params.mSliderParams.AutoContrast_Enabled)
+        Log::log(LogLevel::Debug, "AUTOCONTRAST MODE DETECTED");
+}
+
+void takeInputLuma(CUserParams& params) {
+    params.m_OriginalLuma = params.m_OriginalLuma0;
+}
+
+constexpr char kFinished[] = "  finished";
+
+} // namespace
+
+namespace PipelineTable {
+
+std::span<const PipelineStep> mainSteps() {
+    static const std::vector<PipelineStep> steps = {
+        {"Sharp_Smart", {}},
+        {"Histogram (00)", {HISTOGRAM(CHistogram0)}, nullptr, "  CHistogram00", kFinished},
+        {"Histogram (0)", {HISTOGRAM(CHistogram0)}, nullptr, "  CHistogram0", kFinished},
+        {"Auto_Gamma", {}},
+        {"Histogram (0)", {HISTOGRAM(CHistogram0)}, nullptr, "  CHistogram0", kFinished},
+        {"Orvela (Iteration Phase I)", {FILTER(COrv_I_Iter)}},
+        {"Orvela (Iteration Phase II)", {FILTER(COrv_II_Iter)}},
+        {"Histo_I", {HISTOGRAM(CHistogram_Luma_after_Orv)}},
+        {"Auto_Contrast_I", {}},
+        {"Super_ORV_II", {FILTER(Super_ORV_II)}},
+        {"Smart Blur", {FILTER(Super_ORV), HISTOGRAM(CHistogram_IV)}},
+        {"Auto_Color", {}},
+        {"Clarity", {HISTOGRAM(CHistogram_VII)}},
+        {"NEW Auto_Contrast", {}},
+        {"Saturation", {}},
+        {"Noise", {}},
+        {"Black & White spot", {}, removesSpots},
+        {"Gamma", {}},
+        {"Contrast", {}},
+        {"Moire", {}},
+        {"Temperature", {}},
+        {"Color", {HISTOGRAM(CHistogram_VII)}},
+        {"Dark_Level", {}},
+        {"Middle_Level", {}},
+        {"Light_Level", {HISTOGRAM(CHistogram_VII)}},
+        {" Contrast_Brightness_Perceptual", {HISTOGRAM(CHistogram_VIII)}},
+        {"Histogram XI", {HISTOGRAM(CHistogram_III)}},
+        {"cAuto_Contrast_TEST", {}},
+        {"Histogram III", {HISTOGRAM(CHistogram_III)}},
+        {"Gamma_Perceptual", {}},
+        {"Level_Dark_Perceptual", {}},
+        {"Level_Middle_Perceptual", {}},
+        {"Level_Light_Perceptual", {}},
+        {"Histogram XI", {HISTOGRAM(CHistogram_III)}},
+        {"cAuto_Contrast_TEST II", {}},
+        {"Auto_Gamma", {}},
+    };
+    return steps;
+}
+
+std::span<const PipelineTask> finalTouchTasks() {
+    static const std::vector<PipelineTask> tasks = {
+        HISTOGRAM(CHistogram_Luma_Final),
+        HISTOGRAM(CHistogram_VII),
+        HISTOGRAM_THEN(CHistogram0, takeInputLuma),
+        HISTOGRAM(CHistogram_III),
+        HISTOGRAM(CHistogram_III),
+        HISTOGRAM(CHistogram_III),
+    };
+    return tasks;
+}
+
+std::vector<PipelineTask> allTasks() {
+    std::vector<PipelineTask> all;
+    const auto addOnce = [&all](const PipelineTask& task) {
+        const bool known = std::any_of(all.begin(), all.end(), [&task](const PipelineTask& each) {
+            return std::strcmp(each.name, task.name) == 0;
+        });
+        if (!known)
+            all.push_back({task.name, task.kind, task.make});
+    };
+    for (const PipelineStep& step : mainSteps())
+        std::for_each(step.tasks.begin(), step.tasks.end(), addOnce);
+    for (const PipelineTask& task : finalTouchTasks())
+        addOnce(task);
+    return all;
+}
+
+} // namespace PipelineTable

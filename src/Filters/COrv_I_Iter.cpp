@@ -1,0 +1,52 @@
+#include "Filters/COrv_I_Iter.h"
+
+#include "Filters/IterationGuard.h"
+#include "Filters/PixelMath.h"
+#include "Utility/Logger.h"
+
+COrv_I_Iter::COrv_I_Iter(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
+    : IFilter(params, inPlane, outPlane) {
+    mName = "COrv_I_Iter";
+}
+
+bool COrv_I_Iter::PreApply() {
+    const CSliderParams& sliders = mParams->mSliderParams;
+    Log::log(LogLevel::Debug, "Applying COrv_I_Iter filter from plane at 0x%x to plane at 0x%x...",
+             logAddress(mInPlane), logAddress(mOutPlane));
+    Log::log(LogLevel::Debug, "mSum_Color %f", mParams->mSum_Color);
+    mParams->Switch_TOO_SHARP_ORV_I = isTooSharpFor(*mParams, 0.25);
+    Log::log(LogLevel::Debug, "Switch_TOO_SHARP ORV I %d", mParams->Switch_TOO_SHARP_ORV_I);
+    Log::log(LogLevel::Debug, "Orvela_Level_Enabled %d", sliders.OrvelaLevelEnabled);
+    Log::log(LogLevel::Debug, "Normal_Picture %d", mParams->Normal_Picture);
+    Log::log(LogLevel::Debug, "!Under_Exposed_Picture %d", !mParams->Under_Exposed_Picture);
+    if (mParams->Switch_TOO_SHARP_ORV_I || !sliders.OrvelaLevelEnabled || !mParams->Normal_Picture ||
+        mParams->Under_Exposed_Picture)
+        return false;
+    Log::log(LogLevel::Debug, "COrv_I_Iter Condition matched.");
+    Log::log(LogLevel::Debug, "Orvela_Level_Value Second Iteration: %f",
+             static_cast<double>(sliders.OrvelaLevelValue));
+
+    const double level = static_cast<double>(sliders.OrvelaLevelValue) * 31 / 1000 + 30;
+    const auto lightness = static_cast<float>(PixelMath::trunc(level * 0.85F));
+    const auto epsilon = static_cast<float>(PixelMath::trunc(lightness * 3));
+    mParams->OrvelaLight1 = lightness;
+    if (static_cast<double>(lightness) / 0.85F > 70)
+        mParams->Soft_Orvela = false;
+    mKernel.emplace(epsilon, mInPlane->pixelCount());
+
+    Log::log(LogLevel::Debug, "Orvela_Lightness %f", static_cast<double>(lightness));
+    Log::log(LogLevel::Debug, "dEpsilon  %f", static_cast<double>(epsilon));
+    Log::log(LogLevel::Debug, "mSum_Color  %f", mParams->mSum_Color);
+    return true;
+}
+
+void COrv_I_Iter::ApplyRow(std::uint32_t row) {
+    beginRow(row, "Filters/COrv_I_Iter", 115);
+    mKernel->applyRow(*mInPlane, *mOutPlane, static_cast<int>(row));
+}
+
+bool COrv_I_Iter::PostApply() {
+    mKernel.reset();
+    Log::log(LogLevel::Debug, "Orv_I_Iter Filter complete.");
+    return true;
+}

@@ -1,0 +1,65 @@
+#include "Histograms/CHistogram0.h"
+
+#include <cstdlib>
+#include <utility>
+
+namespace {
+
+// Mean absolute difference of the channels.
+float greySpread(int r, int g, int b) {
+    return static_cast<float>(std::abs(g - b) + std::abs(r - b) + std::abs(r - g)) / 3;
+}
+
+} // namespace
+
+bool CHistogram0::PreApply() {
+    mWhite = 0;
+    mBlack = 0;
+    mSampleCount = 0;
+    prepareSampling();
+    return true;
+}
+
+void CHistogram0::ApplyRow(std::uint32_t row) {
+    beginRow(row, "Histograms/CHistogram0", __LINE__);
+    RowCounts counts = countSampledRow(row);
+    countGreys(row, counts);
+    merge(counts, true);
+}
+
+void CHistogram0::countGreys(std::uint32_t row, RowCounts& counts) const {
+    const ConstRow in = std::as_const(*mInPlane).row(static_cast<int>(row));
+    for (int x = 0; x < mInPlane->width() - mHistoStep; x += mHistoStep) {
+        const std::uint32_t luma = lumaOf(in[0][x], in[1][x], in[2][x]);
+        if (greySpread(in[0][x], in[1][x], in[2][x]) >= 30)
+            continue;
+        counts.white += luma > 230;
+        counts.black += luma < 20;
+    }
+}
+
+bool CHistogram0::PostApply() {
+    scaleBins();
+    storeBandShares();
+    mParams->m_Histo_Light_Exception =
+        HighlightShares<double>::of(mRed, mGreen, mBlue, mInPlane->pixelCount()).flag();
+    storeMeans();
+    return true;
+}
+
+void CHistogram0::storeBandShares() const {
+    const double pixels = mInPlane->pixelCount();
+    mParams->m_Dark_Acu = sumOf(mLuma, 1, 85) / pixels;
+    mParams->m_Middle_Acu = sumOf(mLuma, 86, 170) / pixels;
+    mParams->m_Light_Acu = sumOf(mLuma, 220, 255) / pixels;
+}
+
+void CHistogram0::storeMeans() const {
+    const auto mean = [this](std::uint32_t sum) {
+        return static_cast<float>(mSampleCount == 0 ? 0 : sum / mSampleCount);
+    };
+    mParams->m_OriginalLuma0 = mean(mSumLuma);
+    mParams->m_OriginalLumaR0 = mean(mSumLumaR);
+    mParams->m_OriginalLumaG0 = mean(mSumLumaG);
+    mParams->m_OriginalLumaB0 = mean(mSumLumaB);
+}

@@ -1,0 +1,15 @@
+#pragma once
+
+#include "Histograms/IHistogram.h"
+
+/// Measures an intermediate image: means, the average luma of the dark, middle and light bands, and a strong
+/// colour cast (a channel mean below half of both others).
+class CHistogram_III final : public CLocalHistogram {
+public:
+    using CLocalHistogram::CLocalHistogram;
+
+protected:
+    bool PreApply() override;
+    void ApplyRow(std::uint32_t row) override;
+    bool PostApply() override;
+};

@@ -1,0 +1,19 @@
+#pragma once
+
+#include "Histograms/IHistogram.h"
+
+/// Measures an intermediate image before the automatic colour correction: means, band averages, and a very
+/// strong colour cast (a channel mean below a quarter of both others).
+class CHistogram_IV final : public CLocalHistogram {
+public:
+    using CLocalHistogram::CLocalHistogram;
+
+protected:
+    bool PreApply() override;
+    void ApplyRow(std::uint32_t row) override;
+    bool PostApply() override;
+    void StoreResults() override;
+
+private:
+    void logFlags() const;
+};

@@ -1,0 +1,30 @@
+#include "Library/Utility/CARGBPlaneProxyDirect.h"
+
+#include <atomic>
+
+namespace {
+std::atomic<CARGBPlaneProxy*> gCurrent = nullptr;
+}
+
+CARGBPlaneProxy* CARGBPlaneProxy::current() {
+    return gCurrent;
+}
+
+void CARGBPlaneProxy::setCurrent(CARGBPlaneProxy* proxy) {
+    gCurrent = proxy;
+}
+
+CARGBPlaneProxyDirect::CARGBPlaneProxyDirect(const CARGBPlane& plane)
+    : mPlane(plane, QStringLiteral("Proxy to original image")) {
+    setCurrent(this);
+}
+
+CARGBPlaneProxyDirect::~CARGBPlaneProxyDirect() {
+    if (current() == this)
+        setCurrent(nullptr);
+}
+
+void CARGBPlaneProxyDirect::getPixels(int, int, int, int, void*, int) {
+    qFatal("Do not use this method for CARGBPlaneProxyDirect! (CARGBPlaneProxyDirect::getPixels, "
+           "Library/Utility/CARGBPlaneProxyDirect)");
+}

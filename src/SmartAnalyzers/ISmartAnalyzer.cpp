@@ -1,0 +1,37 @@
+#include "SmartAnalyzers/ISmartAnalyzer.h"
+
+#include "Utility/CGenericEx.h"
+#include "Utility/Logger.h"
+
+namespace {
+constexpr char kSource[] = "SmartAnalyzers/ISmartAnalyzer";
+}
+
+ISmartAnalyzer::ISmartAnalyzer(CUserParams* params, CARGBPlane* inPlane)
+    : mParams(params), mInPlane(inPlane) {
+    mVertEnd = inPlane ? static_cast<std::uint32_t>(inPlane->height()) : 0;
+}
+
+bool ISmartAnalyzer::Apply() {
+    RunAnalyzer();
+    return true;
+}
+
+void ISmartAnalyzer::RunAnalyzer() {
+    if (!mParams) {
+        Log::log(LogLevel::Error, "The User Settings object was invalid.");
+        throw CBadPtrEx(QStringLiteral("The User Settings object was invalid."), kSource, 26);
+    }
+    if (!mInPlane) {
+        Log::log(LogLevel::Error, "The Input plane was invalid!");
+        throw CBadPtrEx(QStringLiteral("The analyzer has an invalid Input plane."), kSource, 31);
+    }
+    try {
+        Prepare();
+        Analyze();
+    } catch (...) {
+        Log::log(LogLevel::Error, "An error occured while running a SmartAnalyzer object.");
+        throw CGenericEx(QStringLiteral("An error occured while running a SmartAnalyzer object."), kSource,
+                         40);
+    }
+}

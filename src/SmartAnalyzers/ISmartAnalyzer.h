@@ -1,0 +1,25 @@
+#pragma once
+
+#include "Filters/TaskBase.h"
+
+/// A task that turns what the histograms left in the parameters into factors for later filters. It has no row
+/// pass, changes no plane and, unlike the other tasks, lets its failure reach the caller.
+class ISmartAnalyzer : public TaskBase {
+public:
+    /// The pointers are not owned and not checked here.
+    ISmartAnalyzer(CUserParams* params, CARGBPlane* inPlane);
+
+    /// RunAnalyzer(), then true.
+    bool Apply() override;
+
+    /// Checks the pointers, prepares and analyzes.
+    /// @throws CBadPtrEx without params or input plane; CGenericEx when the analysis fails
+    void RunAnalyzer();
+
+protected:
+    virtual void Prepare() = 0;
+    virtual void Analyze() = 0;
+
+    CUserParams* mParams;
+    CARGBPlane* mInPlane;
+};

@@ -1,0 +1,120 @@
+#include "Utility/Logger.h"
+
+#include <atomic>
+#include <cstdarg>
+#include <mutex>
+
+namespace {
+
+constexpr std::size_t kMessageSize = 2048;
+constexpr std::size_t kLineSize = 1024;
+constexpr std::size_t kScopeSize = 1024;
+
+std::mutex gMutex;
+std::unique_ptr<ILogger> gLogger;
+std::atomic<bool> gInstalled = false;
+std::atomic<int> gThreshold = static_cast<int>(LogLevel::Info);
+std::atomic<bool> gPrefixes = false;
+int gDepth = 0;
+
+const char* prefixOf(LogLevel level) {
+    static constexpr const char* kPrefixes[] = {"Hgh> ", "Err> ", "Wrn> ", "Ifo> ", "Dbg> ", "Usr> "};
+    const int index = static_cast<int>(level);
+    return kPrefixes[index < 5 ? index : 5];
+}
+
+// The caller holds gMutex.
+void writeLine(LogLevel level, const char* text) {
+    if (!gLogger || static_cast<int>(level) > gThreshold.load(std::memory_order_relaxed))
+        return;
+    const QByteArray line = QByteArray(gPrefixes ? prefixOf(level) : "") + QByteArray(gDepth, '\t') + text;
+    gLogger->write(line.left(kLineSize - 1));
+}
+
+// A failure while logging must never reach the code that logs.
+template <typename Action>
+void guarded(Action&& action) noexcept {
+    try {
+        const std::lock_guard lock(gMutex);
+        action();
+    } catch (...) {
+    }
+}
+
+} // namespace
+
+CLoggerFile::CLoggerFile(const QByteArray& path) : mFile(std::fopen(path.constData(), "w")) {}
+
+void CLoggerFile::write(const QByteArray& line) {
+    if (!mFile)
+        return;
+    std::fwrite(line.constData(), 1, static_cast<std::size_t>(line.size()), mFile.get());
+    std::fputc('\n', mFile.get());
+    std::fflush(mFile.get());
+}
+
+namespace Log {
+
+void log(LogLevel level, const char* format, ...) {
+    if (!writes(level))
+        return;
+    char message[kMessageSize];
+    va_list arguments;
+    va_start(arguments, format);
+    std::vsnprintf(message, sizeof message, format, arguments);
+    va_end(arguments);
+    guarded([&] { writeLine(level, message); });
+}
+
+void scopeEntry(LogLevel level, const char* format, ...) {
+    char text[kScopeSize] = "-> ";
+    va_list arguments;
+    va_start(arguments, format);
+    std::vsnprintf(text + 3, sizeof text - 3, format, arguments);
+    va_end(arguments);
+    guarded([&] {
+        writeLine(level, text);
+        ++gDepth;
+    });
+}
+
+void scopeExit(LogLevel level, const char* format, ...) {
+    char text[kScopeSize] = "<- ";
+    va_list arguments;
+    va_start(arguments, format);
+    std::vsnprintf(text + 3, sizeof text - 3, format, arguments);
+    va_end(arguments);
+    guarded([&] {
+        if (gDepth > 0)
+            --gDepth;
+        writeLine(level, text);
+    });
+}
+
+void setThreshold(LogLevel level) {
+    gThreshold = static_cast<int>(level);
+}
+
+void setPrefixes(bool on) {
+    gPrefixes = on;
+}
+
+void install(std::unique_ptr<ILogger> logger) {
+    guarded([&] {
+        gInstalled = logger != nullptr;
+        gDepth = 0;
+        gLogger = std::move(logger);
+    });
+}
+
+const ILogger* current() {
+    const std::lock_guard lock(gMutex);
+    return gLogger.get();
+}
+
+bool writes(LogLevel level) {
+    return gInstalled.load(std::memory_order_relaxed) &&
+           static_cast<int>(level) <= gThreshold.load(std::memory_order_relaxed);
+}
+
+} // namespace Log

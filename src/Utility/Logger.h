@@ -1,0 +1,62 @@
+#pragma once
+
+#include <QByteArray>
+
+#include <cstdio>
+#include <memory>
+
+/// Importance of a log line; a line is written when its level is not above the threshold.
+enum class LogLevel : int { High = 0, Error = 1, Warning = 2, Info = 3, Debug = 4, User = 5 };
+
+/// Receiver of finished log lines.
+class ILogger {
+public:
+    virtual ~ILogger() = default;
+    virtual void write(const QByteArray& line) = 0;
+};
+
+/// Writes each line, followed by "\n", to a file and flushes it, so that a crash leaves a readable log.
+class CLoggerFile final : public ILogger {
+public:
+    /// Truncates or creates the file at `path`.
+    explicit CLoggerFile(const QByteArray& path);
+    void write(const QByteArray& line) override;
+    /// False when the file could not be opened.
+    bool isOpen() const { return mFile != nullptr; }
+
+private:
+    struct Closer {
+        void operator()(std::FILE* file) const { std::fclose(file); }
+    };
+    std::unique_ptr<std::FILE, Closer> mFile;
+};
+
+/// The process-wide logging core. Every call is safe from any thread and never throws. Formatted messages are
+/// cut at 2047 bytes, scope texts and composed lines at 1023.
+namespace Log {
+
+/// Writes one line at `level`, indented by the current depth.
+void log(LogLevel level, const char* format, ...) __attribute__((format(printf, 2, 3)));
+
+/// Writes "-> " and the text, then increases the indentation depth.
+void scopeEntry(LogLevel level, const char* format, ...) __attribute__((format(printf, 2, 3)));
+
+/// Decreases the indentation depth (not below 0), then writes "<- " and the text.
+void scopeExit(LogLevel level, const char* format, ...) __attribute__((format(printf, 2, 3)));
+
+/// Lines above this level are dropped. 3 (info) at start.
+void setThreshold(LogLevel level);
+
+/// Switches the level prefixes ("Err> " and so on) on or off. Off at start.
+void setPrefixes(bool on);
+
+/// Makes `logger` current and the indentation 0, destroying the logger before it; null stops all logging.
+void install(std::unique_ptr<ILogger> logger);
+
+/// The current logger, null when there is none.
+const ILogger* current();
+
+/// True when a line at `level` would be written: lets a caller skip the work of listing many values.
+bool writes(LogLevel level);
+
+} // namespace Log

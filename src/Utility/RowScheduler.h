@@ -1,0 +1,36 @@
+#pragma once
+
+#include <functional>
+#include <memory>
+
+/// The engine's one door to parallelism.
+namespace orvela {
+
+/// Holds the number of threads that the passes below use while it lives; one at a time. Without one they use
+/// the machine's default.
+class RowScheduler {
+public:
+    /// @param threads  number of threads, or below 1 for the automatic choice (one per processor)
+    explicit RowScheduler(int threads);
+    /// Ends the worker threads.
+    ~RowScheduler();
+    RowScheduler(const RowScheduler&) = delete;
+    RowScheduler& operator=(const RowScheduler&) = delete;
+
+    /// The automatic number of threads on this machine.
+    static int defaultThreads();
+
+    struct Impl;
+
+private:
+    std::unique_ptr<Impl> mImpl;
+};
+
+/// Calls `body(begin, end)` for pieces that together cover [begin, end), on the scheduler's threads, in any
+/// order. The range is halved, the upper piece starting at begin + (end - begin) / 2, until no piece holds
+/// more than `grain` indices. An exception thrown by a body cancels the pieces not yet started and reaches
+/// the caller as it was thrown; a range with end <= begin is empty.
+void forEachRange(unsigned begin, unsigned end, unsigned grain,
+                  const std::function<void(unsigned begin, unsigned end)>& body);
+
+} // namespace orvela

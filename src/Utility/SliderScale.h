@@ -1,0 +1,25 @@
+#pragma once
+
+/// The two-way map between a slider's position (0 to 1000) and the number shown for it.
+struct SliderScale {
+    double (*toShown)(double position);
+    double (*toPosition)(double shown);
+};
+
+namespace SliderScales {
+
+extern const SliderScale Tenth;       ///< 0 to 100
+extern const SliderScale Hundredth;   ///< 0 to 10
+extern const SliderScale Thousandth;  ///< 0 to 1
+extern const SliderScale Temperature; ///< 2000 to 10000 K
+extern const SliderScale Sharpness;   ///< 30 to 71
+extern const SliderScale Noise;       ///< 0.5 to 5
+extern const SliderScale Spots;       ///< 0.5 to 100
+extern const SliderScale Moire;       ///< 0.1 to 10
+extern const SliderScale Contrast;    ///< -100 to 100
+extern const SliderScale Brightness;  ///< -255 to 255
+extern const SliderScale Gamma;       ///< 0.1 to 10, 1.0 at position 500
+extern const SliderScale Shadows;     ///< 0 to 255
+extern const SliderScale Highlights;  ///< 255 down to 0
+
+} // namespace SliderScales

@@ -1,0 +1,65 @@
+#include "Utility/SliderTable.h"
+
+#include <gtest/gtest.h>
+
+#include <map>
+#include <string>
+
+namespace {
+
+TEST(SliderTable, MiddlePositionShowsTheDocumentedNumbers) {
+    const std::map<std::string, double> expected = {{"sldrTemperature", 6000},
+                                                    {"sldrGamma_Abs", 1},
+                                                    {"sldrNoise", 2.75},
+                                                    {"sldrAutoContrast", 50},
+                                                    {"sldrContrast_Abs", 0},
+                                                    {"sldrContrast_Perc", 50},
+                                                    {"sldrBrightness_Abs", 0},
+                                                    {"sldrBrightness_Perc", 0},
+                                                    {"sldrIllumination", 5},
+                                                    {"sldrDigitalFlash", 50},
+                                                    {"sldrSaturation", 5},
+                                                    {"sldrBlackAndWhiteSpots", 50.25},
+                                                    {"sldrOrvela1", 50.5},
+                                                    {"sldrOrvela2", 50.5},
+                                                    {"sldrOrvela3", 0.5},
+                                                    {"sldrShadows_Perc", 127.5},
+                                                    {"sldrMiddle_Perc", 1},
+                                                    {"sldrHighlights_Perc", 127.5},
+                                                    {"sldrShadows_Abs", 127.5},
+                                                    {"sldrMiddle_Abs", 1},
+                                                    {"sldrHighlights_Abs", 127.5},
+                                                    {"sldrGamma_Perc", 1},
+                                                    {"sldrMoire", 5.05},
+                                                    {"sldrAutoColor", 50},
+                                                    {"sldrFade", 50},
+                                                    {"sldrColorFilter", 50}};
+    ASSERT_EQ(SliderTable::advanced().size(), expected.size());
+    for (const SliderDescription& slider : SliderTable::advanced())
+        EXPECT_NEAR(slider.scale->toShown(500), expected.at(slider.object), 1e-9) << slider.object;
+}
+
+void expectConsistent(const SliderDescription& slider) {
+    SCOPED_TRACE(slider.object);
+    EXPECT_NEAR(slider.scale->toShown(0), slider.low, 1e-9);
+    EXPECT_NEAR(slider.scale->toShown(1000), slider.high, 1e-9);
+    for (int position = 0; position <= 1000; ++position)
+        EXPECT_NEAR(slider.scale->toPosition(slider.scale->toShown(position)), position, 1e-6);
+}
+
+TEST(SliderTable, EverySliderReachesItsRangeAndComesBackFromEveryPosition) {
+    for (const SliderDescription& slider : SliderTable::advanced())
+        expectConsistent(slider);
+    for (const SliderDescription& slider : SliderTable::finalTouch())
+        expectConsistent(slider);
+    for (const EGUIMode mode : {Mode_SmartLevels, Mode_Adjustments}) {
+        for (const SliderDescription& slider : SliderTable::threeSliders(mode))
+            expectConsistent(slider);
+    }
+    for (int mode = Mode_SmartSharpness; mode <= Mode_ColorFilter; ++mode)
+        expectConsistent(*SliderTable::single(static_cast<EGUIMode>(mode)));
+    EXPECT_EQ(SliderTable::single(Mode_SmartLevels), nullptr);
+    EXPECT_TRUE(SliderTable::threeSliders(Mode_Advanced).empty());
+}
+
+} // namespace

@@ -1,0 +1,11 @@
+#include <QCoreApplication>
+
+#include <gtest/gtest.h>
+
+int main(int argc, char** argv) {
+    testing::InitGoogleTest(&argc, argv);
+    QCoreApplication application(argc, argv);
+    QCoreApplication::setOrganizationName(QStringLiteral("Kestrand"));
+    QCoreApplication::setApplicationName(QStringLiteral("OrvelaTests"));
+    return RUN_ALL_TESTS();
+}
