@@ -11,6 +11,11 @@
 #include "Histograms/CHistogram_Luma_after_Orv.h"
 #include "Histograms/CHistogram_VII.h"
 #include "Histograms/CHistogram_VIII.h"
+#include "SmartAnalyzers/CSmartAnalyzer_Digital_Flash.h"
+#include "SmartAnalyzers/CSmartAnalyzer_Perceptual_Contrast_Brightness.h"
+#include "SmartAnalyzers/CSmartAnalyzer_Perceptual_Level_Dark.h"
+#include "SmartAnalyzers/CSmartAnalyzer_Perceptual_Level_Middle.h"
+#include "SmartAnalyzers/CSmartAnalyzer_Perceptual_Level_Right.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>
@@ -95,11 +100,14 @@ std::span<const PipelineStep> mainSteps() {
         {"Color", {HISTOGRAM(CHistogram_VII)}},
         {"Dark_Level", {}},
         {"Middle_Level", {}},
-        {"Light_Level", {HISTOGRAM(CHistogram_VII)}},
-        {" Contrast_Brightness_Perceptual", {HISTOGRAM(CHistogram_VIII)}},
+        {"Light_Level", {HISTOGRAM(CHistogram_VII), ANALYZER(CSmartAnalyzer_Perceptual_Contrast_Brightness)}},
+        {" Contrast_Brightness_Perceptual",
+         {HISTOGRAM(CHistogram_VIII), ANALYZER(CSmartAnalyzer_Digital_Flash)}},
         {"Histogram XI", {HISTOGRAM(CHistogram_III)}},
         {"cAuto_Contrast_TEST", {}},
-        {"Histogram III", {HISTOGRAM(CHistogram_III)}},
+        {"Histogram III",
+         {HISTOGRAM(CHistogram_III), ANALYZER(CSmartAnalyzer_Perceptual_Level_Dark),
+          ANALYZER(CSmartAnalyzer_Perceptual_Level_Middle), ANALYZER(CSmartAnalyzer_Perceptual_Level_Right)}},
         {"Gamma_Perceptual", {}},
         {"Level_Dark_Perceptual", {}},
         {"Level_Middle_Perceptual", {}},
@@ -116,9 +124,13 @@ std::span<const PipelineTask> finalTouchTasks() {
         HISTOGRAM(CHistogram_Luma_Final),
         HISTOGRAM(CHistogram_VII),
         HISTOGRAM_THEN(CHistogram0, takeInputLuma),
+        ANALYZER(CSmartAnalyzer_Perceptual_Contrast_Brightness),
         HISTOGRAM(CHistogram_III),
+        ANALYZER(CSmartAnalyzer_Perceptual_Level_Dark),
         HISTOGRAM(CHistogram_III),
+        ANALYZER(CSmartAnalyzer_Perceptual_Level_Middle),
         HISTOGRAM(CHistogram_III),
+        ANALYZER(CSmartAnalyzer_Perceptual_Level_Right),
     };
     return tasks;
 }

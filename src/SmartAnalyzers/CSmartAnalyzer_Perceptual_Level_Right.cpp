@@ -1,0 +1,87 @@
+#include "SmartAnalyzers/CSmartAnalyzer_Perceptual_Level_Right.h"
+
+#include "SmartAnalyzers/ToneMass.h"
+#include "Utility/Logger.h"
+
+#include <algorithm>
+
+using namespace ToneMass;
+
+namespace {
+
+constexpr double kStretch = 200; // levels by which the right end is pushed up
+constexpr int kReach = 100;      // levels from the right limit to the middle of the step
+constexpr double kSlope = 56;
+constexpr double kLumaGain = 150;
+constexpr double kColorGain = 200;
+
+struct TouchChannel {
+    bool CSliderParams::*enabled;
+    Histogram CUserParams::*bins;
+    float CUserParams::*coefficient;
+    double gain;
+};
+
+constexpr TouchChannel kTouchChannels[] = {
+    {&CSliderParams::mPerceptual_Touch_Light_RGB_Enabled, &CUserParams::pHisto_Luma, &CUserParams::m_R_L_L_F,
+     kLumaGain},
+    {&CSliderParams::mPerceptual_Touch_Light_R_Enabled, &CUserParams::pHisto_Red, &CUserParams::m_R_L_L_F_R,
+     kColorGain},
+    {&CSliderParams::mPerceptual_Touch_Light_G_Enabled, &CUserParams::pHisto_Green, &CUserParams::m_R_L_L_F_G,
+     kColorGain},
+    {&CSliderParams::mPerceptual_Touch_Light_B_Enabled, &CUserParams::pHisto_Blue, &CUserParams::m_R_L_L_F_B,
+     kColorGain},
+};
+
+bool anyPerceptualTouch(const CSliderParams& sliders) {
+    return std::any_of(std::begin(kTouchChannels), std::end(kTouchChannels),
+                       [&](const TouchChannel& channel) { return sliders.*channel.enabled; });
+}
+
+bool anyTouch(const CSliderParams& sliders) {
+    return sliders.mLight_Touch_RGB_Enabled || sliders.mLight_Touch_R_Enabled ||
+           sliders.mLight_Touch_G_Enabled || sliders.mLight_Touch_B_Enabled;
+}
+
+// Share of the tones that the stretch leaves short of the right end.
+double shortShare(const Histogram& bins, int center, int pixels) {
+    const Curve stretched = tabulate([](int i) { return std::min(255.0, i + kStretch * i / 255); });
+    return 1 - risingMass(remap(bins, stretched), center, kSlope) / pixels;
+}
+
+} // namespace
+
+void CSmartAnalyzer_Perceptual_Level_Right::Analyze() {
+    const CSliderParams& sliders = mParams->mSliderParams;
+    if (anyPerceptualLevel(sliders) && !anyAbsoluteLevel(sliders))
+        analyzeMain();
+    if (anyPerceptualTouch(sliders) && !anyTouch(sliders))
+        analyzeTouch();
+}
+
+int CSmartAnalyzer_Perceptual_Level_Right::recountLimit() const {
+    recount(*mInPlane, *mParams);
+    const int limit = rightLimit(*mParams);
+    Log::log(LogLevel::Debug, "Delta_H: %f", static_cast<double>(kReach));
+    Log::log(LogLevel::Debug, "Delta_H AFTER correction: %f", static_cast<double>(limit + kReach));
+    return limit;
+}
+
+void CSmartAnalyzer_Perceptual_Level_Right::analyzeMain() const {
+    Log::log(LogLevel::Debug, "HIGHLIGHT HAS STARTED");
+    const int limit = recountLimit();
+    const double share = shortShare(mParams->pHisto_Luma, limit + kReach, mInPlane->pixelCount());
+    mParams->m_R_L_L_F = static_cast<float>(share * kLumaGain + limit);
+    Log::log(LogLevel::Debug, "(1.0f- m_R_L_C_F_Loc): %f", share);
+    Log::log(LogLevel::Debug, "Perceptual Right level: %f", static_cast<double>(mParams->m_R_L_L_F));
+}
+
+void CSmartAnalyzer_Perceptual_Level_Right::analyzeTouch() const {
+    const int center = recountLimit() + kReach;
+    for (const TouchChannel& channel : kTouchChannels) {
+        if (!(mParams->mSliderParams.*channel.enabled))
+            continue;
+        const double share = shortShare(mParams->*channel.bins, center, mInPlane->pixelCount());
+        mParams->*channel.coefficient = static_cast<float>(share * channel.gain);
+    }
+}
