@@ -1,0 +1,69 @@
+#include "Filters/Auto_Gamma.h"
+
+#include "Filters/GammaCurve.h"
+#include "Filters/PictureConditions.h"
+#include "Filters/PixelMath.h"
+#include "Utility/Logger.h"
+
+#include <cmath>
+#include <utility>
+
+Auto_Gamma::Auto_Gamma(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
+    : IFilter(params, inPlane, outPlane) {
+    mName = "Auto_Gamma";
+}
+
+bool Auto_Gamma::PreApply() {
+    const CSliderParams& sliders = mParams->mSliderParams;
+    if (!isAutomaticMode(sliders) && !sliders.mAuto_Color_Enabled)
+        return false;
+    Log::log(LogLevel::Debug, "Applying Auto_Gamma from plane at 0x%x to plane at 0x%x...",
+             logAddress(mInPlane), logAddress(mOutPlane));
+    Log::log(LogLevel::Debug, "Auto_Gamma Condition matched.");
+    addSamples();
+    const float gamma = gammaFor(meanLuma());
+    Log::log(LogLevel::Debug, "Level_M %f", static_cast<double>(gamma));
+    mTable = GammaCurve::table(gamma);
+    return true;
+}
+
+// What the histogram already holds stays.
+void Auto_Gamma::addSamples() {
+    const CARGBPlane& in = *mInPlane;
+    const int step = PixelMath::samplingStep(in.width(), in.height());
+    Log::log(LogLevel::Debug, "Histo_Step %d", step);
+    for (int y = 0; y < in.height() - step; y += step) {
+        const ConstRow row = in.row(y);
+        for (int x = 0; x < in.width() - step; x += step)
+            mParams->pHisto_Luma[static_cast<std::size_t>((row[0][x] + row[1][x] + row[2][x]) / 3)] += 1;
+    }
+}
+
+// NaN for an empty histogram.
+float Auto_Gamma::meanLuma() const {
+    double weighted = 0;
+    double count = 0;
+    for (std::size_t i = 0; i < mParams->pHisto_Luma.size(); ++i) {
+        weighted += static_cast<double>(i) * mParams->pHisto_Luma[i];
+        count += mParams->pHisto_Luma[i];
+    }
+    const auto mean = static_cast<float>(weighted / count);
+    Log::log(LogLevel::Debug, "acu %f", weighted);
+    Log::log(LogLevel::Debug, "acount %f", count);
+    Log::log(LogLevel::Debug, "gamma_Shift_factor %f", static_cast<double>(mean));
+    return mean;
+}
+
+float Auto_Gamma::gammaFor(float mean) const {
+    if (mean < 100)
+        return static_cast<float>(mBaseFactor * 1.35);
+    if (mean <= 127)
+        return static_cast<float>((7.5018 - 1.332 * std::log(static_cast<double>(mean))) * mBaseFactor);
+    return 1.0F;
+}
+
+void Auto_Gamma::ApplyRow(std::uint32_t row) {
+    beginRow(row, "Filters/Auto_Gamma", 107);
+    const int y = static_cast<int>(row);
+    mapRow(mTable, std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
+}

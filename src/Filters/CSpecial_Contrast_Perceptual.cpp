@@ -1,0 +1,84 @@
+#include "Filters/CSpecial_Contrast_Perceptual.h"
+
+#include "Utility/Logger.h"
+
+#include <utility>
+
+namespace {
+
+/// Mass of one channel's highlights and shadows.
+struct ChannelMass {
+    double high;
+    double low;
+
+    bool isMissing() const { return high < 0.05 * low; }
+    bool isPresent() const { return high > 0.25 * low; }
+    float tint() const {
+        const auto ratio = static_cast<float>((low + 1) / (high + 1));
+        return static_cast<float>(ratio <= 21 ? static_cast<double>(ratio) / 20 * 0.15 : 0.15);
+    }
+};
+
+} // namespace
+
+bool CSpecial_Contrast_Perceptual::PreApply() {
+    const CSliderParams& sliders = mParams->mSliderParams;
+    Log::log(LogLevel::Debug,
+             "Applying CSpecial_Contrast_Perceptual filter from plane at 0x%x to plane at 0x%x...",
+             logAddress(mInPlane), logAddress(mOutPlane));
+    if (!sliders.Contrast2Enabled || sliders.mAuto_Color_Enabled || mParams->Under_Exposed_Picture)
+        return false;
+    Log::log(LogLevel::Debug, "CSpecial_Contrast_Perceptual Condition matched.");
+    findTint();
+    const double keep = 1 - mTint;
+    for (std::size_t channel = 0; channel < mTables.size(); ++channel) {
+        const double added = static_cast<double>(mTint) * mTarget[channel];
+        mTables[channel] = makeChannelTable(
+            [keep, added](int c) { return PixelMath::trunc(static_cast<float>(c * keep + added)); });
+    }
+    return true;
+}
+
+// At most one primary can be missing while the others are present.
+void CSpecial_Contrast_Perceptual::findTint() {
+    const std::array<ChannelMass, 3> masses = {{{mParams->C_H_F_High_R, mParams->C_H_F_Low_R},
+                                                {mParams->C_H_F_High_G, mParams->C_H_F_Low_G},
+                                                {mParams->C_H_F_High_B, mParams->C_H_F_Low_B}}};
+    for (std::size_t channel = 0; channel < masses.size(); ++channel) {
+        const bool othersPresent =
+            masses[(channel + 1) % 3].isPresent() && masses[(channel + 2) % 3].isPresent();
+        if (!masses[channel].isMissing() || !othersPresent)
+            continue;
+        mTarget[channel] = 255;
+        mTint = masses[channel].tint();
+    }
+}
+
+void CSpecial_Contrast_Perceptual::ApplyRow(std::uint32_t row) {
+    beginRow(row, "Filters/CSpecial_Contrast_Perceptual", 76);
+    const int y = static_cast<int>(row);
+    const ConstRow in = std::as_const(*mInPlane).row(y);
+    const Row out = mOutPlane->row(y);
+    for (int x = 0; x < mInPlane->width(); ++x) {
+        const PixelMath::Rgb pixel = correct(in[0][x], in[1][x], in[2][x]);
+        out[0][x] = static_cast<std::uint8_t>(pixel.r);
+        out[1][x] = static_cast<std::uint8_t>(pixel.g);
+        out[2][x] = static_cast<std::uint8_t>(pixel.b);
+    }
+}
+
+PixelMath::Rgb CSpecial_Contrast_Perceptual::correct(int r, int g, int b) const {
+    const auto before = static_cast<float>((r + g + b) / 3);
+    const int tintedR = mTables[0][static_cast<std::size_t>(r)];
+    const int tintedG = mTables[1][static_cast<std::size_t>(g)];
+    const int tintedB = mTables[2][static_cast<std::size_t>(b)];
+    const auto after = static_cast<float>(tintedR + tintedG + tintedB) / 3;
+    const float ratio = after > 0 ? before / after : 1.0F;
+    const auto scaled = [ratio](int c) { return PixelMath::trunc(static_cast<float>(c) * ratio); };
+    return PixelMath::keepHue({scaled(tintedR), scaled(tintedG), scaled(tintedB)});
+}
+
+bool CSpecial_Contrast_Perceptual::PostApply() {
+    Log::log(LogLevel::Debug, "CSpecial_Contrast_Perceptual filter complete.");
+    return true;
+}

@@ -1,0 +1,44 @@
+#pragma once
+
+#include "Utility/CARGBPlane.h"
+
+#include <algorithm>
+#include <cstddef>
+#include <cstdint>
+#include <vector>
+
+/// A curve of a channel value that also depends on its pixel's R + G + B, worked out for every pair that a
+/// pixel can have. 196 KB.
+class SumValueTable {
+public:
+    /// Fills the table.
+    /// @param curveOf  R + G + B (0 to 765) to a curve, which takes a channel value (0 to 255) to another
+    template <typename CurveOf>
+    void build(CurveOf curveOf) {
+        mValues.assign(kSums * 256, 0);
+        for (int sum = 0; sum < kSums; ++sum) {
+            const auto curve = curveOf(sum);
+            std::uint8_t* values = mValues.data() + sum * 256;
+            // The other two channels add up to 510 at most.
+            for (int c = std::max(0, sum - 510); c <= std::min(255, sum); ++c)
+                values[c] = static_cast<std::uint8_t>(curve(c));
+        }
+    }
+
+    /// Maps the three channels of a row.
+    void mapRow(ConstRow in, Row out, int width) const {
+        for (int x = 0; x < width; ++x) {
+            const int r = in[0][x];
+            const int g = in[1][x];
+            const int b = in[2][x];
+            const std::uint8_t* values = mValues.data() + (r + g + b) * 256;
+            out[0][x] = values[r];
+            out[1][x] = values[g];
+            out[2][x] = values[b];
+        }
+    }
+
+private:
+    static constexpr int kSums = 3 * 255 + 1;
+    std::vector<std::uint8_t> mValues;
+};
