@@ -1,7 +1,14 @@
 #include "Core/PipelineTable.h"
 
+#include "Filters/Auto_Gamma.h"
+#include "Filters/CContrast_Brightness_Perceptual.h"
+#include "Filters/CContrast_Simple_Filter.h"
+#include "Filters/CDigital_Flash_Perceptual.h"
+#include "Filters/CGamma_Perceptual.h"
+#include "Filters/CGamma_Simple_Filter.h"
 #include "Filters/COrv_II_Iter.h"
 #include "Filters/COrv_I_Iter.h"
+#include "Filters/CSpecial_Contrast_Perceptual.h"
 #include "Filters/Super_ORV.h"
 #include "Filters/Super_ORV_II.h"
 #include "Histograms/CHistogram0.h"
@@ -51,6 +58,10 @@ bool removesSpots(const CUserParams& params) {
     return params.mSliderParams.SaltPepperEnabled;
 }
 
+bool usesFlash(const CUserParams& params) {
+    return params.mSliderParams.DigitalFlashEnabled;
+}
+
 // The comparison decides only the log line: from here on every main run counts as dark in the middle.
 [[maybe_unused]] void testDarkness(CUserParams& params) {
     if (2 * params.m_Middle_Acu < params.m_Dark_Acu && 5 * params.m_Light_Acu < params.m_Dark_Acu)
@@ -79,7 +90,7 @@ std::span<const PipelineStep> mainSteps() {
         {"Sharp_Smart", {}},
         {"Histogram (00)", {HISTOGRAM(CHistogram0)}, nullptr, "  CHistogram00", kFinished},
         {"Histogram (0)", {HISTOGRAM(CHistogram0)}, nullptr, "  CHistogram0", kFinished},
-        {"Auto_Gamma", {}},
+        {"Auto_Gamma", {FILTER(Auto_Gamma)}},
         {"Histogram (0)", {HISTOGRAM(CHistogram0)}, nullptr, "  CHistogram0", kFinished},
         {"Orvela (Iteration Phase I)", {FILTER(COrv_I_Iter)}},
         {"Orvela (Iteration Phase II)", {FILTER(COrv_II_Iter)}},
@@ -93,8 +104,8 @@ std::span<const PipelineStep> mainSteps() {
         {"Saturation", {}},
         {"Noise", {}},
         {"Black & White spot", {}, removesSpots},
-        {"Gamma", {}},
-        {"Contrast", {}},
+        {"Gamma", {FILTER(CGamma_Simple_Filter)}},
+        {"Contrast", {FILTER(CContrast_Simple_Filter)}},
         {"Moire", {}},
         {"Temperature", {}},
         {"Color", {HISTOGRAM(CHistogram_VII)}},
@@ -102,19 +113,20 @@ std::span<const PipelineStep> mainSteps() {
         {"Middle_Level", {}},
         {"Light_Level", {HISTOGRAM(CHistogram_VII), ANALYZER(CSmartAnalyzer_Perceptual_Contrast_Brightness)}},
         {" Contrast_Brightness_Perceptual",
-         {HISTOGRAM(CHistogram_VIII), ANALYZER(CSmartAnalyzer_Digital_Flash)}},
+         {FILTER(CContrast_Brightness_Perceptual), HISTOGRAM(CHistogram_VIII),
+          ANALYZER(CSmartAnalyzer_Digital_Flash), FILTER_WHEN(CDigital_Flash_Perceptual, usesFlash)}},
         {"Histogram XI", {HISTOGRAM(CHistogram_III)}},
         {"cAuto_Contrast_TEST", {}},
         {"Histogram III",
          {HISTOGRAM(CHistogram_III), ANALYZER(CSmartAnalyzer_Perceptual_Level_Dark),
           ANALYZER(CSmartAnalyzer_Perceptual_Level_Middle), ANALYZER(CSmartAnalyzer_Perceptual_Level_Right)}},
-        {"Gamma_Perceptual", {}},
+        {"Gamma_Perceptual", {FILTER(CGamma_Perceptual)}},
         {"Level_Dark_Perceptual", {}},
         {"Level_Middle_Perceptual", {}},
         {"Level_Light_Perceptual", {}},
         {"Histogram XI", {HISTOGRAM(CHistogram_III)}},
         {"cAuto_Contrast_TEST II", {}},
-        {"Auto_Gamma", {}},
+        {"Auto_Gamma", {FILTER(Auto_Gamma)}},
     };
     return steps;
 }
@@ -122,9 +134,12 @@ std::span<const PipelineStep> mainSteps() {
 std::span<const PipelineTask> finalTouchTasks() {
     static const std::vector<PipelineTask> tasks = {
         HISTOGRAM(CHistogram_Luma_Final),
+        FILTER(CContrast_Simple_Filter),
         HISTOGRAM(CHistogram_VII),
         HISTOGRAM_THEN(CHistogram0, takeInputLuma),
         ANALYZER(CSmartAnalyzer_Perceptual_Contrast_Brightness),
+        FILTER(CSpecial_Contrast_Perceptual),
+        FILTER(CContrast_Brightness_Perceptual),
         HISTOGRAM(CHistogram_III),
         ANALYZER(CSmartAnalyzer_Perceptual_Level_Dark),
         HISTOGRAM(CHistogram_III),
