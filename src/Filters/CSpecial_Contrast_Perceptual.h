@@ -13,8 +13,8 @@
 ///     v = 0.15 / 20 * (low + 1) / (high + 1) of the missing primary, 0.15 when that quotient is above 21
 ///     c' = trunc(c * (1 - v) + v * target),   c'' = trunc(c' * trunc(mean before) / (mean after))
 ///
-/// Pixels that leave the range are scaled down with their hue kept. Where no primary is missing, only the truncation
-/// of the mean lowers a pixel.
+/// Pixels that leave the range are scaled down with their hue kept. Where no primary is missing, only the
+/// truncation of the mean lowers a pixel.
 class CSpecial_Contrast_Perceptual final : public IFilter {
 public:
     using IFilter::IFilter;
