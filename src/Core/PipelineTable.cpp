@@ -1,14 +1,23 @@
 #include "Core/PipelineTable.h"
 
 #include "Filters/Auto_Gamma.h"
+#include "Filters/CAverage.h"
+#include "Filters/CBilinear.h"
+#include "Filters/CClarity.h"
+#include "Filters/CColor.h"
 #include "Filters/CContrast_Brightness_Perceptual.h"
 #include "Filters/CContrast_Simple_Filter.h"
 #include "Filters/CDigital_Flash_Perceptual.h"
 #include "Filters/CGamma_Perceptual.h"
 #include "Filters/CGamma_Simple_Filter.h"
+#include "Filters/CMedian_Salt_Pepper.h"
+#include "Filters/CMoire.h"
 #include "Filters/COrv_II_Iter.h"
 #include "Filters/COrv_I_Iter.h"
 #include "Filters/CSpecial_Contrast_Perceptual.h"
+#include "Filters/CTemperature.h"
+#include "Filters/Saturation.h"
+#include "Filters/Sharp_Smart.h"
 #include "Filters/Super_ORV.h"
 #include "Filters/Super_ORV_II.h"
 #include "Histograms/CHistogram0.h"
@@ -63,7 +72,7 @@ bool usesFlash(const CUserParams& params) {
 }
 
 // The comparison decides only the log line: from here on every main run counts as dark in the middle.
-[[maybe_unused]] void testDarkness(CUserParams& params) {
+void testDarkness(CUserParams& params) {
     if (2 * params.m_Middle_Acu < params.m_Dark_Acu && 5 * params.m_Light_Acu < params.m_Dark_Acu)
         Log::log(LogLevel::Debug, "CMedian_Salt_Pepper determined that the picture is very dark.");
     params.Dark_middle = true;
@@ -87,7 +96,7 @@ namespace PipelineTable {
 
 std::span<const PipelineStep> mainSteps() {
     static const std::vector<PipelineStep> steps = {
-        {"Sharp_Smart", {}},
+        {"Sharp_Smart", {FILTER(Sharp_Smart)}},
         {"Histogram (00)", {HISTOGRAM(CHistogram0)}, nullptr, "  CHistogram00", kFinished},
         {"Histogram (0)", {HISTOGRAM(CHistogram0)}, nullptr, "  CHistogram0", kFinished},
         {"Auto_Gamma", {FILTER(Auto_Gamma)}},
@@ -99,16 +108,16 @@ std::span<const PipelineStep> mainSteps() {
         {"Super_ORV_II", {FILTER(Super_ORV_II)}},
         {"Smart Blur", {FILTER(Super_ORV), HISTOGRAM(CHistogram_IV)}},
         {"Auto_Color", {}},
-        {"Clarity", {HISTOGRAM(CHistogram_VII)}},
+        {"Clarity", {FILTER(CClarity), HISTOGRAM(CHistogram_VII)}},
         {"NEW Auto_Contrast", {}},
-        {"Saturation", {}},
-        {"Noise", {}},
-        {"Black & White spot", {}, removesSpots},
+        {"Saturation", {FILTER(Saturation)}},
+        {"Noise", {FILTER_THEN(CBilinear, testDarkness)}},
+        {"Black & White spot", {FILTER(CMedian_Salt_Pepper)}, removesSpots},
         {"Gamma", {FILTER(CGamma_Simple_Filter)}},
         {"Contrast", {FILTER(CContrast_Simple_Filter)}},
-        {"Moire", {}},
-        {"Temperature", {}},
-        {"Color", {HISTOGRAM(CHistogram_VII)}},
+        {"Moire", {FILTER(CMoire), FILTER(CAverage)}},
+        {"Temperature", {FILTER(CTemperature)}},
+        {"Color", {FILTER(CColor), HISTOGRAM(CHistogram_VII)}},
         {"Dark_Level", {}},
         {"Middle_Level", {}},
         {"Light_Level", {HISTOGRAM(CHistogram_VII), ANALYZER(CSmartAnalyzer_Perceptual_Contrast_Brightness)}},
@@ -135,6 +144,7 @@ std::span<const PipelineTask> finalTouchTasks() {
     static const std::vector<PipelineTask> tasks = {
         HISTOGRAM(CHistogram_Luma_Final),
         FILTER(CContrast_Simple_Filter),
+        FILTER(CColor),
         HISTOGRAM(CHistogram_VII),
         HISTOGRAM_THEN(CHistogram0, takeInputLuma),
         ANALYZER(CSmartAnalyzer_Perceptual_Contrast_Brightness),

@@ -1,0 +1,152 @@
+#include "Filters/CBilinear.h"
+
+#include "Filters/PixelMath.h"
+#include "Utility/CGenericEx.h"
+#include "Utility/Logger.h"
+#include "Utility/RowScheduler.h"
+
+#include <algorithm>
+#include <cmath>
+#include <new>
+#include <utility>
+
+namespace {
+
+constexpr char kSource[] = "Filters/CBilinear";
+constexpr std::size_t kDistances = 4; // of which 0, 1 and 2 occur
+constexpr std::size_t kRanges = 3 * 255 * 255 + 1;
+constexpr double kRangeScale = 0.05;
+constexpr float kLargeSide = 700; // square root of the pixel count
+constexpr int kTileWidth = 256;
+
+} // namespace
+
+// The running sums of neighbouring pixels of a row, side by side, so that the additions run on vectors.
+struct CBilinear::Tile {
+    int count;
+    std::array<double, kTileWidth> weight;
+    std::array<std::array<double, kTileWidth>, 3> sums;
+};
+
+CBilinear::CBilinear(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
+    : IFilter(params, inPlane, outPlane) {
+    mName = "CBilinear";
+}
+
+bool CBilinear::PreApply() {
+    const CSliderParams& sliders = mParams->mSliderParams;
+    const auto side = static_cast<float>(std::sqrt(static_cast<double>(mInPlane->pixelCount())));
+    Log::log(LogLevel::Debug, "Applying CBilinear filter from plane at 0x%x to plane at 0x%x...",
+             logAddress(mInPlane), logAddress(mOutPlane));
+    Log::log(LogLevel::Debug, "Size_Factor: %f", static_cast<double>(side));
+    Log::log(LogLevel::Debug, "Bilinear_Filtering_Enabled && Normal_Picture");
+    if (!matches(side))
+        return false;
+    Log::log(LogLevel::Debug, "CBilinear Condition matched.");
+    const double position = sliders.BilinearFilteringValue;
+    const auto value = static_cast<float>(side > kLargeSide ? position * 0.6 : position);
+    const float sigma = value * 4.5F / 1000 + 0.5F;
+    prepareTables(sigma * sigma);
+    mVertStart = 1;
+    mVertEnd = static_cast<std::uint32_t>(mInPlane->height() - 1);
+    return true;
+}
+
+// The flag as it was on entry counts for the large pictures, the new one for all.
+bool CBilinear::matches(float side) const {
+    const CSliderParams& sliders = mParams->mSliderParams;
+    const bool big = (sliders.OrvelaLevelEnabled || sliders.OrvelaLevel2Enabled) && side > kLargeSide &&
+                     !mParams->Switch_TOO_SHARP;
+    mParams->Switch_TOO_SHARP =
+        mParams->Switch_TOO_SHARP_ORV_I && mParams->Switch_TOO_SHARP_ORV_II && sliders.OrvelaLevel3Enabled;
+    Log::log(LogLevel::Debug, "Switch_TOO_SHARP: %d", mParams->Switch_TOO_SHARP);
+    return (sliders.BilinearFilteringEnabled || big) && !mParams->Switch_TOO_SHARP && mParams->Normal_Picture;
+}
+
+void CBilinear::prepareTables(float spatialVariance) {
+    m_cBilinear = allocate(kDistances);
+    if (!m_cBilinear) {
+        Log::log(LogLevel::Error, "Bilinear filter was unable to declare the %d floats array (m_cBilinear).",
+                 static_cast<int>(kDistances));
+        throw COutOfMemoryEx(
+            QStringLiteral("Bilinear filter was unable to declare the m_cBilinear floats array."), kSource,
+            93);
+    }
+    m_sBilinear = allocate(kRanges);
+    if (!m_sBilinear) {
+        m_cBilinear.reset();
+        Log::log(LogLevel::Error, "Bilinear filter was unable to declare the %d floats array (m_sBilinear).",
+                 static_cast<int>(kRanges));
+        throw COutOfMemoryEx(
+            QStringLiteral("Bilinear filter was unable to declare the m_sBilinear floats array."), kSource,
+            107);
+    }
+    for (std::size_t i = 0; i < kDistances; ++i)
+        m_cBilinear[i] = static_cast<float>(std::exp(-static_cast<double>(i) / spatialVariance));
+    const double rangeVariance = PixelMath::trunc(22500 * kRangeScale);
+    orvela::forEachRange(0, kRanges, 1U << 14, [this, rangeVariance](unsigned first, unsigned last) {
+        for (unsigned i = first; i < last; ++i)
+            m_sBilinear[i] = static_cast<float>(std::exp(-static_cast<double>(i) / rangeVariance));
+    });
+}
+
+CBilinear::Floats CBilinear::allocate(std::size_t count) const {
+    return Floats(new (std::nothrow) float[count]);
+}
+
+void CBilinear::ApplyRow(std::uint32_t row) {
+    beginRow(row, kSource, 124);
+    const int end = mInPlane->width() - 1;
+    for (int first = 1; first < end; first += kTileWidth)
+        smoothTile(static_cast<int>(row), first, std::min(kTileWidth, end - first));
+}
+
+void CBilinear::smoothTile(int y, int first, int count) const {
+    const auto at = [this](int x, int line) {
+        const ConstRow row = std::as_const(*mInPlane).row(line);
+        return ConstRow{row[0] + x, row[1] + x, row[2] + x};
+    };
+    Tile tile;
+    tile.count = count;
+    tile.weight.fill(0);
+    for (auto& sums : tile.sums)
+        sums.fill(0);
+    for (int dy = -1; dy <= 1; ++dy) {
+        for (int dx = -1; dx <= 1; ++dx) {
+            const float spatial = m_cBilinear[static_cast<std::size_t>(dx * dx + dy * dy)];
+            addNeighbour(at(first, y), at(first + dx, y + dy), spatial, tile);
+        }
+    }
+    const Row out = mOutPlane->row(y);
+    for (std::size_t c = 0; c < 3; ++c) {
+        for (int i = 0; i < count; ++i) {
+            const auto k = static_cast<std::size_t>(i);
+            out[c][first + i] =
+                static_cast<std::uint8_t>(static_cast<float>(tile.sums[c][k] / tile.weight[k]));
+        }
+    }
+}
+
+void CBilinear::addNeighbour(const ConstRow& centre, const ConstRow& neighbour, float spatial,
+                             Tile& tile) const {
+    std::array<float, kTileWidth> weights;
+    const auto count = static_cast<std::size_t>(tile.count);
+    for (std::size_t i = 0; i < count; ++i) {
+        const int r = centre[0][i] - neighbour[0][i];
+        const int g = centre[1][i] - neighbour[1][i];
+        const int b = centre[2][i] - neighbour[2][i];
+        weights[i] = m_sBilinear[static_cast<std::size_t>(r * r + g * g + b * b)] * spatial;
+        tile.weight[i] += static_cast<double>(weights[i]);
+    }
+    for (std::size_t c = 0; c < 3; ++c) {
+        for (std::size_t i = 0; i < count; ++i)
+            tile.sums[c][i] += static_cast<double>(weights[i]) * neighbour[c][i];
+    }
+}
+
+bool CBilinear::PostApply() {
+    m_cBilinear.reset();
+    m_sBilinear.reset();
+    Log::log(LogLevel::Debug, "Bilinear Noise Filter complete.");
+    return true;
+}

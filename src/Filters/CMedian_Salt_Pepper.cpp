@@ -1,0 +1,71 @@
+#include "Filters/CMedian_Salt_Pepper.h"
+
+#include "Filters/PixelMath.h"
+#include "Utility/Logger.h"
+
+#include <algorithm>
+#include <utility>
+
+namespace {
+
+constexpr int kDarkestSpot = 101;
+
+int brightness(const ConstRow& row, int x) {
+    return (row[0][x] + row[1][x] + row[2][x]) / 3;
+}
+
+int thirdSmallest(int a, int b, int c, int d) {
+    return std::max(std::min(std::max(a, b), std::max(c, d)), std::max(std::min(a, b), std::min(c, d)));
+}
+
+PixelMath::Rgb scaleTo(int median, PixelMath::Rgb c) {
+    const float ratio = static_cast<float>(median * 3) / static_cast<float>(c.r + c.g + c.b);
+    const auto scaled = [ratio](int v) { return PixelMath::trunc(static_cast<float>(v) * ratio); };
+    return PixelMath::keepHue({scaled(c.r), scaled(c.g), scaled(c.b)});
+}
+
+} // namespace
+
+CMedian_Salt_Pepper::CMedian_Salt_Pepper(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
+    : IFilter(params, inPlane, outPlane) {
+    mName = "CMedian_Salt_Pepper";
+}
+
+bool CMedian_Salt_Pepper::PreApply() {
+    const CSliderParams& sliders = mParams->mSliderParams;
+    if (!sliders.SaltPepperEnabled || mParams->Switch_TOO_SHARP)
+        return false;
+    Log::log(LogLevel::Debug, "Applying CMedian_Salt_Pepper filter from plane at 0x%x to plane at 0x%x...",
+             logAddress(mInPlane), logAddress(mOutPlane));
+    const double factor = 2 - static_cast<double>(sliders.SaltPepperValue) * 1.9 / 1000;
+    mSpotFactor = mParams->Dark_middle ? 0.5F : static_cast<float>(factor);
+    mVertStart = mRadius;
+    mVertEnd = static_cast<std::uint32_t>(mInPlane->height() - mRadius);
+    return true;
+}
+
+void CMedian_Salt_Pepper::ApplyRow(std::uint32_t row) {
+    beginRow(row, "Filters/CMedian_Salt_Pepper", 52);
+    const int y = static_cast<int>(row);
+    const ConstRow above = std::as_const(*mInPlane).row(y - mRadius);
+    const ConstRow here = std::as_const(*mInPlane).row(y);
+    const Row out = mOutPlane->row(y);
+    for (int x = mRadius; x < mInPlane->width() - mRadius; ++x) {
+        const int upperLeft = brightness(above, x - 1);
+        const int upper = brightness(above, x);
+        const int left = brightness(here, x - 1);
+        const int centre = brightness(here, x);
+        const float mean = static_cast<float>(upperLeft + upper + left + centre) / 4;
+        PixelMath::Rgb c = {here[0][x], here[1][x], here[2][x]};
+        if (centre >= kDarkestSpot && centre > PixelMath::trunc(mean * mSpotFactor))
+            c = scaleTo(thirdSmallest(upperLeft, upper, left, centre), c);
+        out[0][x] = static_cast<std::uint8_t>(c.r);
+        out[1][x] = static_cast<std::uint8_t>(c.g);
+        out[2][x] = static_cast<std::uint8_t>(c.b);
+    }
+}
+
+bool CMedian_Salt_Pepper::PostApply() {
+    Log::log(LogLevel::Debug, "CMedian_Salt_Pepper Filter complete.");
+    return true;
+}

@@ -1,0 +1,87 @@
+#include "Filters/CTemperature.h"
+
+#include "Filters/PixelMath.h"
+#include "Utility/Logger.h"
+
+#include <utility>
+
+namespace {
+
+constexpr std::array<float, 17> kKelvin = {2000, 2105, 2222, 2353, 2500, 2677, 2857, 3077, 3333,
+                                           3636, 4000, 4444, 5000, 5714, 6667, 8000, 10000};
+constexpr float kTempCubicDivisor = 140000;
+constexpr int kDarkestSum = 91; // a mean brightness above 30
+
+std::int32_t intervalOf(int kelvin) {
+    const auto temperature = static_cast<float>(kelvin);
+    for (std::size_t i = 0; i + 1 < kKelvin.size(); ++i) {
+        if (kKelvin[i] <= temperature && temperature <= kKelvin[i + 1])
+            return static_cast<std::int32_t>(i);
+    }
+    return 0;
+}
+
+} // namespace
+
+bool CTemperature::PreApply() {
+    const CSliderParams& sliders = mParams->mSliderParams;
+    if (!sliders.Temperature_Enabled)
+        return false;
+    Log::log(LogLevel::Debug, "Applying CTemperature filter from plane at 0x%x to plane at 0x%x...",
+             logAddress(mInPlane), logAddress(mOutPlane));
+    Log::log(LogLevel::Debug, "CTemperature Condition matched.");
+    const auto kelvin =
+        static_cast<float>(static_cast<double>(sliders.Temperature_Value) * 8000 / 1000 + 2000);
+    mInterval = intervalOf(PixelMath::trunc(kelvin));
+    prepareGains();
+    return true;
+}
+
+// The first component's normalisation is linear in the brightness and cancels it; the second and third divide
+// by sums that contain replaced values, so the gains depend on the pixel's brightness.
+void CTemperature::prepareGains() {
+    const auto t = static_cast<float>(mInterval);
+    const float x = 2 * t * t * t / kTempCubicDivisor - 0.0008F * t * t - 0.0081F * t + 0.5349F;
+    const float y = 0.0046F * t - (t * t * t / kTempCubicDivisor + 0.0007F * t * t) + 0.4083F;
+    for (std::size_t sum = kDarkestSum; sum < mGains.size(); ++sum) {
+        const auto mean = static_cast<float>(static_cast<double>(sum) / 3);
+        const double Y = mean / 255;
+        const double X = static_cast<float>(Y * x / y);
+        const double Z = static_cast<float>((1.0 - x - y) * Y / y);
+        auto a = static_cast<float>((0.0052 * X - 0.0144 * Y + 1.0092 * Z) * 0.3);
+        auto b = static_cast<float>((1.4264 * Y + 0.088 * Z - 0.5151 * X) * 0.3);
+        auto c = static_cast<float>((2.364 * X - 0.8965 * Y - 0.468 * Z) * 0.3);
+        const auto total = [&] { return static_cast<double>(c) + b + a; };
+        a = static_cast<float>(a / total());
+        b = static_cast<float>(b / total());
+        c = static_cast<float>(c / total());
+        mGains[sum] = {c + 1, b + 1, a + 1};
+    }
+}
+
+void CTemperature::ApplyRow(std::uint32_t row) {
+    beginRow(row, "Filters/CTemperature", 72);
+    const ConstRow in = std::as_const(*mInPlane).row(static_cast<int>(row));
+    const Row out = mOutPlane->row(static_cast<int>(row));
+    for (int x = 0; x < mInPlane->width(); ++x) {
+        PixelMath::Rgb c = {in[0][x], in[1][x], in[2][x]};
+        const int sum = c.r + c.g + c.b;
+        if (sum >= kDarkestSum) {
+            const Gains& gains = mGains[static_cast<std::size_t>(sum)];
+            const float r = gains.r * static_cast<float>(c.r);
+            const float g = gains.g * static_cast<float>(c.g);
+            const float b = gains.b * static_cast<float>(c.b);
+            const auto k = static_cast<float>(sum / (static_cast<double>(r) + g + b));
+            c = PixelMath::keepHue(
+                {PixelMath::trunc(r * k), PixelMath::trunc(g * k), PixelMath::trunc(b * k)});
+        }
+        out[0][x] = static_cast<std::uint8_t>(c.r);
+        out[1][x] = static_cast<std::uint8_t>(c.g);
+        out[2][x] = static_cast<std::uint8_t>(c.b);
+    }
+}
+
+bool CTemperature::PostApply() {
+    Log::log(LogLevel::Debug, "CTemperature filter complete.");
+    return true;
+}

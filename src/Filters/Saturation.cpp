@@ -1,0 +1,209 @@
+#include "Filters/Saturation.h"
+
+#include "Filters/PictureConditions.h"
+#include "Utility/Logger.h"
+#include "Utility/RowScheduler.h"
+
+#include <algorithm>
+#include <cmath>
+#include <utility>
+
+namespace {
+
+constexpr float kWidth = 11.0F;        // of the window around a channel mean
+constexpr float kLargestProduct = 1e9; // keeps extreme brightness ratios within integers
+constexpr unsigned kRowGrain = 16;
+
+// Values 0 to 1 of the channels of a colour of hue (degrees), saturation and value.
+std::array<float, 3> fromHsv(float hue, float saturation, float v) {
+    if (saturation == 0)
+        return {v, v, v};
+    const float h = hue / 60;
+    const float i = std::floor(h);
+    const float f = h - i;
+    const float p = v * (1 - saturation);
+    const float q = v * (1 - f * saturation);
+    const float t = v * (1 - (1 - f) * saturation);
+    switch (static_cast<int>(i)) {
+    case 1:
+        return {q, v, p};
+    case 2:
+        return {p, v, t};
+    case 3:
+        return {p, q, v};
+    case 4:
+        return {t, p, v};
+    case 5:
+        return {v, p, q};
+    default:
+        return {v, t, p};
+    }
+}
+
+float hueOf(int r, int g, int b, int largest, int range) {
+    if (range == 0)
+        return 0;
+    const auto share = [range](int difference) {
+        return static_cast<float>(difference) * 60 / static_cast<float>(range);
+    };
+    if (r == largest)
+        return g < b ? share(g - b) + 360 : share(g - b);
+    if (g == largest)
+        return share(b - r) + 120;
+    return share(r - g) + 240;
+}
+
+} // namespace
+
+Saturation::Saturation(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
+    : IFilter(params, inPlane, outPlane) {
+    mName = "Saturation";
+}
+
+bool Saturation::PreApply() {
+    Log::log(LogLevel::Debug, "Applying Saturation filter from plane at 0x%x to plane at 0x%x...",
+             logAddress(mInPlane), logAddress(mOutPlane));
+    if (!mParams->mSliderParams.SaturationEnabled)
+        return false;
+    Log::log(LogLevel::Debug, "CSaturation Condition matched.");
+    chooseStrength(mParams->mSliderParams.SaturationValue);
+    Log::log(LogLevel::Debug, " Saturation alfa: %f", static_cast<double>(mAlfa));
+    mStep = PixelMath::samplingStep(mInPlane->width(), mInPlane->height());
+    Log::log(LogLevel::Debug, " Saturation Histo_Step %d", mStep);
+    const Means means = measure(*mInPlane, mStep);
+    mMeanIn = restoresOriginalLuma() ? mParams->m_OriginalLuma0 : means.all;
+    Log::log(LogLevel::Debug, " Saturation mean_in %f", static_cast<double>(mMeanIn));
+    if (mDominant)
+        prepareDominant(means);
+    else
+        prepareSaturations();
+    return true;
+}
+
+void Saturation::chooseStrength(float position) {
+    const int n = PixelMath::trunc(position);
+    const double above = static_cast<double>(position) - 500;
+    mDominant = n >= 500 && n <= 600;
+    if (mDominant)
+        mStrength = static_cast<float>(above / 200);
+    else if (n > 600)
+        mAlfa = static_cast<float>(above / 500 + 0.2);
+    else
+        mAlfa = static_cast<float>(1 - static_cast<double>(position) / 500);
+}
+
+// Means over the samples up to `margin` before the last column and row; 0 without a sample.
+Saturation::Means Saturation::measure(const CARGBPlane& plane, int margin) const {
+    std::array<std::uint64_t, 3> sums = {};
+    std::uint64_t samples = 0;
+    for (int y = 0; y < plane.height() - margin; y += mStep) {
+        const ConstRow row = plane.row(y);
+        for (int x = 0; x < plane.width() - margin; x += mStep) {
+            for (std::size_t c = 0; c < 3; ++c)
+                sums[c] += row[c][x];
+            ++samples;
+        }
+    }
+    if (samples == 0)
+        return {};
+    const auto mean = [](std::uint64_t sum, std::uint64_t count) {
+        return static_cast<float>(static_cast<double>(sum) / static_cast<double>(count));
+    };
+    return {mean(sums[0] + sums[1] + sums[2], 3 * samples), mean(sums[0], samples), mean(sums[1], samples),
+            mean(sums[2], samples)};
+}
+
+// After an illumination iteration the brightness to restore is the unprocessed picture's.
+bool Saturation::restoresOriginalLuma() const {
+    const CSliderParams& sliders = mParams->mSliderParams;
+    return (sliders.OrvelaLevelEnabled || sliders.OrvelaLevel2Enabled) && !mParams->Switch_TOO_SHARP &&
+           mParams->Normal_Picture && !mParams->Under_Exposed_Picture && !isAutomaticMode(sliders);
+}
+
+void Saturation::prepareDominant(const Means& means) {
+    const float max = std::max({means.r, means.g, means.b});
+    const float min = std::min({means.r, means.g, means.b});
+    const float middle = std::max(std::min(means.r, means.g), std::min(std::max(means.r, means.g), means.b));
+    const bool pulls = mParams->mSliderParams.SaturationValue < 600;
+    const auto curve = [&](float mean) {
+        const float distance = mean == middle ? max - middle : max - min;
+        Curve results;
+        for (std::size_t i = 0; i < results.size(); ++i) {
+            const double c = static_cast<double>(i);
+            results[i] = static_cast<int>(i);
+            if (!pulls || mean >= max)
+                continue;
+            const double below = max - c;
+            const double slope = below == 0 ? 0 : below / (mean * 0.025);
+            const double pull = 1 / std::cosh((c - mean) / kWidth) * (std::tanh(slope) + 1);
+            const auto value = static_cast<float>(c - pull * distance * mStrength / 2);
+            results[i] = PixelMath::trunc(std::max(value, 0.0F));
+        }
+        return results;
+    };
+    mRed = curve(means.r);
+    mGreen = curve(means.g);
+    mBlue = curve(means.b);
+}
+
+void Saturation::prepareSaturations() {
+    mSaturations.assign(256 * 256, 0.0F);
+    for (std::size_t largest = 1; largest < 256; ++largest) {
+        for (std::size_t range = 0; range <= largest; ++range)
+            mSaturations[largest * 256 + range] =
+                saturationFor(static_cast<float>(range) / static_cast<float>(largest));
+    }
+}
+
+float Saturation::saturationFor(float saturation) const {
+    if (PixelMath::trunc(mParams->mSliderParams.SaturationValue) < 501)
+        return saturation - saturation * mAlfa;
+    const double boost = mAlfa / std::cosh(static_cast<double>((255 - 255 * saturation) / 120));
+    const float headroom = 2 - saturation;
+    return static_cast<float>(std::min(saturation + boost / (headroom * headroom), 1.0));
+}
+
+PixelMath::Rgb Saturation::resaturate(int r, int g, int b) const {
+    const int largest = std::max({r, g, b});
+    const int range = largest - std::min({r, g, b});
+    const float saturation = mSaturations[static_cast<std::size_t>(largest * 256 + range)];
+    const float v = static_cast<float>(largest) / 255;
+    const std::array<float, 3> c = fromHsv(hueOf(r, g, b, largest, range), saturation, v);
+    return {PixelMath::trunc(255 * c[0]), PixelMath::trunc(255 * c[1]), PixelMath::trunc(255 * c[2])};
+}
+
+void Saturation::ApplyRow(std::uint32_t row) {
+    beginRow(row, "Filters/Saturation", 146);
+    const int width = mInPlane->width();
+    const ConstRow in = std::as_const(*mInPlane).row(static_cast<int>(row));
+    const Row out = mOutPlane->row(static_cast<int>(row));
+    if (mDominant) {
+        applyCurves(mRed, mGreen, mBlue, in, out, width);
+        return;
+    }
+    for (int x = 0; x < width; ++x) {
+        const PixelMath::Rgb c = resaturate(in[0][x], in[1][x], in[2][x]);
+        out[0][x] = static_cast<std::uint8_t>(c.r);
+        out[1][x] = static_cast<std::uint8_t>(c.g);
+        out[2][x] = static_cast<std::uint8_t>(c.b);
+    }
+}
+
+bool Saturation::PostApply() {
+    const float meanOut = measure(*mOutPlane, mStep + 1).all;
+    const float ratio = meanOut > 0 ? mMeanIn / meanOut : 1.0F;
+    Log::log(LogLevel::Debug, " Saturation mean_out %f", static_cast<double>(meanOut));
+    Log::log(LogLevel::Debug, " Saturation Radion_iso_Luma %f", static_cast<double>(ratio));
+    Curve gain;
+    for (std::size_t c = 0; c < gain.size(); ++c)
+        gain[c] = PixelMath::trunc(std::min(static_cast<float>(c) * ratio, kLargestProduct));
+    const auto height = static_cast<unsigned>(mOutPlane->height());
+    orvela::forEachRange(0, height, kRowGrain, [&](unsigned first, unsigned last) {
+        for (unsigned y = first; y < last; ++y) {
+            const Row row = mOutPlane->row(static_cast<int>(y));
+            applyCurves(gain, gain, gain, {row[0], row[1], row[2]}, row, mOutPlane->width());
+        }
+    });
+    Log::log(LogLevel::Debug, "Saturation Filter complete.");
+    return true;
+}

@@ -1,0 +1,56 @@
+#pragma once
+
+#include "Filters/HueKeepingCurves.h"
+#include "Filters/IFilter.h"
+
+#include <vector>
+
+/// Lowers or raises saturation in HSV space, or strengthens the picture's dominant colour, and then restores
+/// the picture's mean brightness. By the slider position S:
+///
+///     S < 500          Sat' = Sat - Sat * alfa,  alfa = 1 - S / 500
+///     500 <= S < 600   dominant colour, strength k = (S - 500) / 200
+///     600 <= S < 601   nothing but the brightness restore
+///     601 <= S         Sat' = Sat + alfa / cosh((255 - 255 Sat) / 120) / (2 - Sat)^2, at most 1,
+///                      alfa = (S - 500) / 500 + 0.2
+///
+/// Dominant colour pulls each channel whose mean u lies below the largest mean down by
+///
+///     (1 / cosh((c - u) / 11)) * (tanh((max - c) / (u * 0.025)) + 1) * d * k / 2
+///
+/// with d the distance of the largest mean from the channel's own. A u of 0 with c at max takes tanh of 0.
+class Saturation final : public IFilter {
+public:
+    Saturation(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+
+protected:
+    bool PreApply() override;
+    void ApplyRow(std::uint32_t row) override;
+    bool PostApply() override;
+
+private:
+    struct Means {
+        float all = 0; ///< of (R + G + B) / 3
+        float r = 0;
+        float g = 0;
+        float b = 0;
+    };
+
+    void chooseStrength(float position);
+    Means measure(const CARGBPlane& plane, int margin) const;
+    bool restoresOriginalLuma() const;
+    void prepareDominant(const Means& means);
+    void prepareSaturations();
+    float saturationFor(float saturation) const;
+    PixelMath::Rgb resaturate(int r, int g, int b) const;
+
+    float mAlfa = 1;        ///< saturation factor
+    bool mDominant = false; ///< dominant-colour mode
+    float mStrength = 0;    ///< k
+    float mMeanIn = 0;      ///< brightness to restore
+    std::int32_t mStep = 5; ///< distance of the samples in rows and columns
+    Curve mRed = {};        ///< dominant-colour mode: results by value
+    Curve mGreen = {};
+    Curve mBlue = {};
+    std::vector<float> mSaturations; ///< new saturations by the largest channel and the range of the channels
+};
