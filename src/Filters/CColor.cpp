@@ -15,14 +15,6 @@ Curve mix(float colour, float v, float keep) {
     return curve;
 }
 
-// Brings a tinted pixel to the mean brightness m; a black one stays black.
-PixelMath::Rgb restore(PixelMath::Rgb c, int m) {
-    const auto mean = static_cast<float>((c.r + c.g + c.b) / 3.0);
-    const float ratio = mean > 0 ? static_cast<float>(m) / mean : 1.0F;
-    const auto scaled = [ratio](int v) { return PixelMath::trunc(static_cast<float>(v) * ratio); };
-    return PixelMath::keepHue({scaled(c.r), scaled(c.g), scaled(c.b)});
-}
-
 } // namespace
 
 CColor::Tint::Tint(float intensity, float r, float g, float b)
@@ -63,7 +55,8 @@ void CColor::ApplyRow(std::uint32_t row) {
         const std::uint8_t r = in[0][x];
         const std::uint8_t g = in[1][x];
         const std::uint8_t b = in[2][x];
-        const PixelMath::Rgb c = restore({tint.red[r], tint.green[g], tint.blue[b]}, (r + g + b) / 3);
+        const PixelMath::Rgb c =
+            PixelMath::restoreMean({tint.red[r], tint.green[g], tint.blue[b]}, (r + g + b) / 3);
         out[0][x] = static_cast<std::uint8_t>(c.r);
         out[1][x] = static_cast<std::uint8_t>(c.g);
         out[2][x] = static_cast<std::uint8_t>(c.b);

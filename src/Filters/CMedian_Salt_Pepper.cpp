@@ -19,9 +19,7 @@ int thirdSmallest(int a, int b, int c, int d) {
 }
 
 PixelMath::Rgb scaleTo(int median, PixelMath::Rgb c) {
-    const float ratio = static_cast<float>(median * 3) / static_cast<float>(c.r + c.g + c.b);
-    const auto scaled = [ratio](int v) { return PixelMath::trunc(static_cast<float>(v) * ratio); };
-    return PixelMath::keepHue({scaled(c.r), scaled(c.g), scaled(c.b)});
+    return PixelMath::scaled(c, static_cast<float>(median * 3) / static_cast<float>(c.r + c.g + c.b));
 }
 
 } // namespace

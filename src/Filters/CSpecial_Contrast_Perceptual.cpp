@@ -68,14 +68,10 @@ void CSpecial_Contrast_Perceptual::ApplyRow(std::uint32_t row) {
 }
 
 PixelMath::Rgb CSpecial_Contrast_Perceptual::correct(int r, int g, int b) const {
-    const auto before = static_cast<float>((r + g + b) / 3);
-    const int tintedR = mTables[0][static_cast<std::size_t>(r)];
-    const int tintedG = mTables[1][static_cast<std::size_t>(g)];
-    const int tintedB = mTables[2][static_cast<std::size_t>(b)];
-    const auto after = static_cast<float>(tintedR + tintedG + tintedB) / 3;
-    const float ratio = after > 0 ? before / after : 1.0F;
-    const auto scaled = [ratio](int c) { return PixelMath::trunc(static_cast<float>(c) * ratio); };
-    return PixelMath::keepHue({scaled(tintedR), scaled(tintedG), scaled(tintedB)});
+    const PixelMath::Rgb tinted = {mTables[0][static_cast<std::size_t>(r)],
+                                   mTables[1][static_cast<std::size_t>(g)],
+                                   mTables[2][static_cast<std::size_t>(b)]};
+    return PixelMath::restoreMean(tinted, (r + g + b) / 3);
 }
 
 bool CSpecial_Contrast_Perceptual::PostApply() {

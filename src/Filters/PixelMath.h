@@ -28,6 +28,18 @@ inline Rgb keepHue(Rgb c) {
     return {scaled(c.r), scaled(c.g), scaled(c.b)};
 }
 
+/// Each channel times the ratio, truncated; rescaled with its hue.
+inline Rgb scaled(Rgb c, float ratio) {
+    const auto product = [ratio](int v) { return trunc(static_cast<float>(v) * ratio); };
+    return keepHue({product(c.r), product(c.g), product(c.b)});
+}
+
+/// Brings a recoloured pixel to the mean brightness `mean`; a black one stays black.
+inline Rgb restoreMean(Rgb c, int mean) {
+    const float own = static_cast<float>(c.r + c.g + c.b) / 3;
+    return own > 0 ? scaled(c, static_cast<float>(mean) / own) : c;
+}
+
 /// Step between the samples of a statistic taken over the whole picture: 5, or the longer side / 200 when
 /// that side exceeds 1000 pixels and the other side.
 inline int samplingStep(int width, int height) {
