@@ -1,6 +1,11 @@
 #include "Core/PipelineTable.h"
 
+#include "Filters/Auto_Contrast.h"
 #include "Filters/Auto_Gamma.h"
+#include "Filters/CAuto_Color.h"
+#include "Filters/CAuto_Contrast_I.h"
+#include "Filters/CAuto_Contrast_TEST.h"
+#include "Filters/CAuto_Contrast_TEST_II.h"
 #include "Filters/CAverage.h"
 #include "Filters/CBilinear.h"
 #include "Filters/CClarity.h"
@@ -78,7 +83,7 @@ void testDarkness(CUserParams& params) {
     params.Dark_middle = true;
 }
 
-[[maybe_unused]] void logAutoContrast(CUserParams& params) {
+void logAutoContrast(CUserParams& params) {
     Log::log(LogLevel::Debug, "AUTOCONTRAST MODE DETECTED %d", params.mSliderParams.AutoContrast_Enabled);
     if (params.mSliderParams.AutoContrast_Enabled)
         Log::log(LogLevel::Debug, "AUTOCONTRAST MODE DETECTED");
@@ -104,12 +109,12 @@ std::span<const PipelineStep> mainSteps() {
         {"Orvela (Iteration Phase I)", {FILTER(COrv_I_Iter)}},
         {"Orvela (Iteration Phase II)", {FILTER(COrv_II_Iter)}},
         {"Histo_I", {HISTOGRAM(CHistogram_Luma_after_Orv)}},
-        {"Auto_Contrast_I", {}},
+        {"Auto_Contrast_I", {FILTER(CAuto_Contrast_I)}},
         {"Super_ORV_II", {FILTER(Super_ORV_II)}},
         {"Smart Blur", {FILTER(Super_ORV), HISTOGRAM(CHistogram_IV)}},
-        {"Auto_Color", {}},
+        {"Auto_Color", {FILTER_THEN(CAuto_Color, logAutoContrast)}},
         {"Clarity", {FILTER(CClarity), HISTOGRAM(CHistogram_VII)}},
-        {"NEW Auto_Contrast", {}},
+        {"NEW Auto_Contrast", {FILTER(Auto_Contrast)}},
         {"Saturation", {FILTER(Saturation)}},
         {"Noise", {FILTER_THEN(CBilinear, testDarkness)}},
         {"Black & White spot", {FILTER(CMedian_Salt_Pepper)}, removesSpots},
@@ -125,7 +130,7 @@ std::span<const PipelineStep> mainSteps() {
          {FILTER(CContrast_Brightness_Perceptual), HISTOGRAM(CHistogram_VIII),
           ANALYZER(CSmartAnalyzer_Digital_Flash), FILTER_WHEN(CDigital_Flash_Perceptual, usesFlash)}},
         {"Histogram XI", {HISTOGRAM(CHistogram_III)}},
-        {"cAuto_Contrast_TEST", {}},
+        {"cAuto_Contrast_TEST", {FILTER(CAuto_Contrast_TEST)}},
         {"Histogram III",
          {HISTOGRAM(CHistogram_III), ANALYZER(CSmartAnalyzer_Perceptual_Level_Dark),
           ANALYZER(CSmartAnalyzer_Perceptual_Level_Middle), ANALYZER(CSmartAnalyzer_Perceptual_Level_Right)}},
@@ -134,7 +139,7 @@ std::span<const PipelineStep> mainSteps() {
         {"Level_Middle_Perceptual", {}},
         {"Level_Light_Perceptual", {}},
         {"Histogram XI", {HISTOGRAM(CHistogram_III)}},
-        {"cAuto_Contrast_TEST II", {}},
+        {"cAuto_Contrast_TEST II", {FILTER(CAuto_Contrast_TEST_II)}},
         {"Auto_Gamma", {FILTER(Auto_Gamma)}},
     };
     return steps;

@@ -1,0 +1,38 @@
+#pragma once
+
+#include "Filters/IFilter.h"
+#include "Filters/TonalStretch.h"
+
+/// The contrast step of the automatic-contrast mode: one black limit L and one white limit R, combined from
+/// the channel histograms, stretch all three channels. A hazy picture (R < 215 and L > 40) is stretched hard,
+/// any other one softly, so that 0 and 255 stay where they are:
+///
+///     hazy:    255 * (c - L) / (R - L)
+///     normal:  c1 = c - (1 - c / 255) * L,  c1 + c1 / 255 * (255 - R)
+///
+/// Stays away from pictures with a colour cast (it sets Bicromic) and from under-exposed ones, and gives way
+/// to manual contrast and brightness.
+class Auto_Contrast final : public IFilter {
+public:
+    Auto_Contrast(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+
+    /// New value of a channel value (0 to 255) in a hazy picture; with equal limits 255.
+    static std::uint8_t hazyCurve(int value, TonalStretch::Limits limits);
+    /// New value of a channel value (0 to 255) in any other picture.
+    static std::uint8_t normalCurve(int value, TonalStretch::Limits limits);
+
+protected:
+    bool PreApply() override;
+    void ApplyRow(std::uint32_t row) override;
+    bool PostApply() override;
+
+private:
+    bool applies();
+    void scanChannels(double threshold);
+    int chooseThreshold();
+
+    std::array<TonalStretch::Limits, 3> mChannels; ///< red, green, blue
+    TonalStretch::Limits mLimits;                  ///< combined
+    std::int32_t mThreshold = 0;                   ///< of the second scans, in samples
+    TonalStretch::Table<std::uint8_t> mCurve = {};
+};

@@ -1,0 +1,36 @@
+#pragma once
+
+#include "Filters/IFilter.h"
+#include "Filters/TonalStretch.h"
+
+/// Automatic colour correction: each channel is stretched softly between limits of its own, which it reads
+/// off its histogram. mAuto_Color_Value / 1000 = S, 0 to 1, sets how far the limits follow the histogram and
+/// how many samples, (6.67 S - 3.67) * sqrt(pixels), a bin must exceed to count.
+class CAuto_Color final : public IFilter {
+public:
+    CAuto_Color(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+
+    /// Black limit for a histogram that starts at bin i: i * S, at most 120 up to S = 0.5; between 0.5 and
+    /// 0.75 flattened, i / 2 * (1 + S / cosh(i / 140)).
+    static float leftLimit(int i, float s);
+    /// White limit for a histogram that ends at bin i: 255 - (255 - i) * S, between 0.5 and 0.75
+    /// 255 - (255 - i) / 2 * (1 / cosh(i / 140) + 1) * S.
+    static float rightLimit(int i, float s);
+    /// New value of a channel value (0 to 255); the soft curve with a truncation between its stages.
+    static std::uint8_t curve(int value, float black, float white);
+
+protected:
+    bool PreApply() override;
+    void ApplyRow(std::uint32_t row) override;
+    bool PostApply() override;
+
+private:
+    void logStart() const;
+
+    struct FloatLimits {
+        float black = 0;
+        float white = 255;
+    };
+    std::array<FloatLimits, 3> mLimits; ///< red, green, blue
+    std::array<TonalStretch::Table<std::uint8_t>, 3> mCurves = {};
+};

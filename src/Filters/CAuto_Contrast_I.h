@@ -1,0 +1,41 @@
+#pragma once
+
+#include "Filters/IFilter.h"
+#include "Filters/TonalStretch.h"
+
+/// Brings the channel means back to what they were before the illumination iterations, keeping the hue where
+/// a channel saturates, and fades the result toward the unprocessed picture:
+///
+///     balanced = c * (mean before / mean after)
+///     result   = host * Fade_Value_factor + balanced * Fade_Inverse
+///
+/// mFade_Value (0 to 1000), the iterations' levels and the picture's size set the fade. Bright pictures whose
+/// means all fell get gains that are normalised to an average brightness instead.
+class CAuto_Contrast_I final : public IFilter {
+public:
+    CAuto_Contrast_I(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+
+    /// Share of the fade that a picture of this size gets: 0.5 for large, near 1 for small ones.
+    static float sharpnessFactor(int width, int height);
+
+protected:
+    bool PreApply() override;
+    void ApplyRow(std::uint32_t row) override;
+    bool PostApply() override;
+
+private:
+    bool applies();
+    void prepareRatios();
+    void normaliseRatios(float f);
+    void logRatios() const;
+    void prepareFade();
+    int fade(int processed, int host) const;
+    void logOverflows(const ConstRow& processed, const ConstRow& host) const;
+
+    float RatioR = 1.0F;
+    float RatioG = 1.0F;
+    float RatioB = 1.0F;
+    float Fade_Inverse = 1.0F;      ///< share of the balanced pixel
+    float Fade_Value_factor = 0.0F; ///< share of the host's pixel
+    std::array<TonalStretch::Table<int>, 3> mGains = {};
+};

@@ -1,0 +1,100 @@
+#include "Filters/CAuto_Contrast_TEST.h"
+
+#include "Filters/PictureConditions.h"
+#include "Filters/PixelMath.h"
+#include "Histograms/HistogramRecount.h"
+#include "Utility/Logger.h"
+
+#include <algorithm>
+#include <cmath>
+
+CAuto_Contrast_TEST::CAuto_Contrast_TEST(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
+    : IFilter(params, inPlane, outPlane) {
+    mName = "CAuto_Contrast_TEST";
+}
+
+bool CAuto_Contrast_TEST::PreApply() {
+    Log::log(LogLevel::Debug, "Applying CAuto_Contrast_TEST filter ");
+    if (!applies())
+        return false;
+    Log::log(LogLevel::Debug, "CAuto_Contrast_TEST Condition matched and Soft_Orvela is %d.",
+             mParams->Soft_Orvela);
+    recountHistograms(*mInPlane, *mParams, 3, 3);
+
+    const int pixels = mInPlane->pixelCount();
+    mThreshold = PixelMath::trunc(TonalStretch::baseThreshold(pixels));
+    const int root = PixelMath::trunc(std::sqrt(static_cast<double>(pixels)));
+    TonalStretch::Limits luma;
+    if (!TonalStretch::readLumaLimits(*mParams, luma, mThreshold, root < 700 ? 0 : root))
+        readChannelLimits();
+    C_Left_limit = luma.black;
+    C_Right_limit = luma.white;
+    mHazyCurve = TonalStretch::tabulate<std::uint8_t>(
+        [luma](int value) { return TonalStretch::stretchHazy(value, luma); });
+    return true;
+}
+
+bool CAuto_Contrast_TEST::applies() const {
+    const CSliderParams& s = mParams->mSliderParams;
+    const bool corrected = s.AutoContrast_Enabled || s.PerceptualDarkEnabled || s.PerceptualLightEnabled ||
+                           s.PerceptualMiddleEnabled || s.OrvelaLevelEnabled || s.OrvelaLevel2Enabled;
+    const bool plain = isAutomaticMode(s) || !corrected;
+    const bool manual = s.mAbsolute_Dark_Enabled || s.mAbsolute_Light_Enabled || s.mAbsolute_Middle_Enabled ||
+                        s.BrightnessEnabled || s.ContrastEnabled || s.GammaCorrectionEnabled;
+    const bool purelyAutomatic = !manual && plain && !s.ClarityFilterEnabled && mParams->Normal_Picture &&
+                                 !mParams->Under_Exposed_Picture;
+    return !s.mAuto_Color_Enabled && !purelyAutomatic;
+}
+
+void CAuto_Contrast_TEST::readChannelLimits() {
+    static constexpr std::array kNames = {'R', 'G', 'B'};
+    Log::log(LogLevel::Debug, "threshold: %f ", static_cast<double>(mThreshold));
+    const auto histograms = TonalStretch::channelHistograms(*mParams);
+    std::array<TonalStretch::Limits, 3> channels;
+    for (std::size_t c = 0; c < 3; ++c) {
+        if (const auto i = TonalStretch::scanLeft(*histograms[c], mThreshold, 253)) {
+            channels[c].black = *i;
+            Log::log(LogLevel::Debug, "Left_Limit_%c: %d", kNames[c], *i);
+        }
+        if (const auto i = TonalStretch::scanRight(*histograms[c], mThreshold, 2)) {
+            channels[c].white = *i;
+            Log::log(LogLevel::Debug, "Right_Limit_%c: %d", kNames[c], *i);
+        }
+    }
+    mLimits = TonalStretch::combine(channels);
+    const int range = mLimits.white - mLimits.black;
+    mFactor = range > 0 ? static_cast<float>(255.0 / range) : 1.0F;
+    mCurve =
+        TonalStretch::tabulate<int>([this](int value) { return stretch(value, mLimits.black, mFactor); });
+}
+
+int CAuto_Contrast_TEST::stretch(int value, int black, float factor) {
+    return PixelMath::trunc(static_cast<float>(value - black) * factor);
+}
+
+void CAuto_Contrast_TEST::ApplyRow(std::uint32_t row) {
+    beginRow(row, "Filters/CAuto_Contrast_TEST", 315);
+    const int y = static_cast<int>(row);
+    if (mParams->m_Opaco)
+        TonalStretch::mapRow({&mHazyCurve, &mHazyCurve, &mHazyCurve}, *mInPlane, *mOutPlane, y);
+    else
+        stretchRow(*mInPlane, y);
+}
+
+void CAuto_Contrast_TEST::stretchRow(const CARGBPlane& plane, int y) const {
+    const ConstRow in = plane.row(y);
+    const Row out = mOutPlane->row(y);
+    for (int x = 0; x < plane.width(); ++x) {
+        PixelMath::Rgb pixel = {in[0][x], in[1][x], in[2][x]};
+        if (std::min({pixel.r, pixel.g, pixel.b}) >= mLimits.black)
+            pixel = PixelMath::keepHue({mCurve[in[0][x]], mCurve[in[1][x]], mCurve[in[2][x]]});
+        out[0][x] = static_cast<std::uint8_t>(pixel.r);
+        out[1][x] = static_cast<std::uint8_t>(pixel.g);
+        out[2][x] = static_cast<std::uint8_t>(pixel.b);
+    }
+}
+
+bool CAuto_Contrast_TEST::PostApply() {
+    Log::log(LogLevel::Debug, "CAuto_Contrast_TEST Filter complete.");
+    return true;
+}

@@ -1,0 +1,44 @@
+#pragma once
+
+#include "Filters/IFilter.h"
+#include "Filters/TonalStretch.h"
+
+/// The stretch of the automatic modes, by limits that go only half way: from 0 to the first and from 255 to
+/// the last bin of each channel that counts. Measures its input anew, on every pixel.
+///
+///     hazy (by luma):  each channel linearly between the luma limits, clamped
+///     otherwise:       (c - L) * 255 / (R - L) from L on, c * 255 / R below it, with the channel's own
+///                      limits; the hue is kept where a channel exceeds 255
+class CAuto_Contrast_TEST_II final : public IFilter {
+public:
+    CAuto_Contrast_TEST_II(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+
+    /// New value of a channel value (0 to 255) between the channel's limits; exceeds 255 above the white one.
+    /// @param factor  255 / (white - black), or 1
+    static int stretch(int value, TonalStretch::Limits limits, float factor);
+
+protected:
+    bool PreApply() override;
+    void ApplyRow(std::uint32_t row) override;
+    bool PostApply() override;
+
+private:
+    void measure();
+    void readChannelLimits();
+    void prepareCurves();
+
+    std::int32_t C_Left_limit = 0;    ///< by luma
+    std::int32_t C_Right_limit = 255; ///< by luma
+    std::int32_t Left_Limit_R = 0;
+    std::int32_t Right_Limit_R = 255;
+    std::int32_t Left_Limit_G = 0;
+    std::int32_t Right_Limit_G = 255;
+    std::int32_t Left_Limit_B = 0;
+    std::int32_t Right_Limit_B = 255;
+    float HighLight_Radio_R = 1.0F;
+    float HighLight_Radio_G = 1.0F;
+    float HighLight_Radio_B = 1.0F;
+    float mThreshold = 0; ///< in samples
+    TonalStretch::Table<std::uint8_t> mHazyCurve = {};
+    std::array<TonalStretch::Table<int>, 3> mCurves = {};
+};
