@@ -15,6 +15,12 @@
 #include "Filters/CDigital_Flash_Perceptual.h"
 #include "Filters/CGamma_Perceptual.h"
 #include "Filters/CGamma_Simple_Filter.h"
+#include "Filters/CLevel_Dark_Left.h"
+#include "Filters/CLevel_Dark_Left_Perceptual.h"
+#include "Filters/CLevel_Light_Right.h"
+#include "Filters/CLevel_Light_Right_Perceptual.h"
+#include "Filters/CLevel_Middle.h"
+#include "Filters/CLevel_Middle_Perceptual.h"
 #include "Filters/CMedian_Salt_Pepper.h"
 #include "Filters/CMoire.h"
 #include "Filters/COrv_II_Iter.h"
@@ -123,9 +129,11 @@ std::span<const PipelineStep> mainSteps() {
         {"Moire", {FILTER(CMoire), FILTER(CAverage)}},
         {"Temperature", {FILTER(CTemperature)}},
         {"Color", {FILTER(CColor), HISTOGRAM(CHistogram_VII)}},
-        {"Dark_Level", {}},
-        {"Middle_Level", {}},
-        {"Light_Level", {HISTOGRAM(CHistogram_VII), ANALYZER(CSmartAnalyzer_Perceptual_Contrast_Brightness)}},
+        {"Dark_Level", {FILTER(CLevel_Dark_Left)}},
+        {"Middle_Level", {FILTER(CLevel_Middle)}},
+        {"Light_Level",
+         {FILTER(CLevel_Light_Right), HISTOGRAM(CHistogram_VII),
+          ANALYZER(CSmartAnalyzer_Perceptual_Contrast_Brightness)}},
         {" Contrast_Brightness_Perceptual",
          {FILTER(CContrast_Brightness_Perceptual), HISTOGRAM(CHistogram_VIII),
           ANALYZER(CSmartAnalyzer_Digital_Flash), FILTER_WHEN(CDigital_Flash_Perceptual, usesFlash)}},
@@ -135,9 +143,9 @@ std::span<const PipelineStep> mainSteps() {
          {HISTOGRAM(CHistogram_III), ANALYZER(CSmartAnalyzer_Perceptual_Level_Dark),
           ANALYZER(CSmartAnalyzer_Perceptual_Level_Middle), ANALYZER(CSmartAnalyzer_Perceptual_Level_Right)}},
         {"Gamma_Perceptual", {FILTER(CGamma_Perceptual)}},
-        {"Level_Dark_Perceptual", {}},
-        {"Level_Middle_Perceptual", {}},
-        {"Level_Light_Perceptual", {}},
+        {"Level_Dark_Perceptual", {FILTER(CLevel_Dark_Left_Perceptual)}},
+        {"Level_Middle_Perceptual", {FILTER(CLevel_Middle_Perceptual)}},
+        {"Level_Light_Perceptual", {FILTER(CLevel_Light_Right_Perceptual)}},
         {"Histogram XI", {HISTOGRAM(CHistogram_III)}},
         {"cAuto_Contrast_TEST II", {FILTER(CAuto_Contrast_TEST_II)}},
         {"Auto_Gamma", {FILTER(Auto_Gamma)}},
@@ -151,16 +159,22 @@ std::span<const PipelineTask> finalTouchTasks() {
         FILTER(CContrast_Simple_Filter),
         FILTER(CColor),
         HISTOGRAM(CHistogram_VII),
+        FILTER(CLevel_Dark_Left),
+        FILTER(CLevel_Middle),
+        FILTER(CLevel_Light_Right),
         HISTOGRAM_THEN(CHistogram0, takeInputLuma),
         ANALYZER(CSmartAnalyzer_Perceptual_Contrast_Brightness),
         FILTER(CSpecial_Contrast_Perceptual),
         FILTER(CContrast_Brightness_Perceptual),
         HISTOGRAM(CHistogram_III),
         ANALYZER(CSmartAnalyzer_Perceptual_Level_Dark),
+        FILTER(CLevel_Dark_Left_Perceptual),
         HISTOGRAM(CHistogram_III),
         ANALYZER(CSmartAnalyzer_Perceptual_Level_Middle),
+        FILTER(CLevel_Middle_Perceptual),
         HISTOGRAM(CHistogram_III),
         ANALYZER(CSmartAnalyzer_Perceptual_Level_Right),
+        FILTER(CLevel_Light_Right_Perceptual),
     };
     return tasks;
 }

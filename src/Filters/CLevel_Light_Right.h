@@ -1,0 +1,29 @@
+#pragma once
+
+#include "Filters/IFilter.h"
+#include "Filters/LevelMath.h"
+
+#include <optional>
+
+/// Absolute highlights: brightens, light tones most.
+///
+///     X' = X + k * L * X / 255,   L = position * 255 / 1000 (0 to 255)
+///     k = (sech((m - luma) / 120) - 0.32) / 0.6782 for every luma, m the mean
+///
+/// A main run moves all channels by mAbsolute_Light_Value, whose position 0 stands for L = 255; a final-touch
+/// run by mLight_Touch_Value_RGB, or by a channel's own value where that is not 0, and not at all when all
+/// four are 0. Stays away in automatic colour.
+class CLevel_Light_Right final : public IFilter {
+public:
+    using IFilter::IFilter;
+
+protected:
+    bool PreApply() override;
+    void ApplyRow(std::uint32_t row) override;
+
+private:
+    LevelMath::Levels mainLevels() const;
+    LevelMath::Levels touchLevels() const;
+
+    std::optional<LevelMath::MoveTables> mTables;
+};

@@ -1,0 +1,31 @@
+#pragma once
+
+#include "Filters/IFilter.h"
+#include "Filters/LevelMath.h"
+
+#include <optional>
+
+/// Perceptual highlights: brightens as CLevel_Light_Right by a measured coefficient times the slider.
+///
+///     L = m_R_L_L_F * PerceptualLight / 1000 (neutral 0)
+///     k = (sech((m - luma) / 70) - 0.32) / 0.6782 from the mean luma m on, 1 below; from position 900 on 1
+///         and above 900 (position - 900) / 200 + 1, for every luma
+///
+/// A final-touch run, with k of width 120 for every luma, brightens by the RGB level, then each channel by
+/// its own. Gives way to the absolute levels.
+class CLevel_Light_Right_Perceptual final : public IFilter {
+public:
+    using IFilter::IFilter;
+
+protected:
+    bool PreApply() override;
+    void ApplyRow(std::uint32_t row) override;
+
+private:
+    LevelMath::Levels mainLevels() const;
+    LevelMath::Levels touchLevels() const;
+    float weight(double luma) const;
+
+    std::optional<LevelMath::MoveTables> mTables;
+    bool mTouch = false;
+};

@@ -1,0 +1,61 @@
+#include "Filters/CLevel_Middle.h"
+
+#include "Filters/LevelSwitches.h"
+#include "Filters/PixelMath.h"
+#include "Utility/Logger.h"
+
+#include <utility>
+
+bool CLevel_Middle::PreApply() {
+    const CSliderParams& sliders = mParams->mSliderParams;
+    const bool touched = LevelSwitches::touchMiddle(sliders);
+    if ((!sliders.mAbsolute_Middle_Enabled && !touched) || sliders.mAuto_Color_Enabled)
+        return false;
+    const bool finalTouch = mParams->Final_Touch_Mode_Enabled;
+    Log::log(LogLevel::Debug, "Applying CLevel_Middle filter from plane at 0x%x to plane at 0x%x...",
+             logAddress(mInPlane), logAddress(mOutPlane));
+    Log::log(LogLevel::Debug, "!Final_Touch_Mode_Enabled  %d.", !finalTouch);
+    mMaps = LevelMath::factorMaps(1, {1, 1, 1});
+    if (!finalTouch && sliders.mAbsolute_Middle_Enabled && sliders.mAbsolute_Middle_Value != 500)
+        prepareMain();
+    else if (finalTouch && touched)
+        prepareTouch();
+    return true;
+}
+
+void CLevel_Middle::prepareMain() {
+    const float position = mParams->mSliderParams.mAbsolute_Middle_Value;
+    Log::log(LogLevel::Debug, "Middle_Level_Value  %f", static_cast<double>(position));
+    Log::log(LogLevel::Debug, "CLevel_Middle Condition matched.");
+    const float gamma = LevelMath::sliderToGamma(position);
+    mMaps = LevelMath::factorMaps(LevelMath::gammaRatio(mParams->m_OriginalLuma, gamma), {1, 1, 1});
+}
+
+void CLevel_Middle::prepareTouch() {
+    const CSliderParams& sliders = mParams->mSliderParams;
+    const auto ratio = [](float mean, float position) {
+        return LevelMath::gammaRatio(mean, LevelMath::sliderToGamma(position));
+    };
+    const float mean = mParams->m_OriginalLuma;
+    const float common = ratio(mean, sliders.mMiddle_Touch_Value_RGB);
+    const std::array<float, 3> own = {ratio(mParams->m_OriginalLumaR, sliders.mMiddle_Touch_Value_R),
+                                      ratio(mParams->m_OriginalLumaG, sliders.mMiddle_Touch_Value_G),
+                                      ratio(mParams->m_OriginalLumaB, sliders.mMiddle_Touch_Value_B)};
+    mMaps = LevelMath::factorMaps(common, own);
+
+    const float gamma = LevelMath::sliderToGamma(sliders.mMiddle_Touch_Value_RGB);
+    const float moved = LevelMath::gammaTransfer(PixelMath::trunc(mean), gamma);
+    Log::log(LogLevel::Debug, "CLevel_Middle TOUCH Condition matched.");
+    Log::log(LogLevel::Debug, "Luma_GAMMA_Factor %f", static_cast<double>(gamma));
+    Log::log(LogLevel::Debug, "Ori_aux %f", static_cast<double>(moved));
+    Log::log(LogLevel::Debug, "Gamma_Radio_RGB %f", static_cast<double>(common));
+    Log::log(LogLevel::Debug, "Gamma_Radio_R %f", static_cast<double>(own[0]));
+    Log::log(LogLevel::Debug, "Gamma_Radio_G %f", static_cast<double>(own[1]));
+    Log::log(LogLevel::Debug, "Gamma_Radio_B %f", static_cast<double>(own[2]));
+}
+
+void CLevel_Middle::ApplyRow(std::uint32_t row) {
+    beginRow(row, "Filters/CLevel_Middle", __LINE__);
+    const int y = static_cast<int>(row);
+    LevelMath::mapRow(std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width(), mMaps);
+}

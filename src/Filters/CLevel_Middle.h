@@ -1,0 +1,25 @@
+#pragma once
+
+#include "Filters/IFilter.h"
+#include "Filters/LevelMath.h"
+
+/// Absolute midtones: multiplies by the ratio by which a gamma would move the mean luma.
+///
+///     ratio = 255 * (trunc(mean) / 255)^(1 / g) / mean,   g = 0.1 (position 0) to 10 (1000), neutral 500
+///
+/// A main run uses mAbsolute_Middle_Value and the mean luma; a final-touch run mMiddle_Touch_Value_RGB, then
+/// each channel's own value and mean. Too bright pixels keep their hue. Stays away in automatic colour.
+class CLevel_Middle final : public IFilter {
+public:
+    using IFilter::IFilter;
+
+protected:
+    bool PreApply() override;
+    void ApplyRow(std::uint32_t row) override;
+
+private:
+    void prepareMain();
+    void prepareTouch();
+
+    LevelMath::ChannelMaps mMaps = {};
+};

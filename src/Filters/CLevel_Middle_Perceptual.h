@@ -1,0 +1,27 @@
+#pragma once
+
+#include "Filters/IFilter.h"
+#include "Filters/LevelMath.h"
+
+/// Perceptual midtones: a gamma between the measured coefficients m_M_H_L_F (low) and m_M_H_H_F (high).
+///
+///     position >= 500: gamma = (position - 500) / 500 * high * 9 + 1
+///     position <  500: gamma = position / 500 * (1 - low) + low
+///
+/// A high coefficient above 1 is decreased by 1 for good before its use. A final-touch run multiplies by
+/// ratios that such gammas of the means give, for all channels, then for each; a ratio r below 1 acts as the
+/// factor 1 - r. Too bright pixels keep their hue. Gives way to the absolute midtones.
+class CLevel_Middle_Perceptual final : public IFilter {
+public:
+    using IFilter::IFilter;
+
+protected:
+    bool PreApply() override;
+    void ApplyRow(std::uint32_t row) override;
+
+private:
+    float mainGamma();
+    void prepareTouch();
+
+    LevelMath::ChannelMaps mMaps = {};
+};
