@@ -1,6 +1,7 @@
 #include "Filters/COrv_II_Iter.h"
 #include "Filters/COrv_I_Iter.h"
 #include "Filters/IlluminationKernel.h"
+#include "Filters/SmoothingKernel.h"
 #include "Filters/Super_ORV.h"
 #include "Filters/Super_ORV_II.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
@@ -201,6 +202,29 @@ TEST(Super_ORV, WeighsEveryClassOfDistance) {
             const double expected = (19.624 * 100 + weights[dx * dx + dy * dy] * 100) / 20;
             EXPECT_EQ(at(*plane, 3, 3)[0], static_cast<int>(expected)) << dx << ',' << dy;
         }
+    }
+}
+
+TEST(SmoothingKernel, TilesAndPlainFormGiveTheSameBytes) {
+    // Noise of little and of full contrast, with black in it, over more than one tile.
+    const auto full = testplanes::noise(561, 24);
+    const auto in = testplanes::make(561, 24, [&full](int x, int y) {
+        Pixel pixel = at(*full, x, y);
+        for (std::uint8_t& sample : pixel)
+            sample = static_cast<std::uint8_t>(x < 200 ? sample / 64 + 60 + y
+                                                       : (x < 300 ? 0 : sample / (1 + x % 7)));
+        return pixel;
+    });
+    for (const double threshold : {0.05, 0.08, 0.35}) {
+        const SmoothingKernel kernel(threshold);
+        CARGBPlane tiled(*in, QStringLiteral("tiled"));
+        CARGBPlane plain(*in, QStringLiteral("plain"));
+        for (int y = 2; y < 22; ++y) {
+            kernel.applyRow(*in, tiled, y, 2, 559);
+            kernel.applyRowPlain(*in, plain, y, 2, 559);
+        }
+        EXPECT_EQ(bytes(tiled), bytes(plain)) << threshold;
+        EXPECT_NE(bytes(tiled), bytes(*in));
     }
 }
 
