@@ -1,0 +1,7 @@
+#include "GUI/Controls/Artwork.h"
+
+#include <QtGlobal>
+
+void initArtwork() {
+    Q_INIT_RESOURCE(artwork);
+}

@@ -1,0 +1,4 @@
+#pragma once
+
+/// Makes role, value and range of the controls known to assistive tools. Further calls do nothing.
+void installControlAccessibility();

@@ -1,0 +1,124 @@
+#include "GUI/Controls/CColorPicker.h"
+#include "GUI/Controls/CColorPickerPopup.h"
+
+#include <QAccessible>
+#include <QLineEdit>
+#include <QSignalSpy>
+#include <QTest>
+
+#include <gtest/gtest.h>
+
+namespace {
+
+class ColorPicker : public testing::Test {
+protected:
+    void SetUp() override {
+        picker.show();
+        picker.activateWindow();
+        ASSERT_TRUE(QTest::qWaitForWindowExposed(&picker));
+    }
+    QLineEdit* field(const char* name) { return picker.findChild<QLineEdit*>(QString::fromUtf8(name)); }
+    CColorPickerPopup* popup() { return picker.findChild<CColorPickerPopup*>(); }
+
+    CColorPicker picker;
+};
+
+TEST_F(ColorPicker, StartsWhiteWithThreeFramelessFields) {
+    EXPECT_EQ(picker.color(), QColor(255, 255, 255, 255));
+    EXPECT_EQ(picker.size(), QSize(100, 14));
+    for (const char* name : {"redValue", "greenValue", "blueValue"}) {
+        ASSERT_TRUE(field(name)) << name;
+        EXPECT_EQ(field(name)->text(), QStringLiteral("255"));
+        EXPECT_FALSE(field(name)->hasFrame());
+        EXPECT_LE(field(name)->width(), 20);
+        EXPECT_LE(field(name)->height(), 12);
+        EXPECT_LE(field(name)->fontMetrics().horizontalAdvance(QStringLiteral("255")), 18)
+            << "three digits fit";
+        EXPECT_TRUE(picker.rect().contains(field(name)->geometry()));
+    }
+}
+
+TEST_F(ColorPicker, SetColorFillsTheFieldsAndAnnounces) {
+    QSignalSpy changed(&picker, &CColorPicker::colorChanged);
+    picker.setColor(QColor(1, 20, 255));
+    EXPECT_EQ(field("redValue")->text(), QStringLiteral("1"));
+    EXPECT_EQ(field("greenValue")->text(), QStringLiteral("20"));
+    EXPECT_EQ(field("blueValue")->text(), QStringLiteral("255"));
+    for (const QList<QVariant>& call : changed)
+        EXPECT_EQ(call[0].value<QColor>(), QColor(1, 20, 255));
+    const qsizetype before = changed.count();
+    picker.setColor(QColor(1, 20, 255)); // no field changes: just the announcement itself
+    EXPECT_EQ(changed.count(), before + 1);
+}
+
+TEST_F(ColorPicker, TypedComponentsAreKeptWithin255) {
+    QSignalSpy changed(&picker, &CColorPicker::colorChanged);
+    const std::pair<const char*, QColor> typed[] = {
+        {"redValue", QColor(7, 255, 255)}, {"greenValue", QColor(7, 7, 255)}, {"blueValue", QColor(7, 7, 7)}};
+    for (const auto& [name, color] : typed) {
+        field(name)->selectAll();
+        QTest::keyClicks(field(name), QStringLiteral("7"));
+        EXPECT_EQ(picker.color(), color);
+    }
+    EXPECT_EQ(changed.count(), 3);
+    QTest::keyClicks(field("greenValue"), QStringLiteral("00"));
+    EXPECT_EQ(field("greenValue")->text(), QStringLiteral("255"));
+    EXPECT_EQ(picker.color(), QColor(7, 255, 7));
+    picker.on_blueValue_changed(QStringLiteral("none"));
+    EXPECT_EQ(picker.color(), QColor(7, 255, 0));
+}
+
+TEST_F(ColorPicker, ThePopupPicksThePixelUnderTheMouse) {
+    QTest::mousePress(&picker, Qt::LeftButton, {}, QPoint(3, 7));
+    ASSERT_TRUE(popup()->isVisible());
+    EXPECT_TRUE(popup()->hasMouseTracking());
+    const QPoint off = popup()->pos() - picker.mapToGlobal(QPoint(17, 0));
+    EXPECT_LE(off.manhattanLength(), 4) << "up to the frame that the offscreen platform gives to windows";
+    const QImage shown(QStringLiteral(":/Advanced UI/Misc_ColorPicker.png"));
+    EXPECT_EQ(popup()->size(), shown.size());
+    for (const QPoint& point :
+         {QPoint(0, 53), QPoint(60, 53), QPoint(120, 53), QPoint(90, 0), QPoint(0, 119)}) {
+        QTest::mouseMove(popup(), point);
+        EXPECT_EQ(picker.color(), shown.pixelColor(point));
+    }
+    EXPECT_LT(picker.color().red(), 5) << "the grey ramp starts black";
+    QTest::mouseRelease(popup(), Qt::LeftButton, {}, QPoint(-1, 5));
+    EXPECT_TRUE(popup()->isVisible()) << "released outside";
+    QTest::mouseRelease(popup(), Qt::LeftButton, {}, QPoint(60, 53));
+    EXPECT_FALSE(popup()->isVisible());
+    EXPECT_FALSE(popup()->hasMouseTracking());
+    QTest::mousePress(&picker, Qt::LeftButton, {}, QPoint(8, 7)); // on the letter R
+    ASSERT_TRUE(popup()->isVisible());
+    QTest::keyClick(popup(), Qt::Key_Escape);
+    EXPECT_FALSE(popup()->isVisible());
+}
+
+TEST_F(ColorPicker, TwoPickersMayFollowEachOther) {
+    CColorPicker other;
+    QObject::connect(&picker, &CColorPicker::colorChanged, &other, &CColorPicker::setColor);
+    QObject::connect(&other, &CColorPicker::colorChanged, &picker, &CColorPicker::setColor);
+    picker.setColor(Qt::blue);
+    EXPECT_EQ(other.color(), QColor(Qt::blue));
+    other.on_redValue_changed(QStringLiteral("9"));
+    EXPECT_EQ(picker.color(), QColor(9, 0, 255));
+}
+
+TEST_F(ColorPicker, TellsAssistiveToolsItsColor) {
+    picker.setColor(QColor(255, 0, 16));
+    QAccessibleInterface* access = QAccessible::queryAccessibleInterface(&picker);
+    EXPECT_EQ(access->role(), QAccessible::ColorChooser);
+    EXPECT_EQ(access->text(QAccessible::Value), QStringLiteral("#ff0010"));
+    EXPECT_EQ(QAccessible::queryAccessibleInterface(field("greenValue"))->text(QAccessible::Name),
+              QStringLiteral("Green"));
+}
+
+TEST_F(ColorPicker, PaintsAnOutlinedSwatch) {
+    picker.setColor(QColor(200, 30, 40));
+    const QImage image = picker.grab().toImage();
+    EXPECT_EQ(image.pixelColor(2, 7), QColor(Qt::black));
+    EXPECT_EQ(image.pixelColor(50, 0), QColor(Qt::black));
+    EXPECT_EQ(image.pixelColor(99, 7), QColor(Qt::black));
+    EXPECT_EQ(image.pixelColor(3, 12), QColor(200, 30, 40));
+}
+
+} // namespace

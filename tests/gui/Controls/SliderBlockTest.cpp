@@ -1,0 +1,283 @@
+#include "GUI/Controls/COrvelaSliderBlockImpl.h"
+
+#include <QAccessible>
+#include <QApplication>
+#include <QClipboard>
+#include <QSignalSpy>
+#include <QTest>
+#include <QToolTip>
+#include <QVBoxLayout>
+#include <QWheelEvent>
+
+#include <gtest/gtest.h>
+
+namespace {
+
+/// A block with the scale "tenth" (0 to 100), shown in an active window with a second block below it.
+class SliderBlock : public testing::Test {
+protected:
+    void SetUp() override {
+        auto* layout = new QVBoxLayout(&window);
+        layout->addWidget(&block);
+        layout->addWidget(&next);
+        block.setScale(SliderScales::Tenth);
+        block.setMinMax(0, 100);
+        block.setText(QStringLiteral("Fade"));
+        window.resize(400, 120);
+        window.show();
+        window.activateWindow();
+        ASSERT_TRUE(QTest::qWaitForWindowActive(&window));
+    }
+
+    CThinHorizontalSlider* slider() { return block.sldrValue; }
+    std::string text() { return block.txtValue->text().toStdString(); }
+    /// Replaces the text as a user does.
+    void type(const char* keys) {
+        block.txtValue->setFocus();
+        block.txtValue->selectAll();
+        QTest::keyClicks(block.txtValue, QString::fromUtf8(keys));
+    }
+    void doubleClick(const QPoint& point) {
+        QTest::mouseDClick(window.windowHandle(), Qt::LeftButton, {}, block.mapTo(&window, point));
+    }
+    void wheel(int angle) {
+        const QPointF middle = QRectF(slider()->rect()).center();
+        QWheelEvent event(middle, slider()->mapToGlobal(middle), {}, {0, angle}, Qt::NoButton, {},
+                          Qt::NoScrollPhase, false);
+        QCoreApplication::sendEvent(slider(), &event);
+    }
+
+    QWidget window;
+    COrvelaSliderBlockImpl block{&window};
+    COrvelaSliderBlockImpl next{&window};
+};
+
+TEST_F(SliderBlock, StartsAsAnUnnamedIdentity) {
+    COrvelaSliderBlockImpl fresh;
+    EXPECT_EQ(fresh.lblName->text(), QStringLiteral("Unamed"));
+    EXPECT_EQ(fresh.sldrValue->toolTip(),
+              QStringLiteral("This bar allows you to change this property value with your mouse only."));
+    EXPECT_EQ(fresh.value(), 0);
+    fresh.setValue(1000);
+    EXPECT_EQ(fresh.txtValue->text(), QStringLiteral("1000.0"));
+    EXPECT_TRUE(fresh.isEnabled());
+    EXPECT_EQ(fresh.sldrValue->height(), 7);
+    fresh.txtValue->setText(QStringLiteral("1001"));
+    Q_EMIT fresh.txtValue->editingFinished();
+    EXPECT_EQ(fresh.value(), 0) << "the range at first is 0 to 1000";
+}
+
+TEST_F(SliderBlock, PositionsSnapToWhatOneDecimalTells) {
+    QSignalSpy changed(&block, &COrvelaSliderBlockImpl::valueChanged);
+    block.setScale(SliderScales::Shadows);
+    block.setValue(500); // shows 127.5, which is position 500 (up to rounding)
+    EXPECT_EQ(text(), "127.5");
+    EXPECT_NEAR(block.value(), 500, 1e-9);
+    block.setValue(501); // shows 127.755 as 127.8, which is 501.176...
+    EXPECT_EQ(text(), "127.8");
+    EXPECT_NEAR(block.value(), 127.8 / 0.255, 1e-9);
+    EXPECT_EQ(changed.count(), 2);
+    block.setValue(501.1); // the same text: nothing is derived anew
+    EXPECT_EQ(block.value(), 501.1);
+    EXPECT_EQ(changed.count(), 2);
+    block.setVirtualValue(63.75);
+    EXPECT_EQ(text(), "63.8");
+    EXPECT_NEAR(block.value(), 63.8 / 0.255, 1e-9);
+}
+
+TEST_F(SliderBlock, DraggingMovesTheTextAndAnnouncesOnceAtRelease) {
+    QSignalSpy changed(&block, &COrvelaSliderBlockImpl::valueChanged);
+    const int last = slider()->width() - 1;
+    QTest::mousePress(slider(), Qt::LeftButton, {}, QPoint(1 + last / 4, 3));
+    EXPECT_TRUE(slider()->isDragging());
+    EXPECT_EQ(text(), QString::number(100.0 / last * (last / 4), 'f', 1).toStdString());
+    QTest::mouseMove(slider(), QPoint(1 + last / 2, 3));
+    EXPECT_EQ(text(), QString::number(100.0 / last * (last / 2), 'f', 1).toStdString());
+    EXPECT_EQ(changed.count(), 0);
+    QTest::mouseRelease(slider(), Qt::LeftButton, {}, QPoint(1 + last / 2, 3));
+    EXPECT_FALSE(slider()->isDragging());
+    EXPECT_FALSE(slider()->hasMouseTracking());
+    ASSERT_EQ(changed.count(), 1);
+    EXPECT_DOUBLE_EQ(changed[0][0].toDouble(), 1000.0 / last * (last / 2));
+    QTest::mousePress(slider(), Qt::LeftButton, {}, QPoint(0, 3)); // left of the scale's first pixel
+    EXPECT_EQ(block.value(), 0);
+    QTest::mouseRelease(slider(), Qt::LeftButton, {}, QPoint(last + 50, 3));
+    EXPECT_EQ(block.value(), 1000);
+}
+
+TEST_F(SliderBlock, TheWholeHeightOfTheRowTakesTheMouse) {
+    const QRect thin = slider()->geometry();
+    ASSERT_GT(thin.top(), 2);
+    QTest::mousePress(&block, Qt::LeftButton, {}, QPoint(thin.right(), 1));
+    EXPECT_TRUE(slider()->isDragging());
+    EXPECT_TRUE(slider()->hasFocus());
+    QTest::mouseMove(&block, QPoint(thin.left() + 1, block.height() - 1));
+    QTest::mouseRelease(&block, Qt::LeftButton, {}, QPoint(thin.left() + 1, block.height() - 1));
+    EXPECT_FALSE(slider()->isDragging());
+    EXPECT_EQ(text(), "0.0");
+    QTest::mouseClick(&block, Qt::LeftButton, {}, QPoint(thin.left() - 3, 1)); // beside the slider
+    block.setEnabled(false);
+    QTest::mouseClick(&block, Qt::LeftButton, {}, QPoint(thin.right(), 1));
+    EXPECT_EQ(text(), "0.0");
+}
+
+TEST_F(SliderBlock, TypedTextMovesTheSliderAtEveryKey) {
+    QSignalSpy changed(&block, &COrvelaSliderBlockImpl::valueChanged);
+    type("42.5");
+    EXPECT_EQ(changed.count(), 4); // 4, 42, 42., 42.5
+    EXPECT_EQ(block.value(), 425);
+    type("-1");
+    EXPECT_EQ(text(), "1") << "the range has nothing negative";
+    QApplication::clipboard()->setText(QStringLiteral("12.5"));
+    block.txtValue->selectAll();
+    QTest::keySequence(block.txtValue, QKeySequence::Paste);
+    EXPECT_EQ(block.value(), 125);
+    QApplication::clipboard()->setText(QStringLiteral("1 2"));
+    block.txtValue->selectAll();
+    QTest::keySequence(block.txtValue, QKeySequence::Paste);
+    EXPECT_EQ(text(), "12.5");
+}
+
+TEST_F(SliderBlock, OutOfRangeIsResetToTheBottomWhenEditingFinishes) {
+    type("5000");
+    EXPECT_EQ(block.value(), 50000);
+    QTest::keyClick(block.txtValue, Qt::Key_Return);
+    EXPECT_EQ(text(), "0");
+    EXPECT_EQ(block.value(), 0);
+    EXPECT_TRUE(block.txtValue->hasFocus());
+    EXPECT_EQ(QToolTip::text(), QStringLiteral("Fade shall be in range: 0 to 100"));
+    type("1e999");
+    next.txtValue->setFocus();
+    EXPECT_EQ(text(), "0");
+    EXPECT_TRUE(block.txtValue->hasFocus()) << "the field takes the focus back";
+    block.setScale(SliderScales::Temperature);
+    block.setMinMax(10000, 2000.5);
+    for (const char* low : {"2000", "10001", "e", ""}) {
+        block.txtValue->setText(QStringLiteral("3000"));
+        type(low);
+        if (*low == 0)
+            QTest::keyClick(block.txtValue, Qt::Key_Delete);
+        QTest::keyClick(block.txtValue, Qt::Key_Return);
+        EXPECT_EQ(text(), "2000.5") << low;
+    }
+    type("10000");
+    QTest::keyClick(block.txtValue, Qt::Key_Return);
+    EXPECT_EQ(text(), "10000");
+}
+
+TEST_F(SliderBlock, UnfinishedNumbersAreCutToOneDecimal) {
+    type("12.75");
+    QTest::keyClick(block.txtValue, Qt::Key_Return);
+    EXPECT_EQ(text(), "12.8");
+    EXPECT_EQ(block.value(), 128);
+    type("5000.75");
+    QTest::keyClick(block.txtValue, Qt::Key_Return);
+    EXPECT_EQ(text(), "0");
+}
+
+TEST_F(SliderBlock, DoubleClickAnywhereSwitchesOnAndOff) {
+    QSignalSpy state(&block, &COrvelaSliderBlockImpl::stateChanged);
+    bool on = true;
+    for (QWidget* part : {static_cast<QWidget*>(block.lblName), static_cast<QWidget*>(slider()),
+                          static_cast<QWidget*>(block.txtValue)}) {
+        for (int round = 0; round < 2; ++round) {
+            doubleClick(part->geometry().center());
+            on = !on;
+            ASSERT_FALSE(state.isEmpty());
+            EXPECT_EQ(state.takeLast()[0].toBool(), on) << qPrintable(part->objectName());
+            EXPECT_TRUE(state.isEmpty());
+            EXPECT_EQ(slider()->isEnabled(), on);
+            EXPECT_EQ(block.txtValue->isEnabled(), on);
+            EXPECT_EQ(block.txtValue->font().italic(), !on);
+            EXPECT_TRUE(block.lblName->isEnabled());
+            EXPECT_FALSE(slider()->isDragging());
+        }
+    }
+    block.setEnabled(true);
+    EXPECT_TRUE(state.isEmpty()) << "no change, no signal";
+}
+
+TEST_F(SliderBlock, KeepsItsStateWhileTheSurroundingsAreDisabled) {
+    window.setEnabled(false);
+    EXPECT_TRUE(block.isEnabled());
+    block.setEnabled(false);
+    window.setEnabled(true);
+    EXPECT_FALSE(block.isEnabled());
+    EXPECT_FALSE(slider()->isEnabled());
+}
+
+TEST_F(SliderBlock, KeysAndWheelMoveTheFocusedSlider) {
+    QSignalSpy changed(&block, &COrvelaSliderBlockImpl::valueChanged);
+    slider()->setFocus();
+    const std::pair<Qt::Key, double> steps[] = {
+        {Qt::Key_End, 1000},  {Qt::Key_PageDown, 900}, {Qt::Key_Left, 890},    {Qt::Key_Down, 880},
+        {Qt::Key_Right, 890}, {Qt::Key_Up, 900},       {Qt::Key_PageUp, 1000}, {Qt::Key_Up, 1000},
+        {Qt::Key_Home, 0},    {Qt::Key_PageDown, 0},
+    };
+    for (const auto& [key, position] : steps) {
+        QTest::keyClick(slider(), key);
+        EXPECT_EQ(block.value(), position) << key;
+    }
+    changed.clear();
+    wheel(60);
+    EXPECT_EQ(block.value(), 0) << "half a notch";
+    wheel(60);
+    EXPECT_EQ(block.value(), 10);
+    EXPECT_GE(changed.count(), 1);
+    next.sldrValue->setFocus();
+    wheel(120);
+    EXPECT_EQ(block.value(), 10) << "without the focus";
+}
+
+TEST_F(SliderBlock, AKeyAlwaysMovesTheShownNumber) {
+    for (const SliderScale* scale :
+         {&SliderScales::Thousandth, &SliderScales::Gamma, &SliderScales::Sharpness,
+          &SliderScales::Highlights, &SliderScales::Moire}) {
+        block.setScale(*scale);
+        slider()->setFocus();
+        QTest::keyClick(slider(), Qt::Key_Home);
+        for (Qt::Key key : {Qt::Key_Right, Qt::Key_Left}) {
+            for (int count = 0; count < 500; ++count) {
+                const std::string before = text();
+                QTest::keyClick(slider(), key);
+                const double position = block.value();
+                if (key == Qt::Key_Right ? position >= 999.999 : position <= 0.001)
+                    break;
+                EXPECT_NE(text(), before);
+            }
+            EXPECT_NEAR(block.value(), key == Qt::Key_Right ? 1000 : 0, 0.001);
+        }
+    }
+}
+
+TEST_F(SliderBlock, TabVisitsSliderThenTextThenTheNextBlock) {
+    slider()->setFocus();
+    QWidget* const order[] = {block.txtValue, next.sldrValue, next.txtValue};
+    for (QWidget* widget : order) {
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Tab);
+        EXPECT_EQ(QApplication::focusWidget(), widget);
+    }
+}
+
+TEST_F(SliderBlock, TellsAssistiveToolsNameRoleAndValue) {
+    block.setValue(250);
+    QAccessibleInterface* access = QAccessible::queryAccessibleInterface(slider());
+    ASSERT_TRUE(access && access->valueInterface());
+    EXPECT_EQ(access->role(), QAccessible::Slider);
+    EXPECT_EQ(access->text(QAccessible::Name), QStringLiteral("Fade"));
+    EXPECT_EQ(access->text(QAccessible::Value), QStringLiteral("25.0"));
+    EXPECT_EQ(access->valueInterface()->maximumValue().toDouble(), 1000);
+    QSignalSpy changed(&block, &COrvelaSliderBlockImpl::valueChanged);
+    access->valueInterface()->setCurrentValue(2000);
+    EXPECT_EQ(block.value(), 1000);
+    EXPECT_GE(changed.count(), 1);
+    block.setEnabled(false);
+    access->valueInterface()->setCurrentValue(500);
+    EXPECT_EQ(block.value(), 1000);
+    EXPECT_TRUE(access->state().disabled);
+    EXPECT_EQ(QAccessible::queryAccessibleInterface(&block)->role(), QAccessible::Grouping);
+    EXPECT_EQ(QAccessible::queryAccessibleInterface(block.txtValue)->text(QAccessible::Name),
+              QStringLiteral("Fade"));
+}
+
+} // namespace

@@ -1,0 +1,36 @@
+#include <QApplication>
+#include <QRegularExpression>
+#include <QStringList>
+
+#include <gtest/gtest.h>
+
+namespace {
+
+QStringList gWarnings;
+
+void collect(QtMsgType type, const QMessageLogContext&, const QString& text) {
+    static const QRegularExpression harmless(QStringLiteral("This plugin does not support|XDG_RUNTIME_DIR"));
+    if (type != QtDebugMsg && type != QtInfoMsg && !harmless.match(text).hasMatch())
+        gWarnings.append(text);
+}
+
+/// Fails a test during which Qt warned, such as of a slot that connectSlotsByName finds no signal for.
+class WarningListener : public testing::EmptyTestEventListener {
+    void OnTestStart(const testing::TestInfo&) override { gWarnings.clear(); }
+    void OnTestEnd(const testing::TestInfo&) override {
+        for (const QString& text : gWarnings)
+            ADD_FAILURE() << "Qt warned: " << qPrintable(text);
+    }
+};
+
+} // namespace
+
+int main(int argc, char** argv) {
+    testing::InitGoogleTest(&argc, argv);
+    qInstallMessageHandler(collect);
+    QApplication application(argc, argv);
+    QCoreApplication::setOrganizationName(QStringLiteral("Kestrand"));
+    QCoreApplication::setApplicationName(QStringLiteral("OrvelaGuiTests"));
+    testing::UnitTest::GetInstance()->listeners().Append(new WarningListener);
+    return RUN_ALL_TESTS();
+}
