@@ -1,0 +1,116 @@
+#include "SmartAnalyzers/ISmartAnalyzer.h"
+
+#include "Histograms/HistogramRecount.h"
+#include "Utility/CGenericEx.h"
+#include "support/StatisticMap.h"
+#include "support/TaskSettings.h"
+#include "support/TestPlanes.h"
+
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <fstream>
+#include <new>
+#include <string>
+
+namespace {
+
+// Parameters with patterned histograms whose statistics hold a value that no analyzer writes.
+CUserParams patternedParams() {
+    CUserParams params;
+    markStatistics(params);
+    for (std::size_t i = 0; i < 256; ++i) {
+        params.pHisto_Luma[i] = static_cast<double>(i * 37 % 101);
+        params.pHisto_Red[i] = static_cast<double>((i * 37 + 11) % 101);
+        params.pHisto_Green[i] = static_cast<double>((i * 37 + 22) % 101);
+        params.pHisto_Blue[i] = static_cast<double>((i * 37 + 33) % 101);
+    }
+    return params;
+}
+
+void set(CUserParams& params, const std::string& name, float value) {
+    params.Final_Touch_Mode_Enabled |= name == "Final_Touch_Mode_Enabled";
+    if (name == "m_OriginalLuma")
+        params.m_OriginalLuma = value;
+    for (const SliderField& slider : sliderFields()) {
+        if (name == slider.name && slider.flag)
+            params.mSliderParams.*slider.flag = true;
+        else if (name == slider.name)
+            params.mSliderParams.*slider.value = value;
+    }
+}
+
+// Reads the formula of a plane, which the script explains, and makes it.
+std::unique_ptr<CARGBPlane> readPlane(std::istream& file) {
+    int power, step, modulus, red, green, blue;
+    file >> power >> step >> modulus >> red >> green >> blue;
+    return testplanes::make(40, 450, [=](int x, int y) {
+        const int k = x + 3 * y;
+        const int value = step * ((power == 2 ? k * k : k) % modulus);
+        const auto sample = [value](int first) { return static_cast<std::uint8_t>(first + value); };
+        return testplanes::Pixel{sample(red), sample(green), sample(blue)};
+    });
+}
+
+// Reads a case of the data file and compares every statistic after the analyzer's run.
+void runCase(std::istream& file) {
+    std::string analyzer, verb, name;
+    file >> analyzer;
+    const auto plane = readPlane(file);
+    CUserParams params = patternedParams();
+    std::map<std::string, double> expected;
+    for (double value = 0; file >> verb && verb != "end";) {
+        if (verb == "clear") {
+            params.pHisto_Luma.fill(0);
+            continue;
+        }
+        file >> name >> value;
+        if (verb == "bin")
+            params.pHisto_Luma[std::stoul(name)] = value;
+        else if (verb == "set")
+            set(params, name, static_cast<float>(value));
+        else
+            expected[name] = value;
+    }
+    CUserParams counted = params;
+    if (!expected.empty() && (analyzer.ends_with("Dark") || analyzer.ends_with("Right")))
+        recountHistograms(*plane, counted, 5, 1);
+    expected.merge(statistics(params));
+    EXPECT_TRUE(tasksettings::run(analyzer, params, *plane, *plane));
+    for (const auto& [field, value] : statistics(params))
+        EXPECT_NEAR(value, expected[field], 1e-12 * std::abs(value)) << analyzer << ' ' << field;
+    EXPECT_EQ(params.pHisto_Luma, counted.pHisto_Luma);
+}
+
+class FailingAnalyzer final : public ISmartAnalyzer {
+public:
+    using ISmartAnalyzer::ISmartAnalyzer;
+    void Prepare() override {}
+    void Analyze() override { throw std::bad_alloc(); }
+};
+
+} // namespace
+
+TEST(SmartAnalyzers, GiveTheIndependentResults) {
+    std::ifstream file(ORVELA_TEST_DATA "/analyzers.txt");
+    int cases = 0;
+    for (std::string verb; file >> verb; ++cases) {
+        SCOPED_TRACE("case " + std::to_string(cases));
+        runCase(file);
+    }
+    EXPECT_EQ(cases, 80);
+}
+
+TEST(SmartAnalyzers, FailureReachesTheCallerAsOneError) {
+    CUserParams params;
+    const auto plane = testplanes::uniform(2, 2, {1, 2, 3});
+    try {
+        FailingAnalyzer(&params, plane.get()).Apply();
+        FAIL();
+    } catch (const CGenericEx& failure) {
+        EXPECT_EQ(failure.message(),
+                  QStringLiteral("An error occured while running a SmartAnalyzer object."));
+    }
+    EXPECT_THROW(FailingAnalyzer(nullptr, plane.get()).Apply(), CBadPtrEx);
+    EXPECT_THROW(FailingAnalyzer(&params, nullptr).Apply(), CBadPtrEx);
+}
