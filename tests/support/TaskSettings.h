@@ -79,10 +79,14 @@ inline bool run(const std::string& name, CUserParams& params, CARGBPlane& in, CA
     throw std::invalid_argument("no task named " + name);
 }
 
-/// Leaves in `params` what the pipeline's measurements would know of the picture.
+/// Leaves in `params` what the pipeline's measurements and analyzers would know of the picture.
 inline void measure(CUserParams& params, CARGBPlane& in, CARGBPlane& out) {
-    run("CHistogram0", params, in, out);
-    run("CHistogram_VII", params, in, out);
+    for (const char* name : {"CHistogram0", "CHistogram_VII", "CHistogram_III"})
+        run(name, params, in, out);
+    for (const PipelineTask& task : PipelineTable::allTasks()) {
+        if (task.kind == TaskKind::Analyzer)
+            task.make(&params, &in, &out)->Apply();
+    }
 }
 
 } // namespace tasksettings
