@@ -1,0 +1,116 @@
+#include "support/LogCapture.h"
+#include "support/TaskSettings.h"
+#include "support/TestPlanes.h"
+
+#include <gtest/gtest.h>
+
+namespace {
+
+using tasksettings::paramsFor;
+using testplanes::at;
+using testplanes::Pixel;
+
+bool apply(const char* task, CUserParams& params, CARGBPlane& plane) {
+    CARGBPlane out(plane, QStringLiteral("out"));
+    return tasksettings::run(task, params, plane, out);
+}
+
+Pixel colourAfter(const char* task, CUserParams& params, Pixel colour) {
+    const auto plane = testplanes::uniform(4, 4, colour);
+    EXPECT_TRUE(apply(task, params, *plane));
+    return at(*plane, 2, 1);
+}
+
+CUserParams tint(float intensity, Pixel colour) {
+    CUserParams params = paramsFor("CColor", intensity);
+    params.mSliderParams.mColor_Value_R = colour[0];
+    params.mSliderParams.mColor_Value_G = colour[1];
+    params.mSliderParams.mColor_Value_B = colour[2];
+    return params;
+}
+
+TEST(CColor, TintsAndRestoresTheMeanBrightness) {
+    CUserParams params = tint(500, {200, 100, 50});
+    // (150, 100, 75) with mean 108.33, times 100 / 108.33
+    EXPECT_EQ(colourAfter("CColor", params, {100, 100, 100}), (Pixel{138, 92, 69}));
+    params = tint(0, {200, 100, 50});
+    EXPECT_EQ(colourAfter("CColor", params, {10, 20, 30}), (Pixel{10, 20, 30}));
+    EXPECT_EQ(colourAfter("CColor", params, {10, 10, 11}), (Pixel{9, 9, 10})) << "10 / 10.333, truncated";
+    params = tint(1000, {255, 51, 0});
+    // mean 102: times 200 / 102 = (500, 100, 0), so 100 * 254 / 500 = 50.8
+    EXPECT_EQ(colourAfter("CColor", params, {200, 200, 200}), (Pixel{254, 50, 0}));
+    params = tint(1000, {0, 0, 0});
+    EXPECT_EQ(colourAfter("CColor", params, {90, 80, 70}), (Pixel{0, 0, 0}));
+}
+
+TEST(CColor, FinalTouchHasItsOwnColourAndIntensity) {
+    CUserParams params = tint(1000, {255, 0, 0});
+    CSliderParams& sliders = params.mSliderParams;
+    sliders.mColor_Effect_Intensity_Enabled = false;
+    sliders.mColor_Touch_Enabled = true;
+    sliders.mColor_Intensity_Touch_Value = 500;
+    sliders.mColor_Touch_Value_R = sliders.mColor_Touch_Value_G = 0;
+    sliders.mColor_Touch_Value_B = 100;
+    EXPECT_EQ(colourAfter("CColor", params, {60, 60, 60}), (Pixel{180, 0, 0})) << "either switch starts it";
+    params.Final_Touch_Mode_Enabled = true;
+    // (30, 30, 80) with mean 46.67, times 60 / 46.67
+    EXPECT_EQ(colourAfter("CColor", params, {60, 60, 60}), (Pixel{38, 38, 102}));
+}
+
+TEST(Saturation, SmallPicturesKeepTheirPeak) {
+    CUserParams params = paramsFor("Saturation", 1000); // 0.5 + 1.2 * 0.617 / 2.25 = 0.829
+    EXPECT_EQ(colourAfter("Saturation", params, {200, 100, 100}), (Pixel{200, 34, 34}));
+    params = paramsFor("Saturation", 0);
+    EXPECT_EQ(colourAfter("Saturation", params, {200, 100, 50}), (Pixel{200, 200, 200}));
+}
+
+TEST(Saturation, RestoresTheUnprocessedBrightnessAfterAnIteration) {
+    CUserParams params = paramsFor("Saturation", 500);
+    params.m_OriginalLuma0 = 50;
+    const auto greyAfter = [&params] {
+        const auto plane = testplanes::uniform(20, 20, {100, 100, 100});
+        EXPECT_TRUE(apply("Saturation", params, *plane));
+        return at(*plane, 19, 19)[0];
+    };
+    EXPECT_EQ(greyAfter(), 100);
+    params.mSliderParams.OrvelaLevel2Enabled = true;
+    for (bool CUserParams::*flag : {&CUserParams::Switch_TOO_SHARP, &CUserParams::Normal_Picture,
+                                    &CUserParams::Under_Exposed_Picture}) {
+        params.*flag = !(params.*flag);
+        EXPECT_EQ(greyAfter(), 100);
+        params.*flag = !(params.*flag);
+    }
+    params.mSliderParams.OrvelaLevelEnabled = params.mSliderParams.BilinearFilteringEnabled = true;
+    EXPECT_EQ(greyAfter(), 50);
+    params.mSliderParams.mFade_Enabled = true;
+    EXPECT_EQ(greyAfter(), 100) << "the automatic situation keeps the picture's own";
+}
+
+TEST(Saturation, UndefinedRatiosAndSlopesChangeNothing) {
+    CUserParams params = paramsFor("Saturation", 550);
+    const LogCapture log;
+    EXPECT_TRUE(apply("Saturation", params, *testplanes::uniform(20, 20, {0, 0, 0})));
+    EXPECT_TRUE(log.has(" Saturation Radion_iso_Luma 1.000000"));
+    // The samples see red only; between them green and blue stand at the largest mean.
+    const auto red = testplanes::make(20, 20, [](int x, int y) {
+        return x % 5 + y % 5 == 0 ? Pixel{200, 0, 0} : Pixel{5, 200, 200};
+    });
+    EXPECT_TRUE(apply("Saturation", params, *red));
+    EXPECT_EQ(at(*red, 6, 6), (Pixel{5, 200, 200}));
+}
+
+// Channel values from a few lines of another language.
+TEST(CTemperature, ShiftsTheBalanceByIntervalAndLeavesDarkPixels) {
+    CUserParams params = paramsFor("CTemperature", 0);
+    EXPECT_EQ(colourAfter("CTemperature", params, {30, 40, 20}), (Pixel{30, 40, 20}));
+    EXPECT_EQ(colourAfter("CTemperature", params, {30, 30, 31}), (Pixel{32, 30, 27}));
+    EXPECT_EQ(colourAfter("CTemperature", params, {250, 240, 245}), (Pixel{254, 182, 154}));
+    params = paramsFor("CTemperature", 250); // 4000 K belongs to the interval that it ends
+    EXPECT_EQ(colourAfter("CTemperature", params, {120, 100, 80}), (Pixel{123, 100, 76}));
+    params = paramsFor("CTemperature", 250.25F);
+    EXPECT_EQ(colourAfter("CTemperature", params, {120, 100, 80}), (Pixel{120, 99, 79}));
+    params = paramsFor("CTemperature", 1000);
+    EXPECT_EQ(colourAfter("CTemperature", params, {250, 240, 245}), (Pixel{215, 226, 254}));
+}
+
+} // namespace
