@@ -153,7 +153,7 @@ TEST(LevelFilters, OverflowingMidtonesKeepTheHue) {
 
 TEST(LevelFilters, PerceptualMidtonesDecreaseTheHighCoefficientForGood) {
     CUserParams params =
-        settingsOf("PerceptualMiddleEnabled=1 PerceptualMiddle=600 m_M_H_H_F=2.5 m_M_H_H_F_B=3");
+        settingsOf("PerceptualMiddleEnabled=1 PerceptualMiddle=500 m_M_H_H_F=2.5 m_M_H_H_F_B=3");
     const auto prepare = [&params] {
         const auto in = input();
         CARGBPlane out(*in, QStringLiteral("out"));

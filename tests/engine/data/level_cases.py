@@ -176,6 +176,7 @@ MODELS = {"CLevel_Dark_Left": dark_left, "CLevel_Middle": middle, "CLevel_Light_
 
 MEAN = "m_OriginalLuma=100"
 MEANS = MEAN + " m_OriginalLumaR=110 m_OriginalLumaG=95.5 m_OriginalLumaB=70"
+BALANCED = MEAN + " m_OriginalLumaR=90 m_OriginalLumaG=85 m_OriginalLumaB=95"
 BRIGHT = MEAN + " m_OriginalLumaR=150 m_OriginalLumaG=120 m_OriginalLumaB=101"
 TOUCH = " Final_Touch_Mode_Enabled=1 "
 
@@ -216,6 +217,7 @@ def cases():
         for more in ("mAbsolute_Dark_Enabled=1", "mAbsolute_Light_Enabled=1", "Normal_Picture=0", TOUCH,
                      f"mPerceptual_Touch_{tone}_B_Enabled=1", f"m{tone}_Touch_G_Enabled=1"):
             yield name, f"{on}400 {more}"
+        yield name, f"{MEAN} Perceptual{tone}Enabled=1 {c}=509 Perceptual{tone}=500"
         rgb = c + ("_RGB" if tone == "Dark" else "")
         touch = f"{MEAN} {rgb}=90 {c}_R=120 {c}_G=100 {c}_B=60 Perceptual{tone}=950 "
         for flags, v in (((1, 0, 0, 0), (700, 0, 0, 0)), ((0, 1, 0, 0), (0, 600, 0, 0)),
@@ -233,7 +235,7 @@ def cases():
     yield m, f"{MEANS} PerceptualMiddleEnabled=1 m_M_H_L_F=0 PerceptualMiddle=0"
     high = "m_M_H_H_F=0.4 m_M_H_H_F_R=0.6 m_M_H_H_F_G=1.5 m_M_H_H_F_B=1"
     low = "m_M_H_L_F=0.7 m_M_H_L_F_R=0.5 m_M_H_L_F_G=0.6 m_M_H_L_F_B=0.9"
-    for means in (MEANS, BRIGHT, MEAN, "m_OriginalLumaR=90"):
+    for means in (MEANS, BRIGHT, BALANCED, MEAN, "m_OriginalLumaR=90"):
         for flags, v in (((1, 0, 0, 0), (800, 0, 0, 0)), ((1, 1, 1, 1), (600, 900, 700, 650)),
                          ((0, 1, 1, 1), (0, 99, 50, 0)), ((0, 1, 1, 1), (0, 100, 300, 499)),
                          ((1, 0, 0, 1), (200, 900, 900, 1000)), ((1, 1, 1, 1), (500, 500, 500, 500))):
