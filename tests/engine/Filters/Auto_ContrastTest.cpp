@@ -28,7 +28,8 @@ TEST(Auto_Contrast, StaysAwayFromAPictureThatLacksAColour) {
     for (float U::*mean : {&U::m_OriginalLumaR, &U::m_OriginalLumaG, &U::m_OriginalLumaB}) {
         for (const float value : {50.0F, 49.0F}) {
             U params = with({&P::AutoContrast_Enabled});
-            params.m_OriginalLumaR = params.m_OriginalLumaG = params.m_OriginalLumaB = 100;
+            params.m_OriginalLumaR = params.m_OriginalLumaB = 100;
+            params.m_OriginalLumaG = 110;
             params.*mean = value;
             EXPECT_EQ(apply<Auto_Contrast>(params, *uniform(2, 2, {90, 90, 90})), value == 50);
             EXPECT_EQ(params.Bicromic, value == 49);

@@ -41,4 +41,5 @@ TEST(CAuto_Contrast_TEST_II, LimitsGoHalfWay) {
         EXPECT_TRUE(log.has(line)) << line;
     // 255 / 187 * 11 is 15; a double quotient falls just short of it.
     EXPECT_EQ(CAuto_Contrast_TEST_II::stretch(11, {20, 187}, 1), 15);
+    EXPECT_EQ(CAuto_Contrast_TEST_II::stretch(20, {20, 187}, 1), 0);
 }
