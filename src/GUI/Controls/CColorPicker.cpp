@@ -20,6 +20,7 @@ constexpr int kFontPixels = 9;
 constexpr int kSwatchLeft = 2;
 constexpr int kSwatchHeight = 16; // the lower edge lies below the widget
 constexpr int kPopupShift = 17;
+constexpr int kLightGray = 100; // from here on black reads better than white
 
 } // namespace
 
@@ -97,7 +98,7 @@ void CColorPicker::announce() {
 // Black or white, whichever reads better on the colour.
 void CColorPicker::colorLabels() {
     QPalette readable = palette();
-    readable.setColor(QPalette::WindowText, qGray(mColor.rgb()) > 127 ? Qt::black : Qt::white);
+    readable.setColor(QPalette::WindowText, qGray(mColor.rgb()) > kLightGray ? Qt::black : Qt::white);
     for (QLabel* label : mLabels)
         label->setPalette(readable);
 }

@@ -19,6 +19,10 @@ double same(double value) {
     return value;
 }
 
+int mixed(int text, int base) {
+    return (3 * text + 2 * base) / 5;
+}
+
 QString shown(double value) {
     return QString::number(value, 'f', kDecimals);
 }
@@ -34,6 +38,7 @@ COrvelaSliderBlockImpl::COrvelaSliderBlockImpl(QWidget* parent)
     txtValue->installEventFilter(this);
     sldrValue->setStepper([this](double value, double delta) { return stepped(value, delta); });
     fitToFont();
+    fitToPalette();
     setText(lblName->text());
 }
 
@@ -166,6 +171,8 @@ void COrvelaSliderBlockImpl::forwardToSlider(QMouseEvent* event) {
 void COrvelaSliderBlockImpl::changeEvent(QEvent* event) {
     if (event->type() == QEvent::FontChange)
         fitToFont();
+    if (event->type() == QEvent::PaletteChange)
+        fitToPalette();
     QWidget::changeEvent(event);
 }
 
@@ -174,4 +181,15 @@ void COrvelaSliderBlockImpl::fitToFont() {
     const QFontMetrics metrics = fontMetrics();
     lblName->setMinimumWidth(metrics.horizontalAdvance(QStringLiteral("Digital Flash ")));
     txtValue->setFixedWidth(metrics.horizontalAdvance(QStringLiteral("10000.00")) + 8);
+}
+
+// The number of a setting that is off stays readable: styles draw it fainter than that.
+void COrvelaSliderBlockImpl::fitToPalette() {
+    const QColor text = palette().color(QPalette::Active, QPalette::Text);
+    const QColor base = palette().color(QPalette::Active, QPalette::Base);
+    QPalette faint;
+    faint.setColor(QPalette::Disabled, QPalette::Text,
+                   QColor(mixed(text.red(), base.red()), mixed(text.green(), base.green()),
+                          mixed(text.blue(), base.blue())));
+    txtValue->setPalette(faint);
 }

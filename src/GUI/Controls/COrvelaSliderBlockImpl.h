@@ -64,6 +64,7 @@ private:
     double stepped(double position, double delta) const;
     void forwardToSlider(QMouseEvent* event);
     void fitToFont();
+    void fitToPalette();
 
     SliderScale mScale;
     CDoubleValidator_FixUp* mValidator;

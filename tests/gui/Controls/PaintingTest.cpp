@@ -1,0 +1,136 @@
+#include "GUI/Controls/COrvelaStatusIndicator.h"
+#include "GUI/Controls/CThinHorizontalSlider.h"
+#include "GUI/Windows/MessageBoxes.h"
+#include "Utility/DebugBoxes.h"
+#include "Utility/Logger.h"
+
+#include <QAbstractButton>
+#include <QAccessible>
+#include <QApplication>
+#include <QMessageBox>
+#include <QTimer>
+
+#include <gtest/gtest.h>
+
+#include <cmath>
+
+namespace {
+
+const QColor kGreen(0, 255, 40);
+const QColor kOrange(255, 120, 0);
+
+QImage painted(QWidget& widget, double scale = 1) {
+    QImage image((QSizeF(widget.size()) * scale).toSize(), QImage::Format_RGB32);
+    image.setDevicePixelRatio(scale);
+    widget.render(&image);
+    return image;
+}
+
+class LinesLogger : public ILogger {
+public:
+    explicit LinesLogger(QByteArrayList& lines) : mLines(lines) {}
+    void write(const QByteArray& line) override { mLines.append(line); }
+
+private:
+    QByteArrayList& mLines;
+};
+
+TEST(ZoneColor, KeepsBandsAndMixesBetweenTheirEdges) {
+    const QList<ZoneStop> stops = {{100, kGreen}, {599, kGreen}, {600, kOrange}, {1000, QColor(0, 0, 0)}};
+    EXPECT_EQ(zoneColor(stops, 0), kGreen);
+    EXPECT_EQ(zoneColor(stops, 599), kGreen);
+    EXPECT_EQ(zoneColor(stops, 599.5), QColor(128, 188, 20)); // halves round up
+    EXPECT_EQ(zoneColor(stops, 600), kOrange);
+    EXPECT_EQ(zoneColor(stops, 700), QColor(191, 90, 0));
+    EXPECT_EQ(zoneColor(stops, 50000), QColor(0, 0, 0));
+}
+
+TEST(CThinHorizontalSlider, FillsUpToTheValueInTheColorOfItsZone) {
+    CThinHorizontalSlider slider;
+    slider.resize(101, 7);
+    slider.setZoneStops({{0, kGreen}, {599, kGreen}, {600, kOrange}, {1000, kOrange}});
+    for (double scale : {1.0, 1.5, 2.0}) {
+        const auto at = [&](double x) {
+            return painted(slider, scale).pixelColor(int(x * scale), int(3.4 * scale));
+        };
+        slider.setValue(500);
+        EXPECT_EQ(at(30), kGreen);
+        EXPECT_NE(at(70), kGreen) << "beyond the value";
+        slider.setValue(800);
+        EXPECT_EQ(at(30), kOrange);
+        EXPECT_EQ(at(70), kOrange);
+        slider.setEnabled(false);
+        EXPECT_EQ(at(34), QColor(110, 110, 110)) << "struck through";
+        EXPECT_EQ(painted(slider, scale).pixelColor(int(34 * scale), int(4.8 * scale)),
+                  QColor(200, 200, 200));
+        slider.setEnabled(true);
+    }
+    for (double beyond : {-500.0, 5000.0, double(INFINITY)}) {
+        slider.setValue(beyond);
+        EXPECT_EQ(painted(slider).pixelColor(50, 3) == kOrange, beyond > 0);
+    }
+}
+
+TEST(CThinHorizontalSlider, WarnsOnceAndGoesGreyWithoutZones) {
+    QByteArrayList lines;
+    Log::install(std::make_unique<LinesLogger>(lines));
+    CThinHorizontalSlider slider;
+    slider.resize(101, 7);
+    slider.setZoneStops({{0, kGreen}});
+    slider.setValue(500);
+    EXPECT_EQ(painted(slider).pixelColor(30, 3), QColor(122, 122, 122));
+    painted(slider);
+    Log::install(nullptr);
+    EXPECT_EQ(lines, QByteArrayList{
+                         "This slider is using loadDefaultColors, this is probably a programming error."});
+    EXPECT_EQ(slider.zoneStops(), (QList<ZoneStop>{{0, QColor(0, 0, 0)}, {1000, QColor(244, 244, 244)}}));
+}
+
+TEST(COrvelaStatusIndicator, BarsFollowStepAndPercentage) {
+    const QColor percent(100, 240, 40);
+    COrvelaStatusIndicator indicator;
+    indicator.resize(201, 40);
+    EXPECT_EQ(indicator.height(), 18);
+    const QColor empty = painted(indicator).pixelColor(10, 2);
+    indicator.setStep(1, 4, QStringLiteral("Noise"));
+    indicator.setPercentage(20);
+    for (double scale : {1.0, 1.5, 2.0}) {
+        const QImage image = painted(indicator, scale);
+        int steps = 0;
+        int percents = 0;
+        for (int x = 0; x < image.width(); ++x) {
+            steps += image.pixelColor(x, int(2 * scale)).blue() > 230;
+            percents += image.pixelColor(x, int(15 * scale)) == percent;
+        }
+        EXPECT_EQ(steps, std::lround(50 * scale)) << scale;
+        EXPECT_EQ(percents, std::lround(40.2 * scale)) << scale;
+    }
+    indicator.setStep(9, 4);
+    EXPECT_EQ(indicator.stepName(), QStringLiteral("Noise"));
+    EXPECT_NE(painted(indicator).pixelColor(199, 2), empty);
+    EXPECT_EQ(painted(indicator).pixelColor(200, 2), empty) << "at most the width less one";
+    indicator.setStep(1, 0);
+    EXPECT_EQ(painted(indicator).pixelColor(10, 2), empty);
+    QAccessibleInterface* access = QAccessible::queryAccessibleInterface(&indicator);
+    EXPECT_EQ(access->role(), QAccessible::ProgressBar);
+    EXPECT_EQ(access->valueInterface()->currentValue().toInt(), 20);
+    EXPECT_EQ(access->text(QAccessible::Description), QStringLiteral("Noise"));
+}
+
+TEST(MessageBoxes, ShowTheEnginesWarnings) {
+    installMessageBoxes();
+    QString shown;
+    QTimer::singleShot(0, [&shown] {
+        auto* box = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
+        ASSERT_TRUE(box);
+        shown = box->windowTitle() + QLatin1Char('|') + box->text();
+        box->button(QMessageBox::No)->click();
+    });
+    EXPECT_EQ(DebugBoxes::warningBox(nullptr, QStringLiteral("Note:"), QStringLiteral("text"),
+                                     QMessageBox::Yes | QMessageBox::No, QMessageBox::Yes),
+              QMessageBox::No);
+    DebugBoxes::setPresenter(nullptr);
+    EXPECT_EQ(shown, QStringLiteral("Note:|text"));
+}
+
+} // namespace

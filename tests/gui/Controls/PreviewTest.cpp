@@ -1,0 +1,114 @@
+#include "GUI/Controls/CGridCell.h"
+#include "GUI/Controls/CSignaledGraphicsView.h"
+#include "GUI/Controls/PreviewScene.h"
+
+#include <QGraphicsScene>
+#include <QPainter>
+#include <QResizeEvent>
+#include <QScrollBar>
+#include <QSignalSpy>
+#include <QTest>
+
+#include <gtest/gtest.h>
+
+namespace {
+
+/// A plane whose samples tell their place: red 10 x, green 10 y, blue x + y.
+void fillByPlace(CARGBPlane& plane) {
+    plane.setColorMode(CARGBPlane::Color);
+    for (int y = 0; y < plane.height(); ++y) {
+        for (int x = 0; x < plane.width(); ++x) {
+            plane.row(y)[0][x] = static_cast<std::uint8_t>(10 * x);
+            plane.row(y)[1][x] = static_cast<std::uint8_t>(10 * y);
+            plane.row(y)[2][x] = static_cast<std::uint8_t>(x + y);
+        }
+    }
+}
+
+QImage rendered(QGraphicsScene& scene) {
+    QImage image(scene.sceneRect().size().toSize(), QImage::Format_RGB32);
+    image.fill(Qt::magenta);
+    QPainter painter(&image);
+    scene.render(&painter);
+    return image;
+}
+
+QString cellsOf(const QGraphicsScene& scene) {
+    QStringList cells;
+    for (const QGraphicsItem* item : scene.items(Qt::AscendingOrder)) {
+        const QRectF at = item->sceneBoundingRect();
+        cells += QStringLiteral("%1:%2,%3,%4x%5")
+                     .arg(item->zValue())
+                     .arg(at.x())
+                     .arg(at.y())
+                     .arg(at.width())
+                     .arg(at.height());
+    }
+    return cells.join(QLatin1Char(' '));
+}
+
+TEST(PreviewScene, TilesThePlaneAndShowsEveryPixel) {
+    CARGBPlane plane(7, 5, QStringLiteral("plane"));
+    fillByPlace(plane);
+    QGraphicsScene scene;
+    scene.addRect(0, 0, 900, 900);
+    PreviewScene::show(scene, plane, {4, 3});
+    EXPECT_EQ(scene.sceneRect(), QRectF(0, 0, 7, 5));
+    EXPECT_EQ(cellsOf(scene).toStdString(), "1:0,0,4x3 1:4,0,3x3 1:0,3,4x2 1:4,3,3x2");
+    const QImage image = rendered(scene);
+    for (int y = 0; y < 5; ++y)
+        for (int x = 0; x < 7; ++x)
+            ASSERT_EQ(image.pixel(x, y), qRgb(10 * x, 10 * y, x + y)) << x << "," << y;
+}
+
+TEST(PreviewScene, OneCellReadsThePlaneWhenFirstPainted) {
+    CARGBPlane plane(3, 2, QStringLiteral("plane"));
+    fillByPlace(plane);
+    plane.setColorMode(CARGBPlane::Grayscale);
+    QGraphicsScene scene;
+    PreviewScene::show(scene, plane);
+    EXPECT_EQ(cellsOf(scene).toStdString(), "1:0,0,3x2");
+    plane.row(1)[0][2] = 77;
+    EXPECT_EQ(rendered(scene).pixel(2, 1), qRgb(77, 77, 77));
+    plane.row(1)[0][2] = 1;
+    EXPECT_EQ(rendered(scene).pixel(2, 1), qRgb(77, 77, 77)) << "kept until shown anew";
+    const CARGBPlane empty(0, 0, QStringLiteral("empty"));
+    PreviewScene::show(scene, empty);
+    EXPECT_TRUE(scene.items().isEmpty());
+}
+
+TEST(PreviewScene, OutlinesTilesWhenTheEnvironmentAsksForIt) {
+    CARGBPlane plane(20, 10, QStringLiteral("plane"));
+    fillByPlace(plane);
+    QGraphicsScene scene;
+    qputenv("ORVELA_SHOW_GRID", "");
+    PreviewScene::show(scene, plane);
+    qunsetenv("ORVELA_SHOW_GRID");
+    EXPECT_EQ(cellsOf(scene).toStdString(), "1:0,0,20x10 2:0,0,20x10");
+    EXPECT_EQ(rendered(scene).pixelColor(0, 5), QColor(0, 255, 0));
+    EXPECT_EQ(rendered(scene).pixelColor(10, 5), QColor(100, 50, 15));
+}
+
+TEST(CSignaledGraphicsView, TellsWhereItWasDraggedToAndItsSize) {
+    QGraphicsScene scene(0, 0, 1000, 800);
+    CSignaledGraphicsView view(&scene);
+    view.setDragMode(QGraphicsView::ScrollHandDrag);
+    QSignalSpy resized(&view, &CSignaledGraphicsView::sizeChanged);
+    view.setGeometry(30, 40, 200, 150);
+    view.show();
+    ASSERT_TRUE(QTest::qWaitForWindowExposed(&view));
+    ASSERT_FALSE(resized.isEmpty());
+    EXPECT_EQ(resized.last()[0].toRect(), view.geometry());
+    view.setTransform(QTransform::fromScale(2, 2)); // gives the scroll bars their ranges
+    view.horizontalScrollBar()->setValue(300);
+    view.verticalScrollBar()->setValue(400);
+    QSignalSpy scrolled(&view, &CSignaledGraphicsView::scrolledBy);
+    QTest::mousePress(view.viewport(), Qt::LeftButton, {}, QPoint(100, 100));
+    QMouseEvent move(QEvent::MouseMove, QPointF(90, 75), view.viewport()->mapToGlobal(QPointF(90, 75)),
+                     Qt::NoButton, Qt::LeftButton, {});
+    QCoreApplication::sendEvent(view.viewport(), &move);
+    ASSERT_EQ(scrolled.count(), 1);
+    EXPECT_EQ(scrolled[0], (QList<QVariant>{310, 425}));
+}
+
+} // namespace

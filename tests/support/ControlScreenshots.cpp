@@ -1,0 +1,185 @@
+// Writes pictures of every control to a folder: control_screenshots FOLDER SUFFIX [dark]. The scale is that
+// of the environment variable QT_SCALE_FACTOR; the suffix tells the variants apart.
+
+#include "GUI/Controls/Artwork.h"
+#include "GUI/Controls/CColorPicker.h"
+#include "GUI/Controls/CColorPickerPopup.h"
+#include "GUI/Controls/COrvelaSliderBlockImpl.h"
+#include "GUI/Controls/COrvelaStatusIndicator.h"
+#include "GUI/Controls/CSignaledGraphicsView.h"
+#include "GUI/Controls/PreviewScene.h"
+#include "Utility/CARGBPlane.h"
+
+#include <QApplication>
+#include <QDirIterator>
+#include <QGraphicsScene>
+#include <QGridLayout>
+#include <QLabel>
+#include <QToolButton>
+
+#include <cstdio>
+#include <memory>
+
+namespace {
+
+using Widget = std::unique_ptr<QWidget>;
+
+QPalette darkPalette() {
+    QPalette dark(QColor(53, 53, 53));
+    dark.setColor(QPalette::Base, QColor(35, 35, 35));
+    dark.setColor(QPalette::Highlight, QColor(42, 130, 218));
+    for (auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText})
+        dark.setColor(QPalette::Disabled, role, QColor(140, 140, 140));
+    return dark;
+}
+
+COrvelaSliderBlockImpl* addBlock(QWidget* parent, const char* name, const SliderScale& scale, double position,
+                                 bool on) {
+    auto* block = new COrvelaSliderBlockImpl(parent);
+    block->setText(QString::fromUtf8(name));
+    block->setScale(scale);
+    block->setZoneStops({{0, QColor(0, 255, 40)},
+                         {599, QColor(0, 255, 40)},
+                         {600, QColor(255, 120, 0)},
+                         {899, QColor(255, 120, 0)},
+                         {900, QColor(255, 40, 0)},
+                         {1000, QColor(255, 40, 0)}});
+    block->setValue(position);
+    block->setEnabled(on);
+    parent->layout()->addWidget(block);
+    return block;
+}
+
+Widget sliderBlocks() {
+    auto frame = std::make_unique<QWidget>();
+    new QVBoxLayout(frame.get());
+    QWidget* parent = frame.get();
+    addBlock(parent, "Contrast", SliderScales::Tenth, 0, true);
+    addBlock(parent, "Digital Flash", SliderScales::Tenth, 350, true);
+    addBlock(parent, "Sharpness II", SliderScales::Sharpness, 750, true);
+    addBlock(parent, "Temperature", SliderScales::Temperature, 1000, true);
+    addBlock(parent, "Highlights", SliderScales::Highlights, 500, false);
+    addBlock(parent, "B&W Spots", SliderScales::Spots, 0, false);
+    addBlock(parent, "With focus", SliderScales::Brightness, 400, true)->sldrValue->setFocus();
+    frame->resize(320, frame->sizeHint().height());
+    return frame;
+}
+
+Widget colorPickers() {
+    auto frame = std::make_unique<QWidget>();
+    auto* layout = new QVBoxLayout(frame.get());
+    for (const QColor& color :
+         {QColor(255, 255, 255), QColor(0, 255, 0), QColor(10, 20, 90), QColor(200, 128, 0)}) {
+        auto* picker = new CColorPicker(frame.get());
+        picker->setColor(color);
+        layout->addWidget(picker);
+    }
+    return frame;
+}
+
+Widget statusIndicators() {
+    auto frame = std::make_unique<QWidget>();
+    auto* layout = new QVBoxLayout(frame.get());
+    for (int step : {0, 1, 3, 4}) {
+        auto* indicator = new COrvelaStatusIndicator(frame.get());
+        indicator->setStep(step, 4);
+        indicator->setPercentage(step * 30);
+        layout->addWidget(indicator);
+    }
+    frame->resize(320, frame->sizeHint().height());
+    return frame;
+}
+
+Widget preview(const CARGBPlane& plane) {
+    auto view = std::make_unique<CSignaledGraphicsView>();
+    auto* scene = new QGraphicsScene(view.get());
+    PreviewScene::show(*scene, plane);
+    view->setScene(scene);
+    view->setBackgroundBrush(Qt::black);
+    view->resize(260, 180);
+    return view;
+}
+
+Widget icons() {
+    auto frame = std::make_unique<QWidget>();
+    auto* layout = new QGridLayout(frame.get());
+    QStringList paths;
+    QDirIterator found(QStringLiteral(":/"), {QStringLiteral("*.png")}, QDir::Files,
+                       QDirIterator::Subdirectories);
+    while (found.hasNext())
+        paths.append(found.next());
+    const auto isNoIcon = [](const QString& path) { // the toolkit's own, or too large
+        return path.contains(QLatin1Char('@')) || path.startsWith(QLatin1String(":/qt-project.org")) ||
+               QImage(path).width() > 24;
+    };
+    paths.removeIf(isNoIcon);
+    paths.sort();
+    for (int index = 0; index < paths.size(); ++index) {
+        auto* button = new QToolButton(frame.get());
+        button->setIcon(QIcon(paths[index]));
+        button->setIconSize(QImage(paths[index]).size());
+        button->setEnabled(index < paths.size() - 2); // the last two show what disabled looks like
+        layout->addWidget(button, index / 10, index % 10);
+    }
+    return frame;
+}
+
+Widget logo() {
+    auto label = std::make_unique<QLabel>();
+    label->setPixmap(QPixmap(QStringLiteral(":/Logo_EyeBig.png")));
+    return label;
+}
+
+bool save(QWidget& widget, const QString& path) {
+    widget.show();
+    widget.activateWindow();
+    QCoreApplication::processEvents();
+    const bool saved = widget.grab().save(path);
+    if (!saved)
+        std::fprintf(stderr, "control_screenshots: cannot write %s\n", qPrintable(path));
+    return saved;
+}
+
+// Hues along the columns, darker towards the foot.
+void fill(CARGBPlane& plane) {
+    plane.setColorMode(CARGBPlane::Color);
+    for (int y = 0; y < plane.height(); ++y) {
+        for (int x = 0; x < plane.width(); ++x) {
+            const QColor color =
+                QColor::fromHsv(x * 359 / plane.width(), 160, 255 - y * 200 / plane.height());
+            plane.row(y)[0][x] = static_cast<std::uint8_t>(color.red());
+            plane.row(y)[1][x] = static_cast<std::uint8_t>(color.green());
+            plane.row(y)[2][x] = static_cast<std::uint8_t>(color.blue());
+        }
+    }
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+    QApplication application(argc, argv);
+    const QStringList arguments = QCoreApplication::arguments();
+    if (arguments.size() < 3) {
+        std::fputs("usage: control_screenshots FOLDER SUFFIX [dark]\n", stderr);
+        return 2;
+    }
+    if (arguments.value(3) == QLatin1String("dark"))
+        QApplication::setPalette(darkPalette());
+    QApplication::setStyle(QStringLiteral("Fusion"));
+    initArtwork();
+    CARGBPlane plane(240, 160, QStringLiteral("preview"));
+    fill(plane);
+    std::pair<const char*, Widget> shots[] = {
+        {"slider-blocks", sliderBlocks()},
+        {"color-pickers", colorPickers()},
+        {"color-field", std::make_unique<CColorPickerPopup>()},
+        {"status-indicators", statusIndicators()},
+        {"preview", preview(plane)},
+        {"icons", icons()},
+        {"logo", logo()},
+    };
+    bool saved = true;
+    for (auto& [name, widget] : shots)
+        saved = save(*widget, QStringLiteral("%1/%2-%3.png").arg(arguments[1], name, arguments[2])) && saved;
+    return saved ? 0 : 1;
+}
