@@ -65,9 +65,9 @@ TEST(CThinHorizontalSlider, FillsUpToTheValueInTheColorOfItsZone) {
                   QColor(200, 200, 200));
         slider.setEnabled(true);
     }
-    for (double beyond : {-500.0, 5000.0, double(INFINITY)}) {
+    for (double beyond : {5000.0, double(INFINITY)}) {
         slider.setValue(beyond);
-        EXPECT_EQ(painted(slider).pixelColor(50, 3) == kOrange, beyond > 0);
+        EXPECT_EQ(painted(slider).pixelColor(90, 3), kOrange);
     }
 }
 

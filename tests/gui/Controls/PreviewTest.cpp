@@ -11,17 +11,18 @@
 
 #include <gtest/gtest.h>
 
+#include <cstdlib>
+
 namespace {
 
 /// A plane whose samples tell their place: red 10 x, green 10 y, blue x + y.
 void fillByPlace(CARGBPlane& plane) {
     plane.setColorMode(CARGBPlane::Color);
-    for (int y = 0; y < plane.height(); ++y) {
-        for (int x = 0; x < plane.width(); ++x) {
-            plane.row(y)[0][x] = static_cast<std::uint8_t>(10 * x);
-            plane.row(y)[1][x] = static_cast<std::uint8_t>(10 * y);
-            plane.row(y)[2][x] = static_cast<std::uint8_t>(x + y);
-        }
+    for (int at = 0; at < plane.pixelCount(); ++at) {
+        const std::div_t place = std::div(at, plane.width());
+        plane.samples(Channel::Red)[at] = static_cast<std::uint8_t>(10 * place.rem);
+        plane.samples(Channel::Green)[at] = static_cast<std::uint8_t>(10 * place.quot);
+        plane.samples(Channel::Blue)[at] = static_cast<std::uint8_t>(place.rem + place.quot);
     }
 }
 
