@@ -18,6 +18,12 @@ public:
     using PhotographError::PhotographError;
 };
 
+/// Reading or writing ended early because it was asked to stop; nothing was left behind.
+class StoppedError : public PhotographError {
+public:
+    using PhotographError::PhotographError;
+};
+
 enum class ColorModel { Grey, GreyAlpha, Rgb, RgbAlpha, Cmyk };
 
 /// Number of samples per pixel.
@@ -42,12 +48,14 @@ struct Encoding {
     int quality = 0;              ///< JPEG, WebP and HEIF quality 1 to 100; 0 when unknown
     bool chromaSubsampled = true; ///< JPEG chroma at half resolution
     bool lossless = false;        ///< WebP without loss
-    std::string compression;      ///< TIFF compression by its library name, such as "lzw"
+    std::string compression;      ///< by its library name: TIFF "lzw" and others, HEIF "hevc" or "av1"
     bool progressive = false;     ///< interlaced or progressive
+    int bitDepth = 0;             ///< HEIF: bits per sample in the file (8, 10 or 12); 0 when unknown
 };
 
 /// A photograph in memory: interleaved samples, rows from the top without padding, 8 bits or native 16 bits
-/// each. CMYK samples are raw ink values as the file holds them.
+/// each. CMYK samples are raw ink values, 0 without ink; where a format stores them inverted, the inversion
+/// is undone on reading and done again on writing.
 struct Photograph {
     int width = 0;
     int height = 0;
@@ -55,6 +63,10 @@ struct Photograph {
     ColorModel model = ColorModel::Rgb;
     std::vector<std::uint8_t> samples;    ///< width * height * samplesPerPixel(model) * depth / 8 bytes
     std::vector<std::uint8_t> iccProfile; ///< empty when there is none
+    double xResolution = 0;               ///< pixels per millimetre; 0 when the file gives none
+    double yResolution = 0;               ///< pixels per millimetre; 0 when the file gives none
+    std::string resolutionUnit;           ///< unit in which the file gives them: "in", "cm" or empty
+    int pages = 1;                        ///< pages or animation frames of the file; only the first is held
     Encoding encoding;
     std::filesystem::path source; ///< the file it was read from; its metadata is copied from there on writing
 };

@@ -1,0 +1,135 @@
+#include "common/FileFormat.h"
+
+#include <algorithm>
+#include <array>
+#include <cctype>
+#include <string_view>
+
+namespace {
+
+struct Extension {
+    std::string_view text;
+    FileFormat format;
+};
+
+// The first extension of a format is the one it is given where the source's own does not fit.
+constexpr std::array kExtensions = {
+    Extension{".jpg", FileFormat::Jpeg},  Extension{".jpeg", FileFormat::Jpeg},
+    Extension{".jpe", FileFormat::Jpeg},  Extension{".png", FileFormat::Png},
+    Extension{".tif", FileFormat::Tiff},  Extension{".tiff", FileFormat::Tiff},
+    Extension{".webp", FileFormat::WebP}, Extension{".psd", FileFormat::Psd},
+    Extension{".heic", FileFormat::Heif}, Extension{".heif", FileFormat::Heif},
+    Extension{".avif", FileFormat::Heif}, Extension{".hif", FileFormat::Heif},
+};
+
+bool holds(ByteView file, std::size_t at, std::string_view text) {
+    return file.size() >= at + text.size() &&
+           std::equal(text.begin(), text.end(), file.begin() + static_cast<std::ptrdiff_t>(at),
+                      [](char a, std::uint8_t b) { return static_cast<std::uint8_t>(a) == b; });
+}
+
+bool isHeif(ByteView file) {
+    constexpr std::array<std::string_view, 10> brands = {"heic", "heix", "heim", "heis", "hevc",
+                                                         "hevx", "mif1", "msf1", "avif", "avis"};
+    return holds(file, 4, "ftyp") &&
+           std::any_of(brands.begin(), brands.end(), [&](auto brand) { return holds(file, 8, brand); });
+}
+
+bool hasAlpha(ColorModel model) {
+    return model == ColorModel::GreyAlpha || model == ColorModel::RgbAlpha;
+}
+
+bool isRgb(ColorModel model) {
+    return model == ColorModel::Rgb || model == ColorModel::RgbAlpha;
+}
+
+std::string cannotHold(FileFormat format, const std::string& what, const char* instead) {
+    return std::string(formatName(format)) + " cannot hold " + what + "; choose " + instead;
+}
+
+} // namespace
+
+std::optional<FileFormat> formatOfContent(ByteView file) {
+    using namespace std::string_view_literals;
+    if (holds(file, 0, "\xFF\xD8\xFF"sv))
+        return FileFormat::Jpeg;
+    if (holds(file, 0, "\x89PNG\r\n\x1A\n"sv))
+        return FileFormat::Png;
+    if (holds(file, 0, "II*\0"sv) || holds(file, 0, "MM\0*"sv) || holds(file, 0, "II+\0"sv) ||
+        holds(file, 0, "MM\0+"sv))
+        return FileFormat::Tiff;
+    if (holds(file, 0, "RIFF"sv) && holds(file, 8, "WEBP"sv))
+        return FileFormat::WebP;
+    if (holds(file, 0, "8BPS"sv))
+        return FileFormat::Psd;
+    if (isHeif(file))
+        return FileFormat::Heif;
+    return std::nullopt;
+}
+
+std::optional<FileFormat> formatOfExtension(const std::filesystem::path& path) {
+    std::string text = path.extension().string();
+    std::transform(text.begin(), text.end(), text.begin(),
+                   [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
+    for (const Extension& extension : kExtensions)
+        if (extension.text == text)
+            return extension.format;
+    return std::nullopt;
+}
+
+const char* formatName(FileFormat format) {
+    constexpr std::array names = {"JPEG", "PNG", "TIFF", "WebP", "PSD", "HEIF"};
+    return names[static_cast<std::size_t>(format)];
+}
+
+std::string pixelName(ColorModel model, int depth) {
+    constexpr std::array names = {"grey", "grey with transparency", "RGB", "RGB with transparency", "CMYK"};
+    return std::to_string(depth) + "-bit " + names[static_cast<std::size_t>(model)];
+}
+
+std::string formatObstacle(FileFormat format, const Photograph& photograph) {
+    const ColorModel model = photograph.model;
+    const bool deep = photograph.depth == 16;
+    const int largest = std::max(photograph.width, photograph.height);
+    const std::string pixels = pixelName(model, photograph.depth) + " pictures";
+    switch (format) {
+    case FileFormat::Jpeg:
+        if (deep || hasAlpha(model))
+            return cannotHold(format, pixels, "a PNG or TIFF target");
+        break;
+    case FileFormat::Png:
+        if (model == ColorModel::Cmyk)
+            return cannotHold(format, pixels, "a TIFF target");
+        break;
+    case FileFormat::Tiff:
+        break;
+    case FileFormat::WebP:
+        if (deep || !isRgb(model))
+            return cannotHold(format, pixels, model == ColorModel::Cmyk ? "a TIFF target" : "a PNG target");
+        if (largest > 16383)
+            return cannotHold(format, "edges over 16383 pixels", "a PNG or TIFF target");
+        break;
+    case FileFormat::Psd:
+        return "PSD files can be read but not written; choose a TIFF target";
+    case FileFormat::Heif:
+        if (!isRgb(model) || (deep && photograph.encoding.bitDepth <= 8))
+            return cannotHold(format, pixels, model == ColorModel::Cmyk ? "a TIFF target" : "a PNG target");
+        break;
+    }
+    return {};
+}
+
+std::filesystem::path defaultTarget(const std::filesystem::path& source, FileFormat format) {
+    const FileFormat written = format == FileFormat::Psd ? FileFormat::Tiff : format;
+    std::filesystem::path extension = source.extension();
+    if (formatOfExtension(source) != written)
+        for (const Extension& candidate : kExtensions)
+            if (candidate.format == written) {
+                extension = candidate.text;
+                break;
+            }
+    std::filesystem::path name = source.stem();
+    name += "-enhanced";
+    name += extension;
+    return source.parent_path() / name;
+}

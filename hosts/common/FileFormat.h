@@ -1,0 +1,31 @@
+#pragma once
+
+#include "common/Photograph.h"
+
+#include <optional>
+#include <span>
+#include <string>
+
+/// Bytes of a file in memory.
+using Bytes = std::vector<std::uint8_t>;
+using ByteView = std::span<const std::uint8_t>;
+
+/// The format that the first bytes of a file show, whatever its name says; none for other kinds of files.
+std::optional<FileFormat> formatOfContent(ByteView file);
+
+/// The format that a file name asks for by its extension, in any case; none for other extensions.
+std::optional<FileFormat> formatOfExtension(const std::filesystem::path& path);
+
+/// "JPEG", "PNG", ...
+const char* formatName(FileFormat format);
+
+/// "8-bit CMYK" and the like, for messages.
+std::string pixelName(ColorModel model, int depth);
+
+/// Why a file of this format cannot hold the picture, with what to do instead; empty when it can. A deep HEIF
+/// target is possible only for a HEIF source, whose 10 or 12 bits it takes.
+std::string formatObstacle(FileFormat format, const Photograph& photograph);
+
+/// Where the result of `source` goes when nothing else is said: NAME-enhanced.EXT beside it, with the
+/// source's extension if that fits its format, and .tif for a PSD, which is read but not written.
+std::filesystem::path defaultTarget(const std::filesystem::path& source, FileFormat format);

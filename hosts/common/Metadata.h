@@ -1,0 +1,24 @@
+#pragma once
+
+#include "common/FileFormat.h"
+
+#include <string>
+#include <vector>
+
+/// Exif (behind "Exif\0\0") and XMP of a photograph's source, for a format whose encoder embeds them.
+struct MetadataBlocks {
+    Bytes exif;
+    Bytes xmp;
+};
+
+/// Reads both from the photograph's source; empty where it has none or cannot be read.
+MetadataBlocks metadataBlocks(const Photograph& photograph);
+
+/// Gives an encoded picture the Exif (with MakerNote), XMP, IPTC and comment of the photograph's source, and
+/// reads them back. Tags that describe how the samples are stored stay those of the encoded picture, further
+/// pages of a TIFF are not carried over, and the dimensions are the picture's. XMP goes over as it stands,
+/// well-formed or not. The orientation is kept, except that it is upright for a HEIF source, whose decoding
+/// turns the pixels.
+/// @param encoded  changed in place; left as it is when nothing can be added
+/// @return one warning for each kind of metadata that is damaged or did not arrive
+std::vector<std::string> copyMetadata(const Photograph& photograph, FileFormat target, Bytes& encoded);

@@ -1,0 +1,165 @@
+#include "common/PhotographEncoder.h"
+
+#include "common/Metadata.h"
+#include "common/Vips.h"
+
+namespace {
+
+namespace fs = std::filesystem;
+
+constexpr std::size_t kClassicTiffLimit = 4'000'000'000;
+
+struct GFree {
+    void operator()(void* data) const { g_free(data); }
+};
+
+VipsInterpretation interpretationOf(const Photograph& photograph) {
+    const bool deep = photograph.depth == 16;
+    switch (photograph.model) {
+    case ColorModel::Grey:
+    case ColorModel::GreyAlpha:
+        return deep ? VIPS_INTERPRETATION_GREY16 : VIPS_INTERPRETATION_B_W;
+    case ColorModel::Cmyk:
+        return VIPS_INTERPRETATION_CMYK;
+    default:
+        return deep ? VIPS_INTERPRETATION_RGB16 : VIPS_INTERPRETATION_sRGB;
+    }
+}
+
+void attach(VipsImage* image, const char* field, const Bytes& bytes) {
+    if (!bytes.empty())
+        vips_image_set_blob_copy(image, field, bytes.data(), bytes.size());
+}
+
+VipsHandle imageOf(const Photograph& photograph, FileFormat format) {
+    const VipsHandle plain(vips_image_new_from_memory(
+        photograph.samples.data(), photograph.samples.size(), photograph.width, photograph.height,
+        samplesPerPixel(photograph.model), photograph.depth == 16 ? VIPS_FORMAT_USHORT : VIPS_FORMAT_UCHAR));
+    VipsImage* image = nullptr;
+    if (plain)
+        vips_copy(plain.get(), &image, "interpretation", interpretationOf(photograph), nullptr);
+    if (image == nullptr)
+        throw PhotographError("the picture cannot be encoded (" + takeVipsError() + "); report this");
+    if (photograph.xResolution > 0) {
+        image->Xres = photograph.xResolution;
+        image->Yres = photograph.yResolution;
+        vips_image_set_string(image, VIPS_META_RESOLUTION_UNIT, photograph.resolutionUnit.c_str());
+    }
+    attach(image, VIPS_META_ICC_NAME, photograph.iccProfile);
+    if (format == FileFormat::Heif) {
+        const MetadataBlocks blocks = metadataBlocks(photograph);
+        attach(image, VIPS_META_EXIF_NAME, blocks.exif);
+        attach(image, VIPS_META_XMP_NAME, blocks.xmp);
+    }
+    return VipsHandle(image);
+}
+
+// The source's settings where it has the target's format, the given ones before all.
+Encoding settingsFor(const Photograph& photograph, FileFormat format, const fs::path& target,
+                     const WriteOptions& options) {
+    Encoding settings;
+    settings.chromaSubsampled = false;
+    if (photograph.encoding.format == format)
+        settings = photograph.encoding;
+    if (options.quality > 0)
+        settings.quality = options.quality;
+    if (settings.quality == 0)
+        settings.quality = format == FileFormat::WebP || format == FileFormat::Heif ? 90 : 92;
+    settings.chromaSubsampled = options.chromaSubsampled.value_or(settings.chromaSubsampled);
+    settings.lossless = options.lossless.value_or(settings.lossless);
+    settings.progressive = options.progressive.value_or(settings.progressive);
+    if (!options.compression.empty())
+        settings.compression = options.compression;
+    if (format == FileFormat::Heif)
+        settings.compression = target.extension() == ".avif"   ? "av1"
+                               : settings.compression == "av1" ? "av1"
+                                                               : "hevc";
+    else if (settings.compression.empty())
+        settings.compression = "lzw";
+    return settings;
+}
+
+int saveTiff(VipsImage* image, const Photograph& photograph, const Encoding& settings, void** data,
+             std::size_t* size) {
+    const int compression =
+        vips_enum_from_nick("orvela", VIPS_TYPE_FOREIGN_TIFF_COMPRESSION, settings.compression.c_str());
+    if (compression < 0)
+        return -1;
+    const bool plain = photograph.model == ColorModel::Grey || photograph.model == ColorModel::Rgb;
+    if (compression == VIPS_FOREIGN_TIFF_COMPRESSION_JPEG && (photograph.depth != 8 || !plain)) {
+        vips_error("tiff", "JPEG compression takes 8-bit grey or RGB only");
+        return -1;
+    }
+    return vips_tiffsave_buffer(image, data, size, "compression", compression, "Q", settings.quality,
+                                "bigtiff", photograph.samples.size() > kClassicTiffLimit, nullptr);
+}
+
+int save(VipsImage* image, const Photograph& photograph, FileFormat format, const Encoding& settings,
+         void** data, std::size_t* size) {
+    const VipsForeignSubsample chroma =
+        settings.chromaSubsampled ? VIPS_FOREIGN_SUBSAMPLE_ON : VIPS_FOREIGN_SUBSAMPLE_OFF;
+    switch (format) {
+    case FileFormat::Jpeg:
+        return vips_jpegsave_buffer(image, data, size, "Q", settings.quality, "subsample_mode", chroma,
+                                    "interlace", settings.progressive, "optimize_coding", TRUE, nullptr);
+    case FileFormat::Png:
+        return vips_pngsave_buffer(image, data, size, "interlace", settings.progressive, nullptr);
+    case FileFormat::Tiff:
+        return saveTiff(image, photograph, settings, data, size);
+    case FileFormat::WebP:
+        return vips_webpsave_buffer(image, data, size, "Q", settings.quality, "lossless", settings.lossless,
+                                    "alpha_q", 100, nullptr);
+    default:
+        return vips_heifsave_buffer(image, data, size, "Q", settings.quality, "subsample_mode", chroma,
+                                    "bitdepth", photograph.depth == 8 ? 8 : settings.bitDepth, "compression",
+                                    settings.compression == "av1" ? VIPS_FOREIGN_HEIF_COMPRESSION_AV1
+                                                                  : VIPS_FOREIGN_HEIF_COMPRESSION_HEVC,
+                                    nullptr);
+    }
+}
+
+void stopWhenAsked(VipsImage* image, VipsProgress*, void* stop) {
+    if (*static_cast<const std::atomic<bool>*>(stop))
+        vips_image_set_kill(image, TRUE);
+}
+
+bool isAsked(const std::atomic<bool>* stop) {
+    return stop != nullptr && *stop;
+}
+
+// The encoder writes 25 pixels per inch where the picture has no resolution: density "none" instead.
+void clearDensity(Bytes& jpeg) {
+    constexpr std::size_t units = 13; // behind start marker, segment head, "JFIF", version
+    constexpr Bytes::value_type none[] = {0, 0, 1, 0, 1};
+    if (jpeg.size() > units + sizeof none && jpeg[3] == 0xE0)
+        std::copy(std::begin(none), std::end(none), jpeg.begin() + units);
+}
+
+} // namespace
+
+Bytes encodePhotograph(const Photograph& photograph, FileFormat format, const fs::path& target,
+                       const WriteOptions& options) {
+    startVips();
+    vips_error_clear();
+    const VipsHandle image = imageOf(photograph, format);
+    if (options.stop != nullptr) {
+        vips_image_set_progress(image.get(), TRUE);
+        g_signal_connect(image.get(), "eval", G_CALLBACK(stopWhenAsked),
+                         const_cast<std::atomic<bool>*>(options.stop));
+    }
+    void* data = nullptr;
+    std::size_t size = 0;
+    const Encoding settings = settingsFor(photograph, format, target, options);
+    const int failed = save(image.get(), photograph, format, settings, &data, &size);
+    const std::unique_ptr<void, GFree> owner(data);
+    if (isAsked(options.stop))
+        throw StoppedError(target.string() + ": stopped; nothing was written");
+    if (failed != 0)
+        throw PhotographError(target.string() + ": " + formatName(format) + " encoding failed (" +
+                              takeVipsError() + "); choose other settings or another format");
+    const auto* bytes = static_cast<const std::uint8_t*>(data);
+    Bytes encoded(bytes, bytes + size);
+    if (format == FileFormat::Jpeg && photograph.xResolution == 0)
+        clearDensity(encoded);
+    return encoded;
+}

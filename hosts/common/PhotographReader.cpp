@@ -1,0 +1,242 @@
+#include "common/PhotographReader.h"
+
+#include "common/EncodingProbe.h"
+#include "common/PsdFile.h"
+#include "common/Vips.h"
+
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <cstring>
+#include <system_error>
+
+namespace {
+
+namespace fs = std::filesystem;
+
+[[noreturn]] void refuse(const fs::path& path, const std::string& cause, const std::string& advice) {
+    throw PhotographError(path.string() + ": " + cause + "; " + advice);
+}
+
+constexpr char kCopyAgain[] = "copy it again from the camera or a backup";
+
+/// A file opened for reading, closed at the end.
+class OpenFile {
+public:
+    explicit OpenFile(const fs::path& path)
+        : mHandle(::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK)) {
+        if (mHandle >= 0)
+            return;
+        if (errno == ENOENT || errno == ENOTDIR)
+            refuse(path, "there is no such file", "check the name");
+        if (errno == EACCES || errno == EPERM)
+            refuse(path, "no permission to read it", "ask its owner for read access");
+        refuse(path, std::string("cannot be opened (") + std::strerror(errno) + ")", "check the file system");
+    }
+    ~OpenFile() { ::close(mHandle); }
+    OpenFile(const OpenFile&) = delete;
+    OpenFile& operator=(const OpenFile&) = delete;
+
+    int handle() const { return mHandle; }
+
+private:
+    int mHandle;
+};
+
+Bytes readFile(const fs::path& path) {
+    const OpenFile file(path);
+    struct stat status {};
+    ::fstat(file.handle(), &status);
+    if (S_ISDIR(status.st_mode))
+        refuse(path, "is a folder", "name the photographs in it");
+    if (!S_ISREG(status.st_mode))
+        refuse(path, "is not a regular file", "save the photograph to a file first");
+    if (status.st_size == 0)
+        refuse(path, "the file is empty", kCopyAgain);
+    Bytes bytes(static_cast<std::size_t>(status.st_size));
+    for (std::size_t at = 0; at < bytes.size();) {
+        const ssize_t got = ::read(file.handle(), bytes.data() + at, bytes.size() - at);
+        if (got < 0 && errno == EINTR)
+            continue;
+        if (got < 0)
+            refuse(path, std::string("cannot be read (") + std::strerror(errno) + ")", "check the disk");
+        if (got == 0)
+            refuse(path, "the file became shorter while it was read", "try again when it is complete");
+        at += static_cast<std::size_t>(got);
+    }
+    return bytes;
+}
+
+VipsImage* load(const Bytes& file, FileFormat format) {
+    void* data = const_cast<std::uint8_t*>(file.data());
+    VipsImage* image = nullptr;
+    const auto run = [&](auto loader) {
+        return loader(data, file.size(), &image, "access", VIPS_ACCESS_SEQUENTIAL, "fail_on",
+                      VIPS_FAIL_ON_TRUNCATED, nullptr);
+    };
+    switch (format) {
+    case FileFormat::Jpeg:
+        run(vips_jpegload_buffer);
+        break;
+    case FileFormat::Png:
+        run(vips_pngload_buffer);
+        break;
+    case FileFormat::Tiff:
+        run(vips_tiffload_buffer);
+        break;
+    case FileFormat::WebP:
+        run(vips_webpload_buffer);
+        break;
+    default:
+        run(vips_heifload_buffer);
+        break;
+    }
+    return image;
+}
+
+VipsHandle open(const fs::path& path, const Bytes& file, FileFormat format) {
+    startVips();
+    vips_error_clear();
+    if ((format == FileFormat::Jpeg && !jpegIsComplete(file)) ||
+        (format == FileFormat::Png && !pngIsComplete(file)))
+        refuse(path, "the file is cut short", kCopyAgain);
+    VipsHandle image(load(file, format));
+    if (!image)
+        refuse(path, "is damaged or cut short (" + takeVipsError() + ")", kCopyAgain);
+    return image;
+}
+
+ColorModel modelOf(const fs::path& path, VipsImage* image) {
+    const int bands = vips_image_get_bands(image);
+    const VipsInterpretation kind = vips_image_get_interpretation(image);
+    const bool grey = kind == VIPS_INTERPRETATION_B_W || kind == VIPS_INTERPRETATION_GREY16;
+    const bool rgb = kind == VIPS_INTERPRETATION_sRGB || kind == VIPS_INTERPRETATION_RGB ||
+                     kind == VIPS_INTERPRETATION_RGB16;
+    if (bands > 4)
+        refuse(path, "has more than four channels", "save it flattened, without extra channels");
+    if (grey && bands <= 2)
+        return bands == 1 ? ColorModel::Grey : ColorModel::GreyAlpha;
+    if (rgb && bands >= 3)
+        return bands == 3 ? ColorModel::Rgb : ColorModel::RgbAlpha;
+    if (kind == VIPS_INTERPRETATION_CMYK && bands == 4)
+        return ColorModel::Cmyk;
+    const char* name = vips_enum_nick(VIPS_TYPE_INTERPRETATION, kind);
+    refuse(path,
+           std::string("has the colour model \"") + name + "\" with " + std::to_string(bands) + " channels",
+           "convert it to RGB, grey or CMYK");
+}
+
+int depthOf(const fs::path& path, VipsImage* image) {
+    const VipsBandFormat format = vips_image_get_format(image);
+    if (format == VIPS_FORMAT_UCHAR && vips_image_get_coding(image) == VIPS_CODING_NONE)
+        return 8;
+    if (format == VIPS_FORMAT_USHORT)
+        return 16;
+    refuse(path,
+           std::string("has samples of the kind \"") + vips_enum_nick(VIPS_TYPE_BAND_FORMAT, format) + "\"",
+           "convert it to 8 or 16 bits per channel");
+}
+
+std::string textField(VipsImage* image, const char* name) {
+    const char* text = nullptr;
+    if (vips_image_get_typeof(image, name) == 0 || vips_image_get_string(image, name, &text) != 0)
+        return {};
+    return text;
+}
+
+int numberField(VipsImage* image, const char* name) {
+    int value = 0;
+    if (vips_image_get_typeof(image, name) != 0)
+        vips_image_get_int(image, name, &value);
+    return value;
+}
+
+Encoding encodingOf(const Bytes& file, FileFormat format, VipsImage* image) {
+    if (format == FileFormat::Jpeg)
+        return probeJpeg(file);
+    Encoding encoding;
+    encoding.format = format;
+    if (format == FileFormat::Png)
+        encoding.progressive = file.size() > 28 && file[28] == 1;
+    if (format == FileFormat::Tiff)
+        encoding.compression = probeTiffCompression(file);
+    if (format == FileFormat::WebP)
+        encoding.lossless = webpIsLossless(file);
+    if (format == FileFormat::Heif) {
+        encoding.compression = textField(image, "heif-compression");
+        encoding.bitDepth = numberField(image, "heif-bitdepth");
+    }
+    return encoding;
+}
+
+void takeResolution(Photograph& photograph, VipsImage* image) {
+    // 1 pixel per millimetre is what the library reports for a file without a resolution.
+    if (vips_image_get_xres(image) == 1.0)
+        return;
+    photograph.xResolution = vips_image_get_xres(image);
+    photograph.yResolution = vips_image_get_yres(image);
+    photograph.resolutionUnit = textField(image, VIPS_META_RESOLUTION_UNIT);
+}
+
+void takeProfile(Photograph& photograph, VipsImage* image) {
+    const void* data = nullptr;
+    std::size_t size = 0;
+    if (vips_image_get_typeof(image, VIPS_META_ICC_NAME) == 0 ||
+        vips_image_get_blob(image, VIPS_META_ICC_NAME, &data, &size) != 0)
+        return;
+    const auto* bytes = static_cast<const std::uint8_t*>(data);
+    photograph.iccProfile.assign(bytes, bytes + size);
+}
+
+int storeRows(VipsRegion* region, VipsRect* area, void* target) {
+    auto* samples = static_cast<std::uint8_t*>(target);
+    const std::size_t row = VIPS_IMAGE_SIZEOF_LINE(region->im);
+    for (int y = area->top; y < area->top + area->height; ++y)
+        std::memcpy(samples + static_cast<std::size_t>(y) * row, VIPS_REGION_ADDR(region, 0, y), row);
+    return 0;
+}
+
+// The library shifts 10 and 12 bits up to 16; repeating the high bits below makes full scale 65535.
+void fillLowBits(Photograph& photograph) {
+    const int bits = photograph.encoding.bitDepth;
+    auto* samples = reinterpret_cast<std::uint16_t*>(photograph.samples.data());
+    for (std::size_t i = 0; i < photograph.samples.size() / 2; ++i)
+        samples[i] = static_cast<std::uint16_t>(samples[i] | samples[i] >> bits);
+}
+
+void takeSamples(Photograph& photograph, const fs::path& path, VipsImage* image) {
+    photograph.samples.resize(VIPS_IMAGE_SIZEOF_IMAGE(image));
+    if (vips_sink_disc(image, storeRows, photograph.samples.data()) != 0)
+        refuse(path, "is damaged or cut short (" + takeVipsError() + ")", kCopyAgain);
+    if (photograph.depth == 16 && photograph.encoding.bitDepth > 8)
+        fillLowBits(photograph);
+}
+
+} // namespace
+
+Photograph readPhotograph(const fs::path& path) {
+    const Bytes file = readFile(path);
+    const std::optional<FileFormat> format = formatOfContent(file);
+    if (!format)
+        refuse(path, "is not a picture of a known kind",
+               "JPEG, PNG, TIFF, WebP, PSD and HEIF files can be read");
+    if (*format == FileFormat::Psd)
+        return readPsd(file, path);
+
+    const VipsHandle image = open(path, file, *format);
+    Photograph photograph;
+    photograph.source = path;
+    photograph.width = vips_image_get_width(image.get());
+    photograph.height = vips_image_get_height(image.get());
+    photograph.model = modelOf(path, image.get());
+    photograph.depth = depthOf(path, image.get());
+    checkEdges(photograph.width, photograph.height, path);
+    photograph.encoding = encodingOf(file, *format, image.get());
+    photograph.pages = std::max(1, numberField(image.get(), VIPS_META_N_PAGES));
+    takeResolution(photograph, image.get());
+    takeProfile(photograph, image.get());
+    takeSamples(photograph, path, image.get());
+    return photograph;
+}

@@ -1,0 +1,39 @@
+#include "common/PhotographWriter.h"
+
+#include "common/Metadata.h"
+#include "common/PhotographEncoder.h"
+#include "common/TargetFile.h"
+
+namespace {
+
+namespace fs = std::filesystem;
+
+FileFormat targetFormat(const Photograph& photograph, const fs::path& target) {
+    const std::optional<FileFormat> format = formatOfExtension(target);
+    if (!format)
+        throw PhotographError(target.string() + ": the extension \"" + target.extension().string() +
+                              "\" names no known format; use .jpg, .png, .tif, .webp or .heic");
+    const std::string obstacle = formatObstacle(*format, photograph);
+    if (!obstacle.empty())
+        throw PhotographError(target.string() + ": " + obstacle);
+    return *format;
+}
+
+} // namespace
+
+void checkTarget(const Photograph& photograph, const fs::path& target, const WriteOptions& options) {
+    targetFormat(photograph, target);
+    checkTargetPath(target, photograph.source, options.overwrite);
+}
+
+std::vector<std::string> writePhotograph(const Photograph& photograph, const fs::path& target,
+                                         const WriteOptions& options) {
+    const FileFormat format = targetFormat(photograph, target);
+    checkTargetPath(target, photograph.source, options.overwrite);
+    Bytes encoded = encodePhotograph(photograph, format, target, options);
+    const std::vector<std::string> warnings = copyMetadata(photograph, format, encoded);
+    TargetFile file(target);
+    file.write(encoded, options.stop);
+    file.commit(options.overwrite);
+    return warnings;
+}

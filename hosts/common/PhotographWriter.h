@@ -1,0 +1,39 @@
+#pragma once
+
+#include "common/FileFormat.h"
+
+#include <atomic>
+#include <optional>
+#include <string>
+#include <vector>
+
+/// How to write; whatever is not given follows the source where it has the target's format, otherwise JPEG
+/// quality 92, WebP and HEIF 90, full chroma resolution, LZW.
+struct WriteOptions {
+    bool overwrite = false;                  ///< replace an existing target; never the source itself
+    int quality = 0;                         ///< JPEG, WebP, HEIF: 1 to 100; 0 as the source
+    std::optional<bool> chromaSubsampled;    ///< JPEG, HEIF: colour at half resolution both ways
+    std::optional<bool> lossless;            ///< WebP
+    std::optional<bool> progressive;         ///< JPEG, PNG
+    std::string compression;                 ///< TIFF: "none", "lzw", "deflate", "packbits", "zstd" or "jpeg"
+    const std::atomic<bool>* stop = nullptr; ///< set it, also in a signal handler, to end the writing
+};
+
+/// Whether writing the photograph there can succeed, as far as can be told without writing: the format can
+/// hold it, the target is not its source, not a folder and does not exist (unless it may be overwritten), and
+/// its folder exists and may be written to.
+/// @throws PhotographError when the format is unknown or cannot hold the picture
+/// @throws TargetError for everything else
+void checkTarget(const Photograph& photograph, const std::filesystem::path& target,
+                 const WriteOptions& options);
+
+/// Writes the photograph in the format that the target's extension names, with the metadata of its source.
+/// The target appears whole or not at all: the bytes go to a temporary name in its folder, which is removed
+/// on every failure, and take the final name once they are on the disk. Without `overwrite` a file that
+/// appears under the final name meanwhile is left alone.
+/// @return warnings: metadata that could not be carried over
+/// @throws PhotographError when the format is unknown or cannot hold the picture; never a silent conversion
+/// @throws TargetError when the target cannot be written
+/// @throws StoppedError when `stop` was set
+std::vector<std::string> writePhotograph(const Photograph& photograph, const std::filesystem::path& target,
+                                         const WriteOptions& options = {});

@@ -1,0 +1,213 @@
+#include "common/PsdFile.h"
+
+#include <algorithm>
+#include <limits>
+
+namespace {
+
+namespace fs = std::filesystem;
+
+enum Mode { Bitmap = 0, Gray = 1, Indexed = 2, RGB = 3, CMYK = 4 };
+enum Resource { ResolutionInfo = 1005, IccProfile = 1039, VersionInfo = 1057 };
+
+[[noreturn]] void refuse(const fs::path& path, const std::string& cause, const std::string& advice) {
+    throw PhotographError(path.string() + ": " + cause + "; " + advice);
+}
+
+/// Big-endian numbers and byte runs, from the start of a file to its end.
+class Cursor {
+public:
+    Cursor(ByteView bytes, const fs::path& path) : mBytes(bytes), mPath(path) {}
+
+    ByteView take(std::size_t count) {
+        if (count > mBytes.size())
+            refuse(mPath, "the file is cut short", "copy it again from the camera or a backup");
+        const ByteView taken = mBytes.first(count);
+        mBytes = mBytes.subspan(count);
+        return taken;
+    }
+    std::uint32_t number(std::size_t bytes) {
+        std::uint32_t value = 0;
+        for (const std::uint8_t byte : take(bytes))
+            value = value << 8 | byte;
+        return value;
+    }
+    ByteView block() { return take(number(4)); }
+    bool atEnd() const { return mBytes.empty(); }
+
+private:
+    ByteView mBytes;
+    const fs::path& mPath;
+};
+
+struct Header {
+    std::size_t channels;
+    std::size_t width;
+    std::size_t height;
+    int depth;
+    int mode;
+
+    std::size_t rowBytes() const { return (width * static_cast<std::size_t>(depth) + 7) / 8; }
+};
+
+Header readHeader(Cursor& cursor, const fs::path& path) {
+    cursor.take(4);
+    if (cursor.number(2) != 1)
+        refuse(path, "is a PSB, the large form of PSD", "save it as TIFF");
+    cursor.take(6);
+    Header header{};
+    header.channels = cursor.number(2);
+    header.height = cursor.number(4);
+    header.width = cursor.number(4);
+    header.depth = static_cast<int>(cursor.number(2));
+    header.mode = static_cast<int>(cursor.number(2));
+    checkEdges(static_cast<std::int64_t>(header.width), static_cast<std::int64_t>(header.height), path);
+    if (header.depth == 32)
+        refuse(path, "has 32-bit float samples", "convert it to 8 or 16 bits per channel");
+    if (header.mode > CMYK)
+        refuse(path, "has a colour model other than grey, RGB and CMYK", "convert it to RGB, grey or CMYK");
+    const std::size_t colors = header.mode == CMYK ? 4 : header.mode == RGB ? 3 : 1;
+    const bool mayHaveAlpha = header.mode == RGB || header.mode == Gray;
+    if (header.channels > colors + (mayHaveAlpha ? 1 : 0))
+        refuse(path, "has more channels than colour and one transparency", "save it without extra channels");
+    const int least = header.mode == Bitmap ? 1 : 8;
+    if (header.channels < colors || (header.depth != least && (header.depth != 16 || least == 1)))
+        refuse(path, "has a damaged header", "copy it again from the camera or a backup");
+    return header;
+}
+
+void readResources(Cursor cursor, Photograph& photograph, const fs::path& path) {
+    while (!cursor.atEnd()) {
+        cursor.take(4);
+        const std::uint32_t id = cursor.number(2);
+        const std::size_t name = cursor.number(1);
+        cursor.take(name | 1);
+        const std::uint32_t size = cursor.number(4);
+        const ByteView data = cursor.take(size);
+        if (size % 2 == 1 && !cursor.atEnd())
+            cursor.take(1);
+        if (id == IccProfile)
+            photograph.iccProfile.assign(data.begin(), data.end());
+        if (id == VersionInfo && data.size() > 4 && data[4] == 0)
+            refuse(path, "was saved without a merged picture", "save it again with maximum compatibility");
+        if (id == ResolutionInfo && data.size() >= 16) {
+            // 16.16 pixels per inch, whatever unit is displayed.
+            Cursor values(data, path);
+            photograph.xResolution = values.number(4) / 65536.0 / 25.4;
+            values.take(4);
+            photograph.yResolution = values.number(4) / 65536.0 / 25.4;
+            photograph.resolutionUnit = "in";
+        }
+    }
+}
+
+void unpackRow(Cursor packed, std::uint8_t* row, std::size_t size, const fs::path& path) {
+    std::size_t at = 0;
+    while (at < size && !packed.atEnd()) {
+        const std::uint32_t code = packed.number(1);
+        if (code == 128)
+            continue;
+        const std::size_t count = std::min<std::size_t>(code < 128 ? code + 1 : 257 - code, size - at);
+        if (code < 128) {
+            const ByteView run = packed.take(count);
+            std::copy(run.begin(), run.end(), row + at);
+        } else {
+            std::fill_n(row + at, count, static_cast<std::uint8_t>(packed.number(1)));
+        }
+        at += count;
+    }
+    if (at < size)
+        refuse(path, "holds a damaged row", "copy it again from the camera or a backup");
+}
+
+// All rows of the first channel, then all of the second and so on, without packing.
+Bytes readPlanes(Cursor cursor, const Header& header, const fs::path& path) {
+    const std::size_t row = header.rowBytes();
+    const std::size_t rows = header.height * header.channels;
+    const std::uint32_t compression = cursor.number(2);
+    if (compression > 1)
+        refuse(path, "has its merged picture in ZIP compression", "save it as TIFF");
+    if (compression == 0) {
+        const ByteView plain = cursor.take(row * rows);
+        return {plain.begin(), plain.end()};
+    }
+    Cursor lengths(cursor.take(2 * rows), path);
+    Bytes planes(row * rows);
+    for (std::size_t y = 0; y < rows; ++y)
+        unpackRow(Cursor(cursor.take(lengths.number(2)), path), planes.data() + y * row, row, path);
+    return planes;
+}
+
+void interleave(const Bytes& planes, const Header& header, Photograph& photograph) {
+    const std::size_t count = header.width * header.height;
+    const std::size_t bytes = static_cast<std::size_t>(header.depth) / 8;
+    const std::uint8_t flip = header.mode == CMYK ? 255 : 0;
+    photograph.samples.resize(planes.size());
+    for (std::size_t c = 0; c < header.channels; ++c)
+        for (std::size_t i = 0; i < count; ++i)
+            for (std::size_t b = 0; b < bytes; ++b) {
+                // The file is big-endian.
+                const std::size_t from = bytes == 2 ? 1 - b : b;
+                photograph.samples[(i * header.channels + c) * bytes + b] =
+                    planes[(c * count + i) * bytes + from] ^ flip;
+            }
+}
+
+void expandPalette(const Bytes& plane, ByteView palette, Photograph& photograph) {
+    photograph.samples.reserve(plane.size() * 3);
+    for (const std::uint8_t index : plane)
+        for (std::size_t c = 0; c < 3; ++c)
+            photograph.samples.push_back(palette[c * 256 + index]);
+}
+
+void expandBits(const Bytes& plane, const Header& header, Photograph& photograph) {
+    for (std::size_t y = 0; y < header.height; ++y)
+        for (std::size_t x = 0; x < header.width; ++x) {
+            const bool black = plane[y * header.rowBytes() + x / 8] >> (7 - x % 8) & 1;
+            photograph.samples.push_back(black ? 0 : 255);
+        }
+}
+
+ColorModel modelOf(const Header& header) {
+    if (header.mode == CMYK)
+        return ColorModel::Cmyk;
+    if (header.mode == RGB)
+        return header.channels == 4 ? ColorModel::RgbAlpha : ColorModel::Rgb;
+    if (header.mode == Indexed)
+        return ColorModel::Rgb;
+    return header.channels == 2 ? ColorModel::GreyAlpha : ColorModel::Grey;
+}
+
+} // namespace
+
+void checkEdges(std::int64_t width, std::int64_t height, const fs::path& path) {
+    if (width < 1 || height < 1)
+        refuse(path, "has no pixels", "copy it again from the camera or a backup");
+    if (std::max(width, height) > std::numeric_limits<std::int16_t>::max())
+        refuse(path, "is over 32767 pixels wide or high", "scale it down or cut it into parts");
+}
+
+Photograph readPsd(ByteView file, const fs::path& path) {
+    Cursor cursor(file, path);
+    const Header header = readHeader(cursor, path);
+    const ByteView palette = cursor.block();
+    if (header.mode == Indexed && palette.size() < 768)
+        refuse(path, "has a damaged palette", "copy it again from the camera or a backup");
+    Photograph photograph;
+    photograph.source = path;
+    photograph.width = static_cast<int>(header.width);
+    photograph.height = static_cast<int>(header.height);
+    photograph.depth = header.depth == 16 ? 16 : 8;
+    photograph.model = modelOf(header);
+    photograph.encoding.format = FileFormat::Psd;
+    readResources(Cursor(cursor.block(), path), photograph, path);
+    cursor.block(); // the layers
+    const Bytes planes = readPlanes(cursor, header, path);
+    if (header.mode == Indexed)
+        expandPalette(planes, palette, photograph);
+    else if (header.depth == 1)
+        expandBits(planes, header, photograph);
+    else
+        interleave(planes, header, photograph);
+    return photograph;
+}

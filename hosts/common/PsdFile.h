@@ -1,0 +1,14 @@
+#pragma once
+
+#include "common/FileFormat.h"
+
+/// Reads the merged picture of a PSD file: bitmap, grey, palette, RGB and CMYK, 8 or 16 bits, with at most
+/// one transparency channel beside grey or RGB, stored plainly or packed by runs. Inks, which the file
+/// inverts, are turned back.
+/// @param path  for messages and as the source of the result
+/// @throws PhotographError for files that are cut short or hold another kind of picture
+Photograph readPsd(ByteView file, const std::filesystem::path& path);
+
+/// Refuses pictures without pixels and pictures whose edges the filter record cannot express.
+/// @throws PhotographError
+void checkEdges(std::int64_t width, std::int64_t height, const std::filesystem::path& path);

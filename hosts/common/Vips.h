@@ -1,0 +1,20 @@
+#pragma once
+
+#include <vips/vips.h>
+
+#include <memory>
+#include <string>
+
+struct VipsRelease {
+    void operator()(VipsImage* image) const { g_object_unref(image); }
+};
+
+/// A libvips image that releases its reference.
+using VipsHandle = std::unique_ptr<VipsImage, VipsRelease>;
+
+/// Starts libvips once, without its operation cache and with its warnings silenced: failures are exceptions.
+/// @throws PhotographError when it cannot start
+void startVips();
+
+/// The pending error text as one line; clears it.
+std::string takeVipsError();
