@@ -1,10 +1,10 @@
 #include "common/Metadata.h"
 
+#include "common/HeifMetadata.h"
 #include "common/TiffDirectory.h"
 
 #include <algorithm>
 #include <array>
-#include <exiv2/bmffimage.hpp>
 #include <exiv2/exiv2.hpp>
 #include <map>
 #include <mutex>
@@ -34,6 +34,8 @@ constexpr std::array<std::uint16_t, 3> kResolution = {0x011A, 0x011B, 0x0128};
 
 // Transfer function, white point and primaries, which the metadata library leaves out of a TIFF.
 constexpr std::array<std::uint16_t, 3> kColorimetry = {0x012D, 0x013E, 0x013F};
+
+constexpr std::array<std::uint16_t, 1> kXmp = {0x02BC};
 
 template <std::size_t count>
 bool isImageTag(const Exiv2::Exifdatum& datum, const std::array<std::uint16_t, count>& tags) {
@@ -74,7 +76,7 @@ void prepareLibrary() {
     static const bool ready = [] {
         Exiv2::XmpParser::initialize(lockXmp, &mutex);
         Exiv2::LogMsg::setLevel(Exiv2::LogMsg::mute);
-        return Exiv2::enableBMFF(true);
+        return true;
     }();
     static_cast<void>(ready);
 }
@@ -83,9 +85,32 @@ bool isTiff(FileFormat format) {
     return format == FileFormat::Tiff || format == FileFormat::Psd;
 }
 
+// The packet as it stands in the file: asked of a constant image it is not made anew, and of a TIFF it is a
+// tag.
+std::string packetOf(const Exiv2::Image& image) {
+    if (!image.xmpPacket().empty())
+        return image.xmpPacket();
+    for (const Exiv2::Exifdatum& datum : image.exifData())
+        if (isImageTag(datum, kXmp)) {
+            std::string packet(static_cast<std::size_t>(datum.size()), 0);
+            datum.copy(reinterpret_cast<Exiv2::byte*>(packet.data()), Exiv2::littleEndian);
+            return packet;
+        }
+    return {};
+}
+
 Tags tagsOf(Exiv2::Image& image) {
     image.readMetadata();
-    return {image.exifData(), image.iptcData(), image.xmpPacket(), image.comment()};
+    return {image.exifData(), image.iptcData(), packetOf(image), image.comment()};
+}
+
+Tags tagsOf(const MetadataBlocks& blocks) {
+    Tags tags;
+    if (!blocks.exif.empty())
+        Exiv2::ExifParser::decode(tags.exif, blocks.exif.data(),
+                                  static_cast<std::uint32_t>(blocks.exif.size()));
+    tags.xmp.assign(blocks.xmp.begin(), blocks.xmp.end());
+    return tags;
 }
 
 template <typename Number>
@@ -113,11 +138,13 @@ void makeUpright(Tags& tags) {
 
 Tags readSource(const Photograph& photograph) {
     prepareLibrary();
-    const auto image = Exiv2::ImageFactory::open(photograph.source.string());
-    Tags tags = tagsOf(*image);
-    const FileFormat format = photograph.encoding.format;
-    if (format == FileFormat::Heif)
+    Tags tags;
+    if (photograph.encoding.format == FileFormat::Heif) {
+        tags = tagsOf(heifMetadata(photograph.source));
         makeUpright(tags);
+    } else {
+        tags = tagsOf(*Exiv2::ImageFactory::open(photograph.source.string()));
+    }
     setIfPresent(tags.exif, "Exif.Photo.PixelXDimension", static_cast<std::uint32_t>(photograph.width));
     setIfPresent(tags.exif, "Exif.Photo.PixelYDimension", static_cast<std::uint32_t>(photograph.height));
     return tags;
@@ -171,14 +198,20 @@ Bytes withTags(const Bytes& encoded, FileFormat target, const Tags& tags) {
         image->setIptcData(tags.iptc);
     if (takes(Exiv2::mdComment))
         image->setComment(tags.comment);
-    image->setXmpPacket(tags.xmp);
-    image->writeXmpFromPacket(!tags.xmp.empty());
+    image->clearXmpData();
+    if (target != FileFormat::Tiff) {
+        image->xmpPacket() = tags.xmp; // the setter refuses a malformed packet
+        image->writeXmpFromPacket(!tags.xmp.empty());
+    }
     image->writeMetadata();
     Exiv2::BasicIo& io = image->io();
     io.open();
     const Exiv2::byte* data = io.mmap();
     Bytes result(data, data + io.size());
     io.munmap();
+    if (target == FileFormat::Tiff && !tags.xmp.empty())
+        addTiffEntries(result, {{kXmp[0], Exiv2::unsignedByte, static_cast<std::uint32_t>(tags.xmp.size()),
+                                 Bytes(tags.xmp.begin(), tags.xmp.end())}});
     return result;
 }
 
@@ -211,7 +244,8 @@ std::string missing(const Data& wanted, const Data& found,
 }
 
 Warnings compare(const Tags& wanted, const Bytes& encoded, FileFormat target) {
-    const Tags found = tagsOf(*openBytes(encoded));
+    const Tags found =
+        target == FileFormat::Heif ? tagsOf(heifMetadata(encoded)) : tagsOf(*openBytes(encoded));
     const std::string into = std::string(" did not go into the ") + formatName(target) + " file";
     Warnings warnings;
     const std::string exif = missing<Exiv2::ExifData>(wanted.exif, found.exif, isPlacement);
@@ -239,10 +273,7 @@ MetadataBlocks metadataBlocks(const Photograph& photograph) {
         const Exiv2::ExifData exif = exifFor(tags, photograph.encoding.format, FileFormat::Heif);
         Exiv2::Blob encoded;
         Exiv2::ExifParser::encode(encoded, Exiv2::littleEndian, exif);
-        if (!encoded.empty()) {
-            blocks.exif = {'E', 'x', 'i', 'f', 0, 0};
-            blocks.exif.insert(blocks.exif.end(), encoded.begin(), encoded.end());
-        }
+        blocks.exif.assign(encoded.begin(), encoded.end());
         blocks.xmp.assign(tags.xmp.begin(), tags.xmp.end());
     } catch (const std::exception&) {
         // copyMetadata reads the same source and reports it.

@@ -5,13 +5,14 @@
 #include <string>
 #include <vector>
 
-/// Exif (behind "Exif\0\0") and XMP of a photograph's source, for a format whose encoder embeds them.
+/// Exif, from its byte order mark on, and XMP as they stand in a file.
 struct MetadataBlocks {
     Bytes exif;
     Bytes xmp;
 };
 
-/// Reads both from the photograph's source; empty where it has none or cannot be read.
+/// Both from the photograph's source, for a format whose encoder embeds them; empty where it has none or
+/// cannot be read.
 MetadataBlocks metadataBlocks(const Photograph& photograph);
 
 /// Gives an encoded picture the Exif (with MakerNote), XMP, IPTC and comment of the photograph's source, and

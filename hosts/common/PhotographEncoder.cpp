@@ -47,7 +47,10 @@ VipsHandle imageOf(const Photograph& photograph, FileFormat format) {
     }
     attach(image, VIPS_META_ICC_NAME, photograph.iccProfile);
     if (format == FileFormat::Heif) {
-        const MetadataBlocks blocks = metadataBlocks(photograph);
+        MetadataBlocks blocks = metadataBlocks(photograph);
+        constexpr Bytes::value_type prefix[] = {'E', 'x', 'i', 'f', 0, 0};
+        if (!blocks.exif.empty())
+            blocks.exif.insert(blocks.exif.begin(), std::begin(prefix), std::end(prefix));
         attach(image, VIPS_META_EXIF_NAME, blocks.exif);
         attach(image, VIPS_META_XMP_NAME, blocks.xmp);
     }

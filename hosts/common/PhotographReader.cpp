@@ -108,12 +108,13 @@ VipsHandle open(const fs::path& path, const Bytes& file, FileFormat format) {
     return image;
 }
 
+// Of the kinds it names, scRGB always has float samples, which depthOf refuses.
 ColorModel modelOf(const fs::path& path, VipsImage* image) {
     const int bands = vips_image_get_bands(image);
     const VipsInterpretation kind = vips_image_get_interpretation(image);
     const bool grey = kind == VIPS_INTERPRETATION_B_W || kind == VIPS_INTERPRETATION_GREY16;
     const bool rgb = kind == VIPS_INTERPRETATION_sRGB || kind == VIPS_INTERPRETATION_RGB ||
-                     kind == VIPS_INTERPRETATION_RGB16;
+                     kind == VIPS_INTERPRETATION_RGB16 || kind == VIPS_INTERPRETATION_scRGB;
     if (bands > 4)
         refuse(path, "has more than four channels", "save it flattened, without extra channels");
     if (grey && bands <= 2)

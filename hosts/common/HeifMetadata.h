@@ -1,0 +1,8 @@
+#pragma once
+
+#include "common/Metadata.h"
+
+/// Exif (from its byte order mark on) and XMP of a HEIF file or its bytes; empty where it has none. The
+/// metadata library does not find them in every HEIF, the decoder does.
+MetadataBlocks heifMetadata(const std::filesystem::path& path);
+MetadataBlocks heifMetadata(ByteView file);

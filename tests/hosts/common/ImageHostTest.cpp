@@ -1,0 +1,125 @@
+#include "common/ImageHost.h"
+
+#include "PluginEntry/CARGBPlanePhotoshop.h"
+#include "Utility/CGenericEx.h"
+
+#include <gtest/gtest.h>
+
+#include <cstdlib>
+#include <cstring>
+
+namespace {
+
+Photograph counting(ColorModel model, int depth, int width, int height) {
+    Photograph photograph;
+    photograph.width = width;
+    photograph.height = height;
+    photograph.depth = depth;
+    photograph.model = model;
+    photograph.samples.resize(static_cast<std::size_t>(width * height * samplesPerPixel(model) * depth / 8));
+    for (std::size_t i = 0; i < photograph.samples.size(); ++i)
+        photograph.samples[i] = static_cast<std::uint8_t>(i);
+    return photograph;
+}
+
+TEST(ImageHost, MapsEndsToEndsAndLosesAtMostOne) {
+    EXPECT_EQ(toHostSample(0), 0);
+    EXPECT_EQ(toHostSample(65535), 32768);
+    EXPECT_EQ(toHostSample(1), 1); // (32768 + 32767) / 65535
+    EXPECT_EQ(toFileSample(32768), 65535);
+    EXPECT_EQ(toFileSample(1), 2);
+    EXPECT_EQ(toFileSample(40000), 65535);
+    for (int v = 0; v <= 65535; ++v)
+        ASSERT_LE(std::abs(v - toFileSample(toHostSample(static_cast<std::uint16_t>(v)))), 1) << v;
+}
+
+// A 4 x 3 RGB picture counts its samples: pixel (x, y) plane p holds 3 * (4 * y + x) + p.
+TEST(ImageHost, AnswersRequestsOverPartsOfTheImage) {
+    ImageHost host(counting(ColorModel::Rgb, 8, 4, 3));
+    host::FilterRecord& record = host.record();
+    record.inRect = {1, 2, 3, 4};
+    record.inLoPlane = 1;
+    record.inHiPlane = 2;
+    record.outRect = {0, 0, 1, 2};
+    record.outLoPlane = record.outHiPlane = 2;
+    ASSERT_EQ(record.advanceState(), 0);
+    const auto* in = static_cast<const std::uint8_t*>(record.inData);
+    ASSERT_GT(record.inRowBytes, 4);
+    EXPECT_EQ((std::vector<int>{in[0], in[1], in[2], in[3]}), (std::vector<int>{19, 20, 22, 23}));
+    EXPECT_EQ(in[record.inRowBytes], 31);
+    auto* out = static_cast<std::uint8_t*>(record.outData);
+    EXPECT_EQ(out[1], 5); // the current destination
+    out[1] = 99;
+    EXPECT_EQ(host.photograph().samples[5], 5); // not before the next call
+    record.outRect = {};
+    ASSERT_EQ(record.advanceState(), 0);
+    EXPECT_EQ(host.photograph().samples[5], 99);
+    EXPECT_EQ(host.photograph().samples[8], 8);
+    EXPECT_EQ(record.outData, nullptr);
+    EXPECT_EQ(record.outRowBytes, 0);
+    record.outRect = {0, 0, 1, 2};
+    record.inRect = {0, 0, 1, 2};
+    ASSERT_EQ(record.advanceState(), 0);
+    EXPECT_EQ(static_cast<std::uint8_t*>(record.outData)[1], 99);
+    EXPECT_EQ(static_cast<std::uint8_t*>(record.inData)[2], 4); // input stays the source
+}
+
+TEST(ImageHost, RefusesRequestsOutsideTheImage) {
+    ImageHost host(counting(ColorModel::GreyAlpha, 8, 4, 3));
+    host::FilterRecord& record = host.record();
+    EXPECT_EQ(record.planes, 1);
+    const host::Rect inside = record.filterRect;
+    const struct {
+        host::Rect area;
+        std::int16_t low, high;
+    } bad[] = {{{0, 0, 3, 5}, 0, 0}, {{0, 0, 4, 4}, 0, 0}, {{-1, 0, 3, 4}, 0, 0}, {{0, -1, 3, 4}, 0, 0},
+               {inside, 0, 1},       {inside, -1, 0},      {inside, 1, 0}};
+    for (const auto& request : bad) {
+        record.inRect = request.area;
+        record.inLoPlane = request.low;
+        record.inHiPlane = request.high;
+        EXPECT_EQ(record.advanceState(), -50);
+        EXPECT_EQ(record.inData, nullptr);
+    }
+}
+
+TEST(ImageHost, FailsOnDemandAndAnswersForTheYoungest) {
+    ImageHost host(counting(ColorModel::Rgb, 8, 4, 3));
+    host.failAt(3, -108); // the priming call, channel 0, then channel 1
+    CARGBPlanePhotoshop plane(0, 0, QStringLiteral("plane"));
+    std::int16_t result = 0;
+    EXPECT_THROW(plane.FillFrom_Photoshop_Data(&host.record(), &result), CGenericEx);
+    EXPECT_EQ(result, -108);
+    plane.FillFrom_Photoshop_Data(&host.record(), &result);
+    host.failAt(2, -1);
+    std::fill_n(plane.samples(Channel::Red), 12, std::uint8_t{200});
+    EXPECT_THROW(plane.copyPlaneToPS(&host.record(), &result), CGenericEx);
+    EXPECT_EQ(result, -1);
+    {
+        ImageHost younger(counting(ColorModel::Grey, 8, 1, 1));
+        younger.onAbort = [] { return true; };
+        EXPECT_EQ(host.record().abortProc(), 1);
+    }
+    EXPECT_EQ(host.record().abortProc(), 0);
+}
+
+// Planes that are never written keep every bit: 16-bit K and transparency as well as the other channels.
+TEST(ImageHost, TouchesOnlyWhatIsWritten) {
+    for (const ColorModel model : {ColorModel::Cmyk, ColorModel::RgbAlpha, ColorModel::GreyAlpha}) {
+        const Photograph before = counting(model, 16, 5, 4);
+        ImageHost host(before);
+        host::FilterRecord& record = host.record();
+        record.outRect = record.filterRect;
+        record.outLoPlane = record.outHiPlane = 0;
+        ASSERT_EQ(record.advanceState(), 0);
+        for (int y = 0; y < 4; ++y)
+            std::memset(static_cast<std::uint8_t*>(record.outData) + y * record.outRowBytes, 0, 10);
+        record.outRect = {};
+        ASSERT_EQ(record.advanceState(), 0);
+        const auto channel = static_cast<std::size_t>(2 * samplesPerPixel(model));
+        for (std::size_t i = 0; i < before.samples.size(); ++i)
+            ASSERT_EQ(host.photograph().samples[i], i % channel < 2 ? 0 : before.samples[i]) << i;
+    }
+}
+
+} // namespace

@@ -1,0 +1,63 @@
+#include "common/Metadata.h"
+
+#include "common/PhotographReader.h"
+#include "common/PhotographWriter.h"
+#include "hosts/TestFiles.h"
+
+#include <gmock/gmock.h>
+
+namespace {
+
+using testing::ElementsAre;
+using testing::HasSubstr;
+
+TEST(Metadata, KeepsAMakerNoteAndMendsTheDimensions) {
+    const TestFolder folder;
+    folder.run(
+        "cp $S/rocket.jpg s.jpg && exiv2 -M'set Exif.Image.Make Canon' -M'set Exif.Photo.PixelXDimension 9' "
+        "-M'set Exif.Canon.OwnerName A. Person' -M'set Exif.CanonCs.Quality 3' mo s.jpg && "
+        "exiftool -q -overwrite_original -Comment='A comment' s.jpg");
+    for (const char* name : {"t.jpg", "t.tif", "t.png"}) {
+        EXPECT_THAT(writePhotograph(readPhotograph(folder / "s.jpg"), folder / name),
+                    testing::SizeIs(std::string(name) == "t.tif"));
+        const std::string tags =
+            folder.output(std::string("exiftool -s -OwnerName -Quality -ExifImageWidth ") + name);
+        EXPECT_THAT(tags, HasSubstr(": A. Person")) << name;
+        EXPECT_THAT(tags, HasSubstr(": Fine")) << name;
+        EXPECT_THAT(tags, HasSubstr(": 640")) << name;
+    }
+    EXPECT_THAT(folder.output("exiftool -Comment t.jpg"), HasSubstr("A comment"));
+}
+
+TEST(Metadata, WarnsOfMalformedXmpAndOfWhatAFormatCannotHold) {
+    const TestFolder folder;
+    folder.run("cp $S/rocket.jpg s.jpg && exiftool -q -overwrite_original -XMP:Title=zzzz s.jpg && sed -i "
+               "'s,</rdf:Alt>,</rdf:Axt>,' s.jpg && "
+               "cp $S/rocket.jpg k.jpg && exiftool -q -overwrite_original -IPTC:Keywords=night k.jpg");
+    const Photograph malformed = readPhotograph(folder / "s.jpg");
+    EXPECT_THAT(writePhotograph(malformed, folder / "t.jpg"),
+                ElementsAre(HasSubstr("XMP data is malformed")));
+    EXPECT_THAT(writePhotograph(malformed, folder / "t.tif"),
+                testing::Contains(HasSubstr("XMP data is malformed")));
+    for (const char* name : {"t.jpg", "t.tif"})
+        EXPECT_THAT(folder.text(name), HasSubstr("</rdf:Axt>"));
+    EXPECT_THAT(writePhotograph(readPhotograph(folder / "k.jpg"), folder / "t.webp"),
+                ElementsAre(HasSubstr("Keywords"), HasSubstr("comment")));
+}
+
+// Decoding a HEIF turns the pixels, so the tag must not turn them a second time.
+TEST(Metadata, IsUprightAfterHeif) {
+    const TestFolder folder;
+    folder.run("convert $S/coffee.png -resize 64x48! p.jpg && exiftool -q -overwrite_original "
+               "-Orientation#=6 -ISO=200 "
+               "-XMP-tiff:Orientation#=6 -XMP:Title=T p.jpg && vips heifsave p.jpg s.heic");
+    const Photograph photograph = readPhotograph(folder / "s.heic");
+    for (const char* name : {"t.jpg", "t.heic"}) {
+        EXPECT_THAT(writePhotograph(photograph, folder / name), testing::IsEmpty());
+        const std::string tags =
+            folder.output(std::string("exiftool -a -n -s3 -Orientation -ISO -Title ") + name);
+        EXPECT_EQ(tags, "1\n1\n200\nT\n") << name;
+    }
+}
+
+} // namespace

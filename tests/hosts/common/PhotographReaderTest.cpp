@@ -1,0 +1,127 @@
+#include "common/PhotographReader.h"
+
+#include "hosts/TestFiles.h"
+
+#include <gmock/gmock.h>
+#include <sys/wait.h>
+
+namespace {
+
+std::string refusal(const std::filesystem::path& path) {
+    try {
+        readPhotograph(path);
+    } catch (const PhotographError& error) {
+        return error.what();
+    }
+    return "read";
+}
+
+struct Bad {
+    const char* make;
+    const char* name;
+    const char* cause;
+};
+
+TEST(PhotographReader, RefusesEachBadFileByNameCauseAndAdvice) {
+    const TestFolder folder;
+    folder.run(
+        "convert $S/coffee.png -resize 200x p.png && vips copy p.png lzw.tif[compression=lzw] && "
+        "convert p.png whole.jpg && convert p.png -interlace JPEG prog.jpg && vips copy p.png whole.webp && "
+        "vips heifsave p.png whole.heic && convert p.png -compress RLE whole.psd");
+    const char* damaged = "cut short";
+    const Bad cases[] = {
+        {"true", "none.jpg", "there is no such file"},
+        {"mkdir folder.jpg", "folder.jpg", "is a folder"},
+        {": > empty.jpg", "empty.jpg", "the file is empty"},
+        {"mkfifo pipe.jpg", "pipe.jpg", "is not a regular file"},
+        {"echo Hello > text.jpg", "text.jpg", "is not a picture of a known kind"},
+        {"head -c -2 whole.jpg > a.jpg", "a.jpg", damaged},
+        {"head -c 3000 whole.jpg > b.jpg", "b.jpg", damaged},
+        {"head -c -900 prog.jpg > b.jpg", "b.jpg", damaged},
+        {"head -c 40 whole.jpg > c.jpg", "c.jpg", damaged},
+        {"head -c -2 p.png > a.png", "a.png", damaged},
+        {"head -c 9000 p.png > a.png", "a.png", damaged},
+        {"head -c -300 lzw.tif > a.tif", "a.tif", damaged},
+        {"convert p.png -compress None m.tif && head -c 20000 m.tif > a.tif", "a.tif", damaged},
+        {"head -c -300 whole.webp > a.webp", "a.webp", damaged},
+        {"head -c -300 whole.heic > a.heic", "a.heic", damaged},
+        {"head -c -300 whole.psd > a.psd", "a.psd", damaged},
+        {"printf '8BPS\\0\\1\\0\\0\\0\\0\\0\\0\\0\\3\\0\\0\\0\\0\\0\\0\\0\\1\\0\\10\\0\\3' > z.psd", "z.psd",
+         "has no pixels"},
+        {"printf '8BPS\\0\\1\\0\\0\\0\\0\\0\\0\\0\\3\\0\\0\\0\\1\\0\\0\\0\\1\\0\\40\\0\\3' > f.psd", "f.psd",
+         "32-bit float"},
+        {"printf '8BPS\\0\\1\\0\\0\\0\\0\\0\\0\\0\\5\\0\\0\\0\\1\\0\\0\\0\\1\\0\\10\\0\\4' > k.psd", "k.psd",
+         "more channels"},
+        {"vips bandjoin 'p.png p.png' five.tif && vips extract_band five.tif e.tif 0 --n 5", "e.tif",
+         "more than four channels"},
+        {"vips cast p.png float.tif float", "float.tif", "\"float\""},
+        {"vips colourspace p.png lab.tif lab", "lab.tif", "\"lab\""},
+        {"convert p.png -colorspace Lab lab8.tif", "lab8.tif", "\"lab"},
+        {"vips black wide.png 32768 1", "wide.png", "over 32767 pixels"},
+    };
+    for (const Bad& bad : cases) {
+        folder.run(bad.make);
+        const std::string text = refusal(folder / bad.name);
+        EXPECT_THAT(text, testing::StartsWith((folder / bad.name).string() + ": "));
+        EXPECT_THAT(text, testing::HasSubstr(bad.cause)) << bad.make;
+        EXPECT_THAT(text, testing::HasSubstr("; "));
+        EXPECT_THAT(text, testing::Not(testing::HasSubstr("\n")));
+    }
+}
+
+TEST(PhotographReader, NamesMissingPermission) {
+    const TestFolder folder;
+    folder.run("chmod 755 . && cp $S/rocket.jpg a.jpg && chmod 0 a.jpg");
+    const pid_t child = ::fork();
+    if (child == 0) {
+        const bool changed = ::getuid() != 0 || ::setuid(65534) == 0;
+        const std::string text = refusal(folder / "a.jpg");
+        ::_exit(changed && text.find("no permission") != std::string::npos ? 0 : 1);
+    }
+    int status = -1;
+    ::waitpid(child, &status, 0);
+    EXPECT_EQ(status, 0);
+}
+
+TEST(PhotographReader, ReadsBitmapsAsGreyAndTheFirstPageOfSeveral) {
+    const TestFolder folder;
+    folder.run("convert -size 9x2 xc:white -fill black -draw 'point 8,1' -monochrome -compress None m.png && "
+               "convert m.png -compress Group4 m.tif && convert m.png -compress None m.psd && "
+               "convert $S/coffee.png -resize 5x3! $S/rocket.jpg pages.tif");
+    for (const char* name : {"m.png", "m.tif", "m.psd"}) {
+        const Photograph read = readPhotograph(folder / name);
+        std::vector<std::uint8_t> expected(18, 255);
+        expected[17] = 0;
+        EXPECT_EQ(read.model, ColorModel::Grey) << name;
+        EXPECT_EQ(read.samples, expected) << name;
+    }
+    const Photograph first = readPhotograph(folder / "pages.tif");
+    EXPECT_EQ(first.pages, 2);
+    EXPECT_EQ(first.width, 5);
+    EXPECT_EQ(first.height, 3);
+}
+
+// Quality 75 4:2:2 keeps its horizontal resolution; 10 bits of HEIF reach full scale.
+TEST(PhotographReader, TellsTheEncoding) {
+    const TestFolder folder;
+    folder.run(
+        "convert $S/rocket.jpg -sampling-factor 2x1 -quality 75 h.jpg && vips black b.v 64 64 --bands 3 && "
+        "vips linear b.v w.v 1 65535 && vips cast w.v w.png ushort && vips heifsave w.png w.heic --bitdepth "
+        "10 --Q 100 && "
+        "convert $S/rocket.jpg -units PixelsPerInch -density 300x150 -sampling-factor 2x2 -quality 12 d.jpg");
+    const Photograph half = readPhotograph(folder / "h.jpg");
+    EXPECT_EQ(half.encoding.quality, 75);
+    EXPECT_FALSE(half.encoding.chromaSubsampled);
+    const Photograph dense = readPhotograph(folder / "d.jpg");
+    EXPECT_EQ(dense.encoding.quality, 12);
+    EXPECT_TRUE(dense.encoding.chromaSubsampled);
+    EXPECT_NEAR(dense.xResolution, 300 / 25.4, 1e-6);
+    EXPECT_NEAR(dense.yResolution, 150 / 25.4, 1e-6);
+    const Photograph white = readPhotograph(folder / "w.heic");
+    EXPECT_EQ(white.encoding.bitDepth, 10);
+    const auto sample = static_cast<unsigned>(white.samples[0] + 256 * white.samples[1]);
+    EXPECT_GT(sample, 0xFF00U);
+    EXPECT_EQ(sample & 63U, sample >> 10); // the high bits again below the ten
+}
+
+} // namespace
