@@ -2,7 +2,7 @@
 #include "GUI/Controls/CThinHorizontalSlider.h"
 #include "GUI/Windows/MessageBoxes.h"
 #include "Utility/DebugBoxes.h"
-#include "Utility/Logger.h"
+#include "support/LogCapture.h"
 
 #include <QAbstractButton>
 #include <QAccessible>
@@ -25,15 +25,6 @@ QImage painted(QWidget& widget, double scale = 1) {
     widget.render(&image);
     return image;
 }
-
-class LinesLogger : public ILogger {
-public:
-    explicit LinesLogger(QByteArrayList& lines) : mLines(lines) {}
-    void write(const QByteArray& line) override { mLines.append(line); }
-
-private:
-    QByteArrayList& mLines;
-};
 
 TEST(ZoneColor, KeepsBandsAndMixesBetweenTheirEdges) {
     const QList<ZoneStop> stops = {{100, kGreen}, {599, kGreen}, {600, kOrange}, {1000, QColor(0, 0, 0)}};
@@ -61,8 +52,7 @@ TEST(CThinHorizontalSlider, FillsUpToTheValueInTheColorOfItsZone) {
         EXPECT_EQ(at(70), kOrange);
         slider.setEnabled(false);
         EXPECT_EQ(at(34), QColor(110, 110, 110)) << "struck through";
-        EXPECT_EQ(painted(slider, scale).pixelColor(int(34 * scale), int(4.8 * scale)),
-                  QColor(200, 200, 200));
+        EXPECT_EQ(at(32), QColor(200, 200, 200));
         slider.setEnabled(true);
     }
     for (double beyond : {5000.0, double(INFINITY)}) {
@@ -72,17 +62,15 @@ TEST(CThinHorizontalSlider, FillsUpToTheValueInTheColorOfItsZone) {
 }
 
 TEST(CThinHorizontalSlider, WarnsOnceAndGoesGreyWithoutZones) {
-    QByteArrayList lines;
-    Log::install(std::make_unique<LinesLogger>(lines));
+    const LogCapture log;
     CThinHorizontalSlider slider;
     slider.resize(101, 7);
     slider.setZoneStops({{0, kGreen}});
     slider.setValue(500);
     EXPECT_EQ(painted(slider).pixelColor(30, 3), QColor(122, 122, 122));
     painted(slider);
-    Log::install(nullptr);
-    EXPECT_EQ(lines, QByteArrayList{
-                         "This slider is using loadDefaultColors, this is probably a programming error."});
+    EXPECT_EQ(log.lines().size(), 1u);
+    EXPECT_TRUE(log.has("This slider is using loadDefaultColors, this is probably a programming error."));
     EXPECT_EQ(slider.zoneStops(), (QList<ZoneStop>{{0, QColor(0, 0, 0)}, {1000, QColor(244, 244, 244)}}));
 }
 

@@ -4,7 +4,6 @@
 
 #include <QGraphicsScene>
 #include <QPainter>
-#include <QResizeEvent>
 #include <QScrollBar>
 #include <QSignalSpy>
 #include <QTest>
@@ -38,12 +37,7 @@ QString cellsOf(const QGraphicsScene& scene) {
     QStringList cells;
     for (const QGraphicsItem* item : scene.items(Qt::AscendingOrder)) {
         const QRectF at = item->sceneBoundingRect();
-        cells += QStringLiteral("%1:%2,%3,%4x%5")
-                     .arg(item->zValue())
-                     .arg(at.x())
-                     .arg(at.y())
-                     .arg(at.width())
-                     .arg(at.height());
+        cells += QString::asprintf("%g:%g,%g,%gx%g", item->zValue(), at.x(), at.y(), at.width(), at.height());
     }
     return cells.join(QLatin1Char(' '));
 }
