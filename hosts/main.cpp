@@ -1,3 +1,5 @@
-int main() {
-    return 0;
+#include "command/Command.h"
+
+int main(int argc, char** argv) {
+    return runCommand(argc, argv);
 }

@@ -1,0 +1,70 @@
+#include "command/Command.h"
+
+#include "Utility/PresetFile.h"
+#include "command/EnhanceCommand.h"
+#include "command/ModesCommand.h"
+
+#include <QCoreApplication>
+
+#include <CLI/CLI.hpp>
+#include <iostream>
+
+namespace {
+
+// A subcommand parses into an object of its own and leaves here what it is to do.
+using Action = std::function<ExitStatus()>;
+
+void addEnhance(CLI::App& program, Action& action, StopSignals& signals) {
+    CLI::App* command = program.add_subcommand("enhance", "Enhance photographs");
+    const auto options = std::make_shared<EnhanceOptions>();
+    options->declare(*command);
+    command->callback([&action, &signals, options] {
+        action = [&signals, options] { return enhancePhotographs(*options, signals); };
+    });
+}
+
+void addModes(CLI::App& program, Action& action) {
+    CLI::App* command = program.add_subcommand("modes", "List the modes and their sliders");
+    const auto asJson = std::make_shared<bool>(false);
+    command->add_flag("--json", *asJson, "as JSON");
+    command->callback([&action, asJson] { action = [asJson] { return listModes(*asJson); }; });
+}
+
+ExitStatus refuse(const char* text) {
+    std::cerr << "orvela: " << text << std::endl;
+    return ExitStatus::WrongUsage;
+}
+
+ExitStatus perform(const Action& action) {
+    try {
+        return action();
+    } catch (const UsageError& error) {
+        return refuse(error.what());
+    } catch (const PresetError& error) {
+        return refuse(error.what());
+    }
+}
+
+} // namespace
+
+int runCommand(int argc, char** argv) {
+    StopSignals signals;
+    QCoreApplication application(argc, argv);
+    QCoreApplication::setOrganizationName(QStringLiteral("Kestrand"));
+    QCoreApplication::setApplicationName(QStringLiteral("Orvela"));
+
+    CLI::App program("Enhances photographs.", "orvela");
+    program.set_version_flag("--version", "orvela " ORVELA_VERSION);
+    program.require_subcommand(1);
+    Action action;
+    addEnhance(program, action, signals);
+    addModes(program, action);
+    try {
+        program.parse(argc, argv);
+    } catch (const CLI::ParseError& error) {
+        const bool answered = program.exit(error) == 0; // --help and --version come this way, too
+        return static_cast<int>(answered ? ExitStatus::Done : ExitStatus::WrongUsage);
+    }
+    const ExitStatus status = perform(action);
+    return signals.received() ? kSignalBase + signals.received() : static_cast<int>(status);
+}

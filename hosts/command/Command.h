@@ -1,0 +1,4 @@
+#pragma once
+
+/// Runs the program with its arguments and returns its exit status. Called once, before any thread is made.
+int runCommand(int argc, char** argv);

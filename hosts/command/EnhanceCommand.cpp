@@ -1,0 +1,184 @@
+#include "command/EnhanceCommand.h"
+
+#include "Utility/Logger.h"
+#include "Utility/RowScheduler.h"
+#include "command/Enhancement.h"
+#include "command/ProgressLine.h"
+#include "command/Sources.h"
+#include "common/PhotographReader.h"
+#include "common/PhotographWriter.h"
+#include "common/TargetFile.h"
+
+#include <algorithm>
+#include <iostream>
+#include <new>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+// The work on all photographs of one command.
+class Batch {
+public:
+    Batch(const EnhanceOptions& options, const RunSettings& settings, std::vector<Job> jobs,
+          StopSignals& signals)
+        : mOptions(options), mSettings(settings), mJobs(std::move(jobs)), mSignals(signals),
+          mScheduler(options.threads), mProgress(static_cast<int>(mJobs.size()), !options.quiet) {}
+
+    ExitStatus run() {
+        ExitStatus worst = ExitStatus::Done;
+        for (mIndex = 0; mIndex < mJobs.size() && !mSignals.stopRequested(); ++mIndex)
+            worst = std::max(worst, runGuarded(mJobs[mIndex]));
+        return worst;
+    }
+
+private:
+    ExitStatus runGuarded(const Job& job);
+    void runJob(const Job& job);
+    void makeFolder();
+    Photograph read(const fs::path& source);
+    std::optional<TraceOptions> traceOf(const Job& job) const;
+    ExitStatus failed(ExitStatus status, const std::string& text);
+    void note(const std::string& text);
+
+    const EnhanceOptions& mOptions;
+    const RunSettings& mSettings;
+    const std::vector<Job> mJobs;
+    StopSignals& mSignals;
+    orvela::RowScheduler mScheduler;
+    ProgressLine mProgress;
+    std::size_t mIndex = 0;
+};
+
+ExitStatus Batch::failed(ExitStatus status, const std::string& text) {
+    note(text);
+    return status;
+}
+
+void Batch::note(const std::string& text) {
+    mProgress.clear();
+    std::cerr << "orvela: " << text << std::endl;
+}
+
+ExitStatus Batch::runGuarded(const Job& job) {
+    try {
+        runJob(job);
+        return ExitStatus::Done;
+    } catch (const StoppedError&) {
+        return ExitStatus::Done;
+    } catch (const TargetError& error) {
+        return failed(ExitStatus::TargetTrouble, error.what());
+    } catch (const PhotographError& error) {
+        return failed(ExitStatus::PhotographFailed, error.what());
+    } catch (const EngineFailure& error) {
+        return failed(ExitStatus::TargetTrouble, job.source.string() + ": " + error.what() +
+                                                     "; close other programs or use a smaller photograph");
+    } catch (const std::bad_alloc&) {
+        return failed(ExitStatus::TargetTrouble,
+                      job.source.string() + ": not enough memory; close other programs or use a smaller "
+                                            "photograph");
+    }
+}
+
+void Batch::runJob(const Job& job) {
+    mProgress.begin(QString::fromLocal8Bit(job.source.filename().c_str()));
+    makeFolder();
+    WriteOptions writing = mOptions.writing;
+    writing.stop = &mSignals.stopRequested();
+    std::error_code error;
+    if (!writing.overwrite && fs::exists(fs::symlink_status(job.target, error)))
+        throw TargetError(job.target.string() + ": exists already; use --force to overwrite it");
+    checkTargetPath(job.target, job.source, writing.overwrite);
+    Photograph photograph = read(job.source);
+    checkTarget(photograph, job.target, writing);
+    const std::optional<Photograph> result =
+        enhance(std::move(photograph), mSettings, traceOf(job), mSignals, mProgress);
+    if (!result)
+        return;
+    mProgress.step(1, 1, QStringLiteral("Writing"));
+    for (const std::string& warning : writePhotograph(*result, job.target, writing))
+        note(warning);
+    mProgress.clear();
+    if (!mOptions.quiet)
+        std::cout << job.source.string() << " -> " << job.target.string() << std::endl;
+}
+
+// A failure shows when the first target is looked at.
+void Batch::makeFolder() {
+    std::error_code error;
+    if (mOptions.targets.folder)
+        fs::create_directories(*mOptions.targets.folder, error);
+}
+
+// Reading cannot be stopped half-way, but leaves nothing behind either: a signal ends the program at once.
+Photograph Batch::read(const fs::path& source) {
+    const StopAction leave(mSignals, [this] { mSignals.leave(); });
+    return readPhotograph(source);
+}
+
+std::optional<TraceOptions> Batch::traceOf(const Job& job) const {
+    if (!mOptions.trace)
+        return std::nullopt;
+    fs::path folder = *mOptions.trace;
+    if (mJobs.size() > 1)
+        folder /= std::to_string(mIndex + 1) + "-" + job.source.filename().string();
+    return TraceOptions{folder, mOptions.writing.overwrite};
+}
+
+// The log and a saved preset must not fall on a photograph or a result.
+void refuseOverlap(const EnhanceOptions& options, const std::vector<Job>& jobs) {
+    for (const auto& file : {options.log, options.savePreset})
+        for (const Job& job : jobs)
+            if (file && (isSameFile(*file, job.source) || isSameFile(*file, job.target)))
+                throw UsageError(*file + ": is a photograph or a result; name another file");
+}
+
+void savePreset(const EnhanceOptions& options, const RunSettings& settings) {
+    if (options.savePreset)
+        settings.preset.write(QString::fromLocal8Bit(options.savePreset->c_str()));
+}
+
+bool openLog(const EnhanceOptions& options) {
+    if (!options.log)
+        return true;
+    auto logger = std::make_unique<CLoggerFile>(QByteArray::fromStdString(*options.log));
+    if (!logger->isOpen())
+        return false;
+    Log::setThreshold(LogLevel::Debug);
+    Log::install(std::move(logger));
+    return true;
+}
+
+ExitStatus targetTrouble(const std::string& text) {
+    std::cerr << "orvela: " << text << std::endl;
+    return ExitStatus::TargetTrouble;
+}
+
+} // namespace
+
+ExitStatus enhancePhotographs(const EnhanceOptions& options, StopSignals& signals) {
+    if (options.photographs.empty() && !options.savePreset)
+        throw UsageError("name the photographs to enhance");
+    const RunSettings settings = settle(options.settings);
+    const Sources sources = findSources(options.photographs);
+    const std::vector<Job> jobs = planTargets(sources.photographs, options.targets);
+    refuseOverlap(options, jobs);
+    for (const std::string& note : settings.notes)
+        std::cerr << "orvela: " << note << std::endl;
+    try {
+        savePreset(options, settings);
+    } catch (const PresetError& error) {
+        return targetTrouble(error.what());
+    }
+    for (const std::string& argument : sources.unmatched)
+        std::cerr << "orvela: " << argument << ": no photograph matches" << std::endl;
+    const ExitStatus unmatched = sources.unmatched.empty() ? ExitStatus::Done : ExitStatus::NothingMatched;
+    if (jobs.empty())
+        return unmatched;
+    if (!openLog(options))
+        return targetTrouble(*options.log + ": the log cannot be written; check the folder");
+    const ExitStatus worst = Batch(options, settings, jobs, signals).run();
+    Log::install(nullptr);
+    // A photograph that failed says more than an argument that matched nothing.
+    return worst == ExitStatus::Done ? unmatched : worst;
+}

@@ -1,0 +1,35 @@
+#pragma once
+
+#include "command/ExitStatus.h"
+#include "command/SettingOptions.h"
+#include "command/StopSignals.h"
+#include "command/Targets.h"
+#include "common/PhotographWriter.h"
+
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace CLI {
+class App;
+}
+
+/// The arguments of `orvela enhance`.
+struct EnhanceOptions {
+    std::vector<std::string> photographs; ///< files, folders and patterns
+    TargetOptions targets;
+    SettingOptions settings;
+    std::optional<std::string> savePreset;
+    std::optional<std::string> log;   ///< file for the engine's log
+    std::optional<std::string> trace; ///< folder for what each step did
+    int threads = 0;                  ///< 0: one per processor
+    bool quiet = false;
+    WriteOptions writing;
+
+    /// Declares the arguments to the parser, which fills this object when it parses.
+    void declare(CLI::App& app);
+};
+
+/// Enhances the photographs one after the other; a failed one does not keep the others from being done.
+/// @throws UsageError and PresetError before any work has started
+ExitStatus enhancePhotographs(const EnhanceOptions& options, StopSignals& signals);

@@ -1,0 +1,15 @@
+#pragma once
+
+#include <filesystem>
+#include <string>
+#include <vector>
+
+/// The photographs that the arguments of a command stand for.
+struct Sources {
+    std::vector<std::filesystem::path> photographs; ///< each file once, in the order of the arguments
+    std::vector<std::string> unmatched;             ///< folders and patterns without a photograph
+};
+
+/// An argument is a file (existing or not), a folder (the photographs in it, by name; results of earlier
+/// runs left out) or a shell pattern that no file matches literally.
+Sources findSources(const std::vector<std::string>& arguments);

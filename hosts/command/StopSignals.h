@@ -1,0 +1,59 @@
+#pragma once
+
+#include <atomic>
+#include <csignal>
+#include <functional>
+#include <mutex>
+#include <thread>
+
+/// Turns the signals that ask a program to end into a flag and a call, on a thread of its own, so that the
+/// work can stop in good order. Made first in the program: threads started before it would still die of the
+/// signals. SIGINT and SIGTERM always count, SIGHUP unless it was ignored when the program started.
+class StopSignals {
+public:
+    StopSignals();
+    ~StopSignals();
+    StopSignals(const StopSignals&) = delete;
+    StopSignals& operator=(const StopSignals&) = delete;
+
+    /// Number of the first signal that arrived, 0 while there was none.
+    int received() const { return mReceived; }
+
+    /// True from the first signal on; may be handed to whoever can stop early.
+    const std::atomic<bool>& stopRequested() const { return mStopRequested; }
+
+    /// Ends the program at once with the status of the signal. For an action while nothing would be left
+    /// behind.
+    [[noreturn]] void leave() const;
+
+private:
+    friend class StopAction;
+
+    void onStop(std::function<void()> stop);
+
+    void wait();
+    void take(int signal);
+
+    sigset_t mSignals;
+    std::atomic<int> mReceived = 0;
+    std::atomic<bool> mStopRequested = false;
+    std::atomic<bool> mEnding = false;
+    std::mutex mMutex;
+    std::function<void()> mStop;
+    std::thread mThread;
+};
+
+/// While it lives, `stop` is called on the signal thread at every signal, at once when one has arrived
+/// already. One at a time.
+class StopAction {
+public:
+    StopAction(StopSignals& signals, std::function<void()> stop) : mSignals(signals) {
+        mSignals.onStop(std::move(stop));
+    }
+    ~StopAction() { mSignals.onStop(nullptr); }
+    StopAction(const StopAction&) = delete;
+    StopAction& operator=(const StopAction&) = delete;
+
+private:
+    StopSignals& mSignals;
+};

@@ -1,0 +1,79 @@
+#include "command/Targets.h"
+
+#include "command/ExitStatus.h"
+#include "common/FileFormat.h"
+
+#include <array>
+#include <fstream>
+#include <map>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+constexpr std::string_view kSuffix = "-enhanced";
+
+// What the file is, whatever its name says; the name decides about files that cannot be read or are nothing
+// known, which fail later on.
+FileFormat formatOf(const fs::path& source) {
+    std::array<std::uint8_t, 16> start = {};
+    std::error_code error;
+    if (fs::is_regular_file(source, error))
+        std::ifstream(source, std::ios::binary).read(reinterpret_cast<char*>(start.data()), start.size());
+    if (const std::optional<FileFormat> format = formatOfContent(start))
+        return *format;
+    return formatOfExtension(source).value_or(FileFormat::Png);
+}
+
+fs::path targetOf(const fs::path& source, const TargetOptions& options) {
+    if (options.file)
+        return *options.file;
+    const fs::path beside = defaultTarget(source, formatOf(source));
+    if (!options.folder)
+        return beside;
+    fs::path name = source.stem();
+    return *options.folder / (name += beside.extension());
+}
+
+fs::path realPath(const fs::path& path) {
+    std::error_code error;
+    const fs::path real = fs::weakly_canonical(fs::absolute(path, error), error);
+    return error ? path : real;
+}
+
+void refuseSources(const Job& job, const std::vector<fs::path>& sources) {
+    for (const fs::path& source : sources)
+        if (isSameFile(job.target, source))
+            throw UsageError(job.target.string() +
+                             ": the result would overwrite a photograph that is read; name another target");
+}
+
+} // namespace
+
+std::vector<Job> planTargets(const std::vector<fs::path>& sources, const TargetOptions& options) {
+    if (options.file && options.folder)
+        throw UsageError("-o and -d exclude each other");
+    if (options.file && sources.size() > 1)
+        throw UsageError("-o takes the result of one photograph, " + std::to_string(sources.size()) +
+                         " were given; use -d FOLDER");
+    std::vector<Job> jobs;
+    std::map<fs::path, fs::path> sourceOfTarget;
+    for (const fs::path& source : sources) {
+        const Job& job = jobs.emplace_back(source, targetOf(source, options));
+        refuseSources(job, sources);
+        const auto [other, isNew] = sourceOfTarget.emplace(realPath(job.target), source);
+        if (!isNew)
+            throw UsageError(other->second.string() + " and " + source.string() + " would both become " +
+                             job.target.string() + "; enhance them apart");
+    }
+    return jobs;
+}
+
+bool isEarlierResult(const fs::path& file) {
+    return file.stem().string().ends_with(kSuffix);
+}
+
+bool isSameFile(const fs::path& a, const fs::path& b) {
+    std::error_code error;
+    return fs::equivalent(a, b, error) || realPath(a) == realPath(b);
+}

@@ -1,0 +1,28 @@
+#pragma once
+
+#include <filesystem>
+#include <optional>
+#include <vector>
+
+/// Where the results go.
+struct TargetOptions {
+    std::optional<std::filesystem::path> file;   ///< of the one result
+    std::optional<std::filesystem::path> folder; ///< of all results, under the names of their sources
+};
+
+/// One photograph and the file that its result goes to.
+struct Job {
+    std::filesystem::path source;
+    std::filesystem::path target;
+};
+
+/// The target of every source: the file or folder told, or NAME-enhanced.EXT beside the source. Formats that
+/// are read only give TIFF.
+/// @throws UsageError when two sources share a target or a target is one of the sources
+std::vector<Job> planTargets(const std::vector<std::filesystem::path>& sources, const TargetOptions& options);
+
+/// True for a file that a run without a target of its own wrote.
+bool isEarlierResult(const std::filesystem::path& file);
+
+/// True when both name the same existing file, or would.
+bool isSameFile(const std::filesystem::path& a, const std::filesystem::path& b);

@@ -1,0 +1,79 @@
+#include "command/TraceFolder.h"
+
+#include "common/PhotographWriter.h"
+
+#include <cstring>
+#include <fstream>
+#include <nlohmann/json.hpp>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+bool isSamePicture(const CARGBPlane& a, const CARGBPlane& b) {
+    for (const Channel channel : kChannels)
+        if (std::memcmp(a.samples(channel), b.samples(channel), static_cast<std::size_t>(a.pixelCount())) !=
+            0)
+            return false;
+    return true;
+}
+
+Photograph photographOf(const CARGBPlane& plane) {
+    Photograph photograph;
+    photograph.width = plane.width();
+    photograph.height = plane.height();
+    photograph.encoding.format = FileFormat::Png;
+    photograph.samples.reserve(static_cast<std::size_t>(plane.pixelCount()) * 3);
+    for (int i = 0; i < plane.pixelCount(); ++i)
+        for (const Channel channel : kChannels)
+            photograph.samples.push_back(plane.samples(channel)[i]);
+    return photograph;
+}
+
+nlohmann::ordered_json statisticsOf(const CUserParams& params) {
+    nlohmann::ordered_json statistics;
+#define ORVELA_STATISTIC_FIELD(type, name, value, listed) statistics[#name] = params.name;
+#define ORVELA_KEPT_FIELD(type, name, listed) statistics[#name] = params.name;
+#include "Utility/StatisticFields.inc"
+    return statistics;
+}
+
+void writeText(const fs::path& file, const std::string& text) {
+    std::ofstream stream(file, std::ios::binary);
+    stream << text << '\n';
+    if (!stream.flush())
+        throw TargetError(file.string() + ": cannot be written; check the folder and the free space");
+}
+
+} // namespace
+
+TraceFolder::TraceFolder(fs::path folder, bool overwrite, const CARGBPlane& original)
+    : mFolder(std::move(folder)), mOverwrite(overwrite), mLast(original, QStringLiteral("Trace")) {
+    std::error_code error;
+    fs::create_directories(mFolder, error);
+    if (!fs::is_directory(mFolder))
+        throw TargetError(mFolder.string() + ": the folder cannot be made (" + error.message() + ")");
+    if (!overwrite && !fs::is_empty(mFolder, error))
+        throw TargetError(mFolder.string() + ": holds files already; name an empty folder or use --force");
+}
+
+TraceFolder::~TraceFolder() = default;
+
+void TraceFolder::taskDone(const TaskReport& report, const CARGBPlane& picture, const CUserParams& params) {
+    if (report.kind != TaskKind::Filter || !report.applied || isSamePicture(picture, mLast))
+        return;
+    mLast.copyFrom(picture);
+    char name[160];
+    std::snprintf(name, sizeof name, "%02d-%s", ++mNumber, report.name);
+    WriteOptions options;
+    options.overwrite = mOverwrite;
+    writePhotograph(photographOf(picture), mFolder / (std::string(name) + ".png"), options);
+    const nlohmann::ordered_json content = {{"task", report.name},
+                                            {"statistics", statisticsOf(params)},
+                                            {"histograms",
+                                             {{"luma", params.pHisto_Luma},
+                                              {"red", params.pHisto_Red},
+                                              {"green", params.pHisto_Green},
+                                              {"blue", params.pHisto_Blue}}}};
+    writeText(mFolder / (std::string(name) + ".json"), content.dump(1));
+}
