@@ -56,9 +56,11 @@ TEST_F(EnhanceCommandTest, PhotographsThatAreReadAreNeverOverwritten) {
     sample("b.png");
     const QByteArray before = bytes("a.png");
     ASSERT_EQ(symlink("a.png", qPrintable(path("link.png"))), 0);
-    for (const char* arguments : {"enhance a.png -o a.png --force", "enhance a.png -o ./link.png --force",
-                                  "enhance a.png b.png -d . --force", "enhance a.png -o x.png --log a.png",
-                                  "enhance a.png -o x.png --save-preset a.png"})
+    ASSERT_EQ(link(qPrintable(path("a.png")), qPrintable(path("hard.png"))), 0);
+    for (const char* arguments :
+         {"enhance a.png -o a.png --force", "enhance a.png -o ./link.png --force",
+          "enhance a.png -o hard.png --force", "enhance a.png b.png -d . --force",
+          "enhance a.png -o x.png --log a.png", "enhance a.png -o x.png --save-preset a.png"})
         EXPECT_EQ(orvela(arguments).status, 2) << arguments;
     EXPECT_EQ(bytes("a.png"), before);
     EXPECT_FALSE(exists("x.png"));

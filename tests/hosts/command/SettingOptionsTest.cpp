@@ -132,6 +132,13 @@ TEST_F(SettingCommandTest, APresetGivesTheSameResultAndKeepsWhatItDoesNotKnow) {
     EXPECT_EQ(orvela("enhance a.png --preset bad.json -o 4.png").status, 2);
 }
 
+TEST_F(SettingCommandTest, TheFinalTouchIsAppliedToTheResult) {
+    sample("a.png");
+    ASSERT_EQ(orvela("enhance a.png --mode autocolor -o 1.png").status, 0);
+    ASSERT_EQ(orvela("enhance a.png --mode autocolor --final-touch AbsContrast=40 -o 2.png").status, 0);
+    EXPECT_NE(bytes("1.png"), bytes("2.png"));
+}
+
 TEST_F(SettingCommandTest, EveryModeIsListedWithItsSliders) {
     const Answer json = orvela("modes --json");
     ASSERT_EQ(json.status, 0);
