@@ -88,8 +88,8 @@ void CContrast_Brightness_Perceptual::takeContrast(float position) {
 }
 
 void CContrast_Brightness_Perceptual::takeBrightness(float position) {
-    const auto share = static_cast<float>((static_cast<double>(position) - 500) / 500);
-    mContrast.brightness = share * (position <= 500 ? mParams->m_B_H_C_F_Low : mParams->m_B_H_C_F_High);
+    const float factor = position <= 500 ? mParams->m_B_H_C_F_Low : mParams->m_B_H_C_F_High;
+    mContrast.brightness = static_cast<float>((static_cast<double>(position) - 500) / 500 * factor);
 }
 
 void CContrast_Brightness_Perceptual::logTouch() const {
