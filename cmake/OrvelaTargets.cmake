@@ -16,6 +16,13 @@ if(ORVELA_SANITIZE)
 endif()
 target_compile_definitions(orvela_options INTERFACE QT_NO_KEYWORDS)
 
+# orvela_automoc(TARGET): the target's sources go through moc. The build does not notice by itself that a file was
+# added to them: without the time stamp it looks at all of them again.
+function(orvela_automoc target)
+    set_target_properties(${target} PROPERTIES AUTOMOC ON)
+    file(REMOVE ${CMAKE_CURRENT_BINARY_DIR}/${target}_autogen/timestamp)
+endfunction()
+
 # orvela_library(NAME FOLDER...): a static library of every source below the given folders.
 function(orvela_library name)
     set(sources)
@@ -24,6 +31,7 @@ function(orvela_library name)
         list(APPEND sources ${found})
     endforeach()
     add_library(${name} STATIC ${sources})
-    set_target_properties(${name} PROPERTIES POSITION_INDEPENDENT_CODE ON AUTOMOC ON)
+    set_target_properties(${name} PROPERTIES POSITION_INDEPENDENT_CODE ON)
+    orvela_automoc(${name})
     target_link_libraries(${name} PUBLIC orvela_options)
 endfunction()
