@@ -92,7 +92,7 @@ constexpr SliderDescription kFinalTouch[] = {
     middle("sldrPercMiddleB", &P::mPerceptual_Touch_Middle_Value_B, &P::mPerceptual_Touch_Middle_B_Enabled,
            5),
     middle("sldrPercMiddleRGB", &P::mPerceptual_Touch_Middle_Value_RGB,
-           &P::mPerceptual_Touch_Middle_RGB_Enabled, 5),
+           &P::mPerceptual_Touch_Middle_RGB_Enabled, 13),
     highlights("sldrPercHighlightsR", &P::mPerceptual_Touch_Light_Value_R,
                &P::mPerceptual_Touch_Light_R_Enabled, 1),
     highlights("sldrPercHighlightsG", &P::mPerceptual_Touch_Light_Value_G,

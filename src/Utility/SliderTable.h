@@ -29,7 +29,7 @@ struct SliderDescription {
     double high;                  ///< shown number at position 1000
     float CSliderParams::*value;  ///< field that holds the position; null when the position is not used
     bool CSliderParams::*enabled; ///< field that holds the on/off state
-    int zones;                    ///< number of the set of track colours, 1 to 12
+    int zones;                    ///< number of the set of track colours, 1 to 13
     double initial;               ///< position before a preset or the user sets one
 };
 

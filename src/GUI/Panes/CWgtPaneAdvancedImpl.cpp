@@ -1,0 +1,59 @@
+#include "GUI/Panes/CWgtPaneAdvancedImpl.h"
+
+#include "Core/CThreadedCore_Orvela.h"
+#include "GUI/Presets/FactoryPresets.h"
+#include "Utility/Logger.h"
+
+CWgtPaneAdvancedImpl::CWgtPaneAdvancedImpl(QWidget* owner, EGUIMode mode) : IWgtPane(owner, mode) {
+    mShowsPresets = true;
+    setupUi(this);
+    sldrAutoContrast->hide();
+    setUpSliders(SliderTable::advanced(), CSliderParams());
+    setUpColorPicker(colrPickAutoColor, sldrColorFilter);
+    extendSettings(false);
+}
+
+void CWgtPaneAdvancedImpl::doSetSliders(const QString& presetName) {
+    const CUserParamsPhotoshop factory(FactoryPresets::factoryPresetMode(presetName));
+    const CSliderParams& settings = factory.mSliderParams;
+    setUpSliders(SliderTable::advanced(), settings);
+    colrPickAutoColor->setColor(
+        QColor(int(settings.mColor_Value_R), int(settings.mColor_Value_G), int(settings.mColor_Value_B)));
+}
+
+void CWgtPaneAdvancedImpl::applyGUIParams(CUserParams& params) {
+    CSliderParams& settings = params.mSliderParams;
+    writeSliders(SliderTable::advanced(), settings);
+    const QColor color = colrPickAutoColor->color();
+    settings.mColor_Value_R = static_cast<float>(color.red());
+    settings.mColor_Value_G = static_cast<float>(color.green());
+    settings.mColor_Value_B = static_cast<float>(color.blue());
+    Log::log(LogLevel::Debug, "CWgtPaneAdvancedImpl::applyGUIParams");
+    params.list(QStringLiteral("CWgtPaneAdvancedImpl::applyGUIParams"));
+    Log::log(LogLevel::Debug, "CWgtPaneAdvancedImpl::applyGUIParams finished.");
+}
+
+CThreadedCore* CWgtPaneAdvancedImpl::createCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* owner) {
+    auto* core = new CThreadedCore_Orvela(inPlane, outPlane, owner);
+    enableAfterRuns(btnFinalTouch, core);
+    return core;
+}
+
+void CWgtPaneAdvancedImpl::on_btnFinalTouch_clicked() {
+    Q_EMIT changeMode(Mode_FinalTouch);
+}
+
+void CWgtPaneAdvancedImpl::on_btnExtendSettings_clicked() {
+    extendSettings(true);
+}
+
+void CWgtPaneAdvancedImpl::on_btnCollapseSettings_clicked() {
+    extendSettings(false);
+}
+
+void CWgtPaneAdvancedImpl::extendSettings(bool extended) {
+    btnExtendSettings->setVisible(!extended);
+    btnCollapseSettings->setVisible(extended);
+    for (QGroupBox* group : {grpBxPerceptualAbsolute, grpBxArtefacts, grpBxColor})
+        group->setVisible(extended);
+}

@@ -1,0 +1,84 @@
+#pragma once
+
+#include "Utility/SliderTable.h"
+
+#include <QWidget>
+
+#include <span>
+
+class CARGBPlane;
+class CColorPicker;
+class COrvelaSliderBlockImpl;
+class CThreadedCore;
+class QComboBox;
+
+/// The controls of one family of modes: knows how they are labelled and scaled, which setting each of them
+/// drives and which core works with them.
+class IWgtPane : public QWidget {
+    Q_OBJECT
+
+public:
+    /// @param owner  the window that the pane belongs to. Its slots onMy_slider_valueChanged(double),
+    ///               onMy_slider_stateChanged(bool) and onMy_colorPicker_colorChanged(QColor) are told of
+    ///               every change.
+    IWgtPane(QWidget* owner, EGUIMode mode);
+
+    EGUIMode mode() const { return mMode; }
+    /// Whether the window offers presets beside this pane.
+    bool showsPresets() const { return mShowsPresets; }
+    /// Whether changes are processed by themselves until the user decides otherwise.
+    bool autoRefresh() const { return mAutoRefresh; }
+    /// Whether the pane goes on from the processed image rather than from the original.
+    bool takesProcessedImage() const { return mTakesProcessedImage; }
+
+    /// Writes what the controls show into the fields of `params` that they drive.
+    virtual void applyGUIParams(CUserParams& params) = 0;
+
+    /// Makes the core of the pane's modes, a child of `owner`. The planes are not owned.
+    virtual CThreadedCore* createCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* owner) = 0;
+
+    /// Puts the controls to a factory preset.
+    void setSliders(const QString& presetName);
+
+protected:
+    /// What setSliders() does once every slider is off and at position 500.
+    virtual void doSetSliders(const QString& presetName);
+
+public:
+    /// Adds the pane's own entries.
+    virtual void fillPresetList(QComboBox* list);
+
+Q_SIGNALS:
+    /// The user asks for the pane of another mode.
+    void changeMode(EGUIMode mode);
+
+protected:
+    /// The block that `slider` describes.
+    COrvelaSliderBlockImpl* block(const SliderDescription& slider) const;
+
+    /// Labels the block, puts it to position 500 and tells the owner of its changes. Further calls make the
+    /// owner hear of a change once more.
+    void setUpSlider(COrvelaSliderBlockImpl* block, const QString& label);
+    /// Gives the slider's block all that its description holds, the state and the position (0 to 1000).
+    void setUpSlider(const SliderDescription& slider, bool on, double position);
+    /// Sets up every slider with the states and positions of `settings`.
+    void setUpSliders(std::span<const SliderDescription> sliders, const CSliderParams& settings);
+    /// Tells the owner of the picker's changes and shows it while its slider is on.
+    void setUpColorPicker(CColorPicker* picker, COrvelaSliderBlockImpl* slider);
+
+    /// Writes position and state of every slider into the fields that it drives.
+    void writeSliders(std::span<const SliderDescription> sliders, CSliderParams& settings) const;
+
+    /// Disables `button` when a run of `core` starts and enables it again when it was completed.
+    void enableAfterRuns(QWidget* button, CThreadedCore* core);
+
+    bool mShowsPresets = false;
+    bool mAutoRefresh = false;
+    bool mTakesProcessedImage = false;
+
+private:
+    void resetSliders();
+
+    QWidget* mOwner;
+    EGUIMode mMode;
+};

@@ -1,0 +1,183 @@
+#include "Core/CThreadedCore.h"
+#include "GUI/Controls/CColorPicker.h"
+#include "GUI/Panes/CWgtPaneAdvancedImpl.h"
+#include "PaneFixture.h"
+#include "Utility/CARGBPlane.h"
+#include "Utility/ModeTable.h"
+
+#include <QSignalSpy>
+#include <QTest>
+
+#include <gtest/gtest.h>
+
+namespace {
+
+class AdvancedPane : public testing::Test {
+protected:
+    void load(const char* preset) { pane->setSliders(QString::fromLatin1(preset)); }
+    void click(QAbstractButton* button) { QTest::mouseClick(button, Qt::LeftButton); }
+
+    Shown<CWgtPaneAdvancedImpl> shown{Mode_Advanced};
+    CWgtPaneAdvancedImpl* pane = shown.pane;
+};
+
+const std::vector<Drives> kSliders = {
+    {"sldrTemperature", "Temperature_Value", "Temperature_Enabled"},
+    {"sldrGamma_Abs", "GammaCorrectionValue", "GammaCorrectionEnabled"},
+    {"sldrNoise", "BilinearFilteringValue", "BilinearFilteringEnabled"},
+    {"sldrAutoContrast", "", "AutoContrast_Enabled"},
+    {"sldrContrast_Abs", "ContrastValue", "ContrastEnabled"},
+    {"sldrContrast_Perc", "Contrast2Value", "Contrast2Enabled"},
+    {"sldrBrightness_Abs", "BrightnessValue", "BrightnessEnabled"},
+    {"sldrBrightness_Perc", "Brightness2Value", "Brightness2Enabled"},
+    {"sldrIllumination", "ClarityFilterValue", "ClarityFilterEnabled"},
+    {"sldrDigitalFlash", "mDigital_Flash_Value", "DigitalFlashEnabled"},
+    {"sldrSaturation", "SaturationValue", "SaturationEnabled"},
+    {"sldrBlackAndWhiteSpots", "SaltPepperValue", "SaltPepperEnabled"},
+    {"sldrOrvela1", "OrvelaLevelValue", "OrvelaLevelEnabled"},
+    {"sldrOrvela2", "OrvelaLevel2Value", "OrvelaLevel2Enabled"},
+    {"sldrOrvela3", "OrvelaLevel3Value", "OrvelaLevel3Enabled"},
+    {"sldrShadows_Perc", "PerceptualDark", "PerceptualDarkEnabled"},
+    {"sldrMiddle_Perc", "PerceptualMiddle", "PerceptualMiddleEnabled"},
+    {"sldrHighlights_Perc", "PerceptualLight", "PerceptualLightEnabled"},
+    {"sldrShadows_Abs", "mAbsolute_Dark_Value", "mAbsolute_Dark_Enabled"},
+    {"sldrMiddle_Abs", "mAbsolute_Middle_Value", "mAbsolute_Middle_Enabled"},
+    {"sldrHighlights_Abs", "mAbsolute_Light_Value", "mAbsolute_Light_Enabled"},
+    {"sldrGamma_Perc", "PerceptualGamma", "PerceptualGammaEnabled"},
+    {"sldrMoire", "mMoire_Value", "Moire_Enabled"},
+    {"sldrAutoColor", "mAuto_Color_Value", "mAuto_Color_Enabled"},
+    {"sldrFade", "mFade_Value", "mFade_Enabled"},
+    {"sldrColorFilter", "mColor_Effect_Intensity_Value", "mColor_Effect_Intensity_Enabled"},
+};
+
+TEST_F(AdvancedPane, WritesEverySliderIntoItsOwnFields) {
+    pane->colrPickAutoColor->setColor(QColor(12, 34, 56));
+    expectWrites(pane, kSliders, "mColor_Value_", QColor(12, 34, 56));
+    const QByteArrayList lines = logged([this] {
+        CUserParams params;
+        pane->applyGUIParams(params);
+    });
+    EXPECT_EQ(lines.first(), "CWgtPaneAdvancedImpl::applyGUIParams");
+    EXPECT_TRUE(lines.contains("-> Begin Globals Listing: CWgtPaneAdvancedImpl::applyGUIParams"));
+    EXPECT_EQ(lines.last(), "CWgtPaneAdvancedImpl::applyGUIParams finished.");
+}
+
+TEST_F(AdvancedPane, SlidersShowEveryPosition) {
+    load("Portrait");
+    for (const SliderDescription& slider : SliderTable::advanced())
+        expectShowsEveryPosition(pane, slider);
+}
+
+TEST_F(AdvancedPane, FactoryPresetsGiveTheValuesOfTheirModes) {
+    int presets = 0;
+    for (const ModeDescription& mode : ModeTable::all()) {
+        if (!mode.presetName)
+            continue;
+        SCOPED_TRACE(mode.presetName);
+        ++presets;
+        load(mode.presetName);
+        CUserParamsPhotoshop applied(Mode_Advanced);
+        pane->applyGUIParams(applied);
+        const CUserParamsPhotoshop factory(mode.mode);
+        for (const SliderDescription& slider : SliderTable::advanced()) {
+            SCOPED_TRACE(slider.object);
+            EXPECT_EQ(applied.mSliderParams.*slider.enabled, factory.mSliderParams.*slider.enabled);
+            if (slider.value) {
+                const float position = factory.mSliderParams.*slider.value;
+                EXPECT_NEAR(applied.mSliderParams.*slider.value, position, snapping(slider, position));
+            }
+        }
+        EXPECT_EQ(pane->colrPickAutoColor->color(), QColor(Qt::black));
+        EXPECT_EQ(pane->sldrAutoContrast->value(), 0);
+    }
+    EXPECT_EQ(presets, 12);
+    const QStringList shownBoxes = boxes([this] { load("portrait"); });
+    EXPECT_EQ(shownBoxes, QStringList(QStringLiteral("Note:|Unknown preset:portrait")));
+    EXPECT_EQ(pane->sldrContrast_Perc->value(), 550) << "the values of Portrait";
+}
+
+TEST_F(AdvancedPane, TypedNumbersBecomePositions) {
+    load("Portrait");
+    for (const auto& [typed, position] : {std::pair("1.0", 500), {"10", 1000}, {"0.1", 0}}) {
+        for (auto* block : {pane->sldrGamma_Abs, pane->sldrMiddle_Perc, pane->sldrGamma_Perc}) {
+            block->setEnabled(true);
+            block->txtValue->selectAll();
+            QTest::keyClicks(block->txtValue, QLatin1String(typed));
+            EXPECT_NEAR(block->value(), position, 1e-9) << typed;
+        }
+    }
+    pane->sldrHighlights_Perc->setVirtualValue(255);
+    EXPECT_EQ(pane->sldrHighlights_Perc->value(), 0);
+}
+
+TEST_F(AdvancedPane, TellsItsOwnerOfEveryChange) {
+    shown.owner.values.clear();
+    shown.owner.states.clear();
+    pane->sldrFade->setValue(420);
+    pane->sldrFade->setEnabled(true);
+    pane->colrPickAutoColor->setColor(Qt::red);
+    EXPECT_EQ(shown.owner.values, QList<double>{420});
+    EXPECT_EQ(shown.owner.states, QList<bool>{true});
+    EXPECT_EQ(shown.owner.colors.last(), QColor(Qt::red));
+    load("Automatic");
+    shown.owner.values.clear();
+    pane->sldrFade->setValue(430);
+    EXPECT_EQ(shown.owner.values, (QList<double>{430, 430})) << "set up twice, told twice";
+}
+
+TEST_F(AdvancedPane, FoldsTheRarelyUsedGroupsAway) {
+    const auto expectExtended = [this](bool extended) {
+        for (QWidget* widget :
+             {static_cast<QWidget*>(pane->grpBxPerceptualAbsolute),
+              static_cast<QWidget*>(pane->grpBxArtefacts), static_cast<QWidget*>(pane->grpBxColor),
+              static_cast<QWidget*>(pane->btnCollapseSettings)})
+            EXPECT_EQ(widget->isVisible(), extended) << qPrintable(widget->objectName());
+        EXPECT_EQ(pane->btnExtendSettings->isVisible(), !extended);
+        EXPECT_TRUE(pane->sldrFade->isVisible());
+        EXPECT_FALSE(pane->sldrAutoContrast->isVisible());
+    };
+    expectExtended(false);
+    click(pane->btnExtendSettings);
+    expectExtended(true);
+    pane->sldrColorFilter->setEnabled(true);
+    EXPECT_TRUE(pane->colrPickAutoColor->isVisible());
+    pane->sldrColorFilter->setEnabled(false);
+    EXPECT_FALSE(pane->colrPickAutoColor->isVisible());
+    click(pane->btnCollapseSettings);
+    expectExtended(false);
+}
+
+TEST_F(AdvancedPane, OffersFinalTouchOnceARunWasCompleted) {
+    EXPECT_TRUE(pane->showsPresets());
+    EXPECT_FALSE(pane->autoRefresh() || pane->takesProcessedImage());
+    QSignalSpy changed(pane, &IWgtPane::changeMode);
+    CARGBPlane in(16, 16, QStringLiteral("in"));
+    CARGBPlane out(16, 16, QStringLiteral("out"));
+    CThreadedCore* core = pane->createCore(&in, &out, &shown.owner);
+    EXPECT_STREQ(core->metaObject()->className(), "CThreadedCore_Orvela");
+    EXPECT_EQ(core->parent(), &shown.owner);
+    Q_EMIT core->started();
+    click(pane->btnFinalTouch);
+    EXPECT_EQ(changed.count(), 0);
+    Q_EMIT core->terminated();
+    EXPECT_FALSE(pane->btnFinalTouch->isEnabled()) << "no run was completed";
+    QObject::connect(core, &CThreadedCore::stepDone, core, &CThreadedCore::stepHandled);
+    core->setParams(CUserParamsPhotoshop(Mode_Advanced));
+    core->run();
+    Q_EMIT core->finished();
+    click(pane->btnFinalTouch);
+    ASSERT_EQ(changed.count(), 1);
+    EXPECT_EQ(changed[0][0].value<EGUIMode>(), Mode_FinalTouch);
+}
+
+TEST_F(AdvancedPane, LogsLabelStateAndRangeOfEachSlider) {
+    const QByteArrayList lines = logged([this] { load("Landscape"); });
+    EXPECT_EQ(lines.size(), 3 * 26);
+    const qsizetype at = lines.indexOf("Highlights");
+    ASSERT_EQ(at, 3 * 17);
+    EXPECT_EQ(lines[at + 1], "Enabled:0");
+    EXPECT_TRUE(lines[at + 2].startsWith("Range:[255.00,0.00] Default:"));
+    EXPECT_EQ(lines[lines.indexOf("Fade") + 1], "Enabled:1");
+}
+
+} // namespace
