@@ -3,6 +3,7 @@
 #include "Filters/PictureConditions.h"
 #include "Filters/PixelMath.h"
 #include "Histograms/HistogramRecount.h"
+#include "Utility/LevelSwitches.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>
@@ -36,11 +37,11 @@ bool CAuto_Contrast_TEST::PreApply() {
 
 bool CAuto_Contrast_TEST::applies() const {
     const CSliderParams& s = mParams->mSliderParams;
-    const bool corrected = s.AutoContrast_Enabled || s.PerceptualDarkEnabled || s.PerceptualLightEnabled ||
-                           s.PerceptualMiddleEnabled || s.OrvelaLevelEnabled || s.OrvelaLevel2Enabled;
+    const bool corrected = s.AutoContrast_Enabled || LevelSwitches::anyPerceptual(s) ||
+                           s.OrvelaLevelEnabled || s.OrvelaLevel2Enabled;
     const bool plain = isAutomaticMode(s) || !corrected;
-    const bool manual = s.mAbsolute_Dark_Enabled || s.mAbsolute_Light_Enabled || s.mAbsolute_Middle_Enabled ||
-                        s.BrightnessEnabled || s.ContrastEnabled || s.GammaCorrectionEnabled;
+    const bool manual =
+        LevelSwitches::anyAbsolute(s) || s.BrightnessEnabled || s.ContrastEnabled || s.GammaCorrectionEnabled;
     const bool purelyAutomatic = !manual && plain && !s.ClarityFilterEnabled && mParams->Normal_Picture &&
                                  !mParams->Under_Exposed_Picture;
     return !s.mAuto_Color_Enabled && !purelyAutomatic;

@@ -1,7 +1,7 @@
 #include "Filters/CLevel_Middle.h"
 
-#include "Filters/LevelSwitches.h"
 #include "Filters/PixelMath.h"
+#include "Utility/LevelSwitches.h"
 #include "Utility/Logger.h"
 
 #include <utility>
