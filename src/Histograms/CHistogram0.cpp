@@ -41,17 +41,15 @@ void CHistogram0::countGreys(std::uint32_t row, RowCounts& counts) const {
 bool CHistogram0::PostApply() {
     scaleBins();
     storeBandShares();
-    mParams->m_Histo_Light_Exception =
-        HighlightShares<double>::of(mRed, mGreen, mBlue, mInPlane->pixelCount()).flag();
+    mParams->m_Histo_Light_Exception = HighlightShares<double>::of(mRed, mGreen, mBlue, pixels()).flag();
     storeMeans();
     return true;
 }
 
 void CHistogram0::storeBandShares() const {
-    const double pixels = mInPlane->pixelCount();
-    mParams->m_Dark_Acu = sumOf(mLuma, 1, 85) / pixels;
-    mParams->m_Middle_Acu = sumOf(mLuma, 86, 170) / pixels;
-    mParams->m_Light_Acu = sumOf(mLuma, 220, 255) / pixels;
+    mParams->m_Dark_Acu = sumOf(mLuma, 1, 85) / pixels();
+    mParams->m_Middle_Acu = sumOf(mLuma, 86, 170) / pixels();
+    mParams->m_Light_Acu = sumOf(mLuma, 220, 255) / pixels();
 }
 
 void CHistogram0::storeMeans() const {

@@ -18,7 +18,6 @@ void CHistogram_VIII::ApplyRow(std::uint32_t row) {
 bool CHistogram_VIII::PostApply() {
     scaleBins();
     storeMeans();
-    mParams->m_Histo_Light_Exception =
-        HighlightShares<float>::of(mRed, mGreen, mBlue, mInPlane->pixelCount()).flag();
+    mParams->m_Histo_Light_Exception = HighlightShares<float>::of(mRed, mGreen, mBlue, pixels()).flag();
     return true;
 }

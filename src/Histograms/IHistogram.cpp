@@ -110,8 +110,7 @@ void IHistogram::scaleBins() {
 
 void IHistogram::storeMeans() const {
     const auto mean = [this](std::uint32_t sum) {
-        const double value =
-            static_cast<double>(static_cast<float>(sum)) * mHistoFactor / mInPlane->pixelCount();
+        const double value = static_cast<double>(static_cast<float>(sum)) * mHistoFactor / pixels();
         return std::trunc(static_cast<float>(value));
     };
     mParams->m_OriginalLuma = mean(mSumLuma);

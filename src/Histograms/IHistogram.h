@@ -2,6 +2,7 @@
 
 #include "Filters/TaskBase.h"
 
+#include <algorithm>
 #include <mutex>
 
 /// A task that counts the samples of a plane into four 256-bin histograms and publishes them, with
@@ -44,6 +45,8 @@ protected:
     /// Adds a row's counts to the measurement; the sums and counters wrap at 2^32.
     /// @param warnNearWrap  log a warning when a sum comes within 256 of wrapping
     void merge(const RowCounts& counts, bool warnNearWrap = false);
+    /// Pixels of the plane that shares and means are taken over; 1 for an empty one, whose sums are 0.
+    int pixels() const { return std::max(1, mInPlane->pixelCount()); }
     /// Weighs the bins so that they estimate counts of the whole picture.
     void scaleBins();
     /// Publishes the mean luma and the channel means, truncated.

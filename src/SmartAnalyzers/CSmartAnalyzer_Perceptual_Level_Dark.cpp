@@ -1,8 +1,9 @@
 #include "SmartAnalyzers/CSmartAnalyzer_Perceptual_Level_Dark.h"
 
 #include "SmartAnalyzers/ToneMass.h"
-#include "Utility/LevelSwitches.h"
 #include "Utility/Logger.h"
+
+#include <algorithm>
 
 using namespace ToneMass;
 
@@ -28,6 +29,16 @@ constexpr TouchChannel kTouchChannels[] = {
     {&CSliderParams::mPerceptual_Touch_Dark_B_Enabled, &CUserParams::pHisto_Blue, &CUserParams::m_L_H_L_F_B},
 };
 
+bool anyPerceptualTouch(const CSliderParams& sliders) {
+    return std::any_of(std::begin(kTouchChannels), std::end(kTouchChannels),
+                       [&](const TouchChannel& channel) { return sliders.*channel.enabled; });
+}
+
+bool anyTouch(const CSliderParams& sliders) {
+    return sliders.mDark_Touch_RGB_Enabled || sliders.mDark_Touch_R_Enabled ||
+           sliders.mDark_Touch_G_Enabled || sliders.mDark_Touch_B_Enabled;
+}
+
 double darkMass(const Histogram& bins, int center) {
     const Curve pulled = tabulate([](int i) { return i - kPull * (1 - i / 255.0); });
     return fallingMass(remap(bins, pulled), center, kSlope);
@@ -41,7 +52,7 @@ void CSmartAnalyzer_Perceptual_Level_Dark::Analyze() {
     if (!mParams->Final_Touch_Mode_Enabled) {
         if (sliders.PerceptualDarkEnabled && !sliders.mAbsolute_Dark_Enabled)
             analyzeMain();
-    } else if (LevelSwitches::touchPerceptualDark(sliders) && !LevelSwitches::touchDark(sliders)) {
+    } else if (anyPerceptualTouch(sliders) && !anyTouch(sliders)) {
         analyzeTouch();
     }
     Log::log(LogLevel::Debug, "CSmartAnalyzer_Perceptual_Level_Dark complete.");
@@ -64,7 +75,7 @@ void CSmartAnalyzer_Perceptual_Level_Dark::analyzeMain() const {
         mParams->m_L_H_L_F = 0;
         return;
     }
-    const double share = mass / mInPlane->pixelCount();
+    const double share = mass / pixels();
     mParams->m_L_H_L_F = static_cast<float>(share * kMainGain);
     Log::log(LogLevel::Debug, "m_L_L_C_F_Low %f", share);
     Log::log(LogLevel::Debug, "m_L_H_L_F %f", static_cast<double>(mParams->m_L_H_L_F));
@@ -76,7 +87,6 @@ void CSmartAnalyzer_Perceptual_Level_Dark::analyzeTouch() const {
         if (!(mParams->mSliderParams.*channel.enabled))
             continue;
         const double mass = darkMass(mParams->*channel.bins, center);
-        mParams->*channel.coefficient =
-            mass > 0 ? static_cast<float>(mass / mInPlane->pixelCount() * kTouchGain) : 0.0F;
+        mParams->*channel.coefficient = mass > 0 ? static_cast<float>(mass / pixels() * kTouchGain) : 0.0F;
     }
 }

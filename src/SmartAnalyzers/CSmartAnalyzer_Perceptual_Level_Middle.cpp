@@ -1,7 +1,6 @@
 #include "SmartAnalyzers/CSmartAnalyzer_Perceptual_Level_Middle.h"
 
 #include "SmartAnalyzers/ToneMass.h"
-#include "Utility/LevelSwitches.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>
@@ -67,11 +66,13 @@ void logDarkened(const Histogram& bins) {
 void CSmartAnalyzer_Perceptual_Level_Middle::Analyze() {
     Log::log(LogLevel::Debug, "CSmartAnalyzer_Perceptual_Level_Middle is starting.");
     const CSliderParams& sliders = mParams->mSliderParams;
-    const bool perceptual = LevelSwitches::anyPerceptual(sliders) || sliders.PerceptualGammaEnabled;
+    const bool perceptual = anyPerceptualLevel(sliders) || sliders.PerceptualGammaEnabled;
+    const bool touched = std::any_of(std::begin(kTouchChannels), std::end(kTouchChannels),
+                                     [&](const TouchChannel& channel) { return sliders.*channel.enabled; });
     if (!mParams->Final_Touch_Mode_Enabled) {
-        if (perceptual && !sliders.GammaCorrectionEnabled && !LevelSwitches::anyAbsolute(sliders))
+        if (perceptual && !sliders.GammaCorrectionEnabled && !anyAbsoluteLevel(sliders))
             analyzeMain();
-    } else if (LevelSwitches::touchPerceptualMiddle(sliders)) {
+    } else if (touched) {
         analyzeTouch();
     }
     Log::log(LogLevel::Debug, "CSmartAnalyzer_Perceptual_Level_Middle finished..");
@@ -80,11 +81,10 @@ void CSmartAnalyzer_Perceptual_Level_Middle::Analyze() {
 void CSmartAnalyzer_Perceptual_Level_Middle::analyzeMain() const {
     Log::log(LogLevel::Debug, "CSmartAnalyzer_Perceptual_Level_Middle Condition matched.");
     CUserParams& params = *mParams;
-    const int pixels = mInPlane->pixelCount();
     logDarkened(params.pHisto_Luma);
     params.m_M_L_C_F_Hight =
-        static_cast<float>(inverseShare(0.7267330288887024, highMass(params.pHisto_Luma), pixels, 1));
-    params.m_M_L_C_F_Low = static_cast<float>(lowMass(params.pHisto_Luma) / pixels * 0.6163860327556137);
+        static_cast<float>(inverseShare(0.7267330288887024, highMass(params.pHisto_Luma), pixels(), 1));
+    params.m_M_L_C_F_Low = static_cast<float>(lowMass(params.pHisto_Luma) / pixels() * 0.6163860327556137);
     params.m_M_H_L_F = std::min(params.m_M_L_C_F_Low, kMostLow);
     params.m_M_H_H_F = 2 * params.m_M_L_C_F_Hight;
 }
@@ -92,15 +92,14 @@ void CSmartAnalyzer_Perceptual_Level_Middle::analyzeMain() const {
 void CSmartAnalyzer_Perceptual_Level_Middle::analyzeTouch() const {
     Log::log(LogLevel::Debug, "CSmartAnalyzer_Perceptual_Level_Middle_TOUCH  Condition matched.");
     CUserParams& params = *mParams;
-    const double pixels = mInPlane->pixelCount();
-    Log::log(LogLevel::Debug, "iImageSize %f", pixels);
+    Log::log(LogLevel::Debug, "iImageSize %f", static_cast<double>(mInPlane->pixelCount()));
     for (const TouchChannel& channel : kTouchChannels) {
         if (!(params.mSliderParams.*channel.enabled))
             continue;
         const double low = lowMass(params.*channel.bins);
         Log::log(LogLevel::Debug, "%s %f", channel.label, low);
-        params.m_M_L_C_F_Hight = static_cast<float>(highMass(params.*channel.bins) / pixels / 255);
-        params.m_M_L_C_F_Low = static_cast<float>(low / pixels / 255);
+        params.m_M_L_C_F_Hight = static_cast<float>(highMass(params.*channel.bins) / pixels() / 255);
+        params.m_M_L_C_F_Low = static_cast<float>(low / pixels() / 255);
         params.*channel.low = params.m_M_L_C_F_Low;
         params.*channel.high = params.m_M_L_C_F_Hight;
     }

@@ -1,7 +1,6 @@
 #include "SmartAnalyzers/CSmartAnalyzer_Perceptual_Level_Right.h"
 
 #include "SmartAnalyzers/ToneMass.h"
-#include "Utility/LevelSwitches.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>
@@ -34,6 +33,16 @@ constexpr TouchChannel kTouchChannels[] = {
      kColorGain},
 };
 
+bool anyPerceptualTouch(const CSliderParams& sliders) {
+    return std::any_of(std::begin(kTouchChannels), std::end(kTouchChannels),
+                       [&](const TouchChannel& channel) { return sliders.*channel.enabled; });
+}
+
+bool anyTouch(const CSliderParams& sliders) {
+    return sliders.mLight_Touch_RGB_Enabled || sliders.mLight_Touch_R_Enabled ||
+           sliders.mLight_Touch_G_Enabled || sliders.mLight_Touch_B_Enabled;
+}
+
 // Share of the tones that the stretch leaves short of the right end.
 double shortShare(const Histogram& bins, int center, int pixels) {
     const Curve stretched = tabulate([](int i) { return std::min(255.0, i + kStretch * i / 255); });
@@ -44,9 +53,9 @@ double shortShare(const Histogram& bins, int center, int pixels) {
 
 void CSmartAnalyzer_Perceptual_Level_Right::Analyze() {
     const CSliderParams& sliders = mParams->mSliderParams;
-    if (LevelSwitches::anyPerceptual(sliders) && !LevelSwitches::anyAbsolute(sliders))
+    if (anyPerceptualLevel(sliders) && !anyAbsoluteLevel(sliders))
         analyzeMain();
-    if (LevelSwitches::touchPerceptualLight(sliders) && !LevelSwitches::touchLight(sliders))
+    if (anyPerceptualTouch(sliders) && !anyTouch(sliders))
         analyzeTouch();
 }
 
@@ -61,7 +70,7 @@ int CSmartAnalyzer_Perceptual_Level_Right::recountLimit() const {
 void CSmartAnalyzer_Perceptual_Level_Right::analyzeMain() const {
     Log::log(LogLevel::Debug, "HIGHLIGHT HAS STARTED");
     const int limit = recountLimit();
-    const double share = shortShare(mParams->pHisto_Luma, limit + kReach, mInPlane->pixelCount());
+    const double share = shortShare(mParams->pHisto_Luma, limit + kReach, pixels());
     mParams->m_R_L_L_F = static_cast<float>(share * kLumaGain + limit);
     Log::log(LogLevel::Debug, "(1.0f- m_R_L_C_F_Loc): %f", share);
     Log::log(LogLevel::Debug, "Perceptual Right level: %f", static_cast<double>(mParams->m_R_L_L_F));
@@ -72,7 +81,7 @@ void CSmartAnalyzer_Perceptual_Level_Right::analyzeTouch() const {
     for (const TouchChannel& channel : kTouchChannels) {
         if (!(mParams->mSliderParams.*channel.enabled))
             continue;
-        const double share = shortShare(mParams->*channel.bins, center, mInPlane->pixelCount());
+        const double share = shortShare(mParams->*channel.bins, center, pixels());
         mParams->*channel.coefficient = static_cast<float>(share * channel.gain);
     }
 }

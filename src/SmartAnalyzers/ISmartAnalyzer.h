@@ -2,6 +2,8 @@
 
 #include "Filters/TaskBase.h"
 
+#include <algorithm>
+
 /// A task that turns what the histograms left in the parameters into factors for later filters. It has no row
 /// pass, changes no plane and, unlike the other tasks, lets its failure reach the caller.
 class ISmartAnalyzer : public TaskBase {
@@ -19,6 +21,9 @@ public:
 protected:
     virtual void Prepare() = 0;
     virtual void Analyze() = 0;
+
+    /// Pixels of the plane that shares are taken over; 1 for an empty one, whose masses are 0.
+    int pixels() const { return std::max(1, mInPlane->pixelCount()); }
 
     CUserParams* mParams;
     CARGBPlane* mInPlane;

@@ -70,7 +70,7 @@ void expectFinite(const CUserParams& params) {
         EXPECT_TRUE(std::isfinite(params.pHisto_Luma[i]) && params.pHisto_Luma[i] >= 0);
 }
 
-const std::pair<int, int> kSmallSizes[] = {{1, 1}, {1, 9}, {9, 1}, {2, 2}, {3, 3}, {5, 5}, {4, 100}};
+const std::pair<int, int> kSmallSizes[] = {{0, 0}, {1, 1}, {1, 9}, {9, 1}, {2, 2}, {3, 3}, {5, 5}, {4, 100}};
 const std::pair<int, int> kLargeSizes[] = {{701, 699}, {1001, 999}, {1200, 4}};
 
 TEST(TaskWalker, TheRegistryHoldsEveryTask) {

@@ -56,6 +56,16 @@ TEST(Histograms, SampleAGridThatDependsOnTheSize) {
     }
 }
 
+TEST(Histograms, AnEmptyPictureMeasuresAsNothing) {
+    CARGBPlane empty(0, 0, QString());
+    for (const std::string& name : kSampled) {
+        CUserParams params = allSwitchedOn();
+        EXPECT_TRUE(apply(name, params, empty));
+        EXPECT_EQ(params.m_Dark_Acu + params.m_Middle_Acu + params.m_Light_Acu, 0) << name;
+        EXPECT_EQ(params.m_OriginalLuma + params.m_OriginalLumaG, 0) << name;
+    }
+}
+
 TEST(Histograms, CountTheSameForAnyNumberOfThreads) {
     const auto plane = testplanes::noise(301, 257);
     const auto measure = [&plane](const std::string& name, int threads) {
