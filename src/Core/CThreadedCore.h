@@ -51,9 +51,6 @@ public:
     /// Calls `observer` after every task, on the thread of the run, before the next one starts.
     void setObserver(std::function<void(const TaskReport&)> observer);
 
-    /// True only after a run that ended with "All Done".
-    Q_INVOKABLE bool lastProcessingDone() const;
-
 Q_SIGNALS:
     /// Step number, number of steps, name of the step that starts now. The receiver answers with
     /// stepHandled().
@@ -64,6 +61,8 @@ Q_SIGNALS:
     void terminated();
 
 public Q_SLOTS:
+    /// True only after a run that ended with "All Done".
+    bool lastProcessingDone() const;
     /// Emits percentDone() unless the value is the last one sent.
     void emitPercentDone(int percent);
 

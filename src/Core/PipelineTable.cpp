@@ -50,29 +50,32 @@
 
 namespace {
 
-template <typename Task>
-std::unique_ptr<TaskBase> makeFilter(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane) {
-    return std::make_unique<Task>(params, inPlane, outPlane);
+template <typename Filter>
+PipelineTask filter(const char* name, bool (*condition)(const CUserParams&) = nullptr) {
+    const auto make = [](CUserParams* params, CARGBPlane* in, CARGBPlane* out) -> std::unique_ptr<TaskBase> {
+        return std::make_unique<Filter>(params, in, out);
+    };
+    return {name, TaskKind::Filter, make, condition};
 }
 
 template <typename Task>
-std::unique_ptr<TaskBase> makeMeasurement(CUserParams* params, CARGBPlane* inPlane, CARGBPlane*) {
-    return std::make_unique<Task>(params, inPlane);
+PipelineTask measurement(const char* name, TaskKind kind) {
+    const auto make = [](CUserParams* params, CARGBPlane* in, CARGBPlane*) -> std::unique_ptr<TaskBase> {
+        return std::make_unique<Task>(params, in);
+    };
+    return {name, kind, make};
+}
+
+PipelineTask followed(PipelineTask task, void (*afterwards)(CUserParams&)) {
+    task.afterwards = afterwards;
+    return task;
 }
 
 // The class is named once; its text is the name of the entry.
-#define FILTER(Class)                                                                                        \
-    { #Class, TaskKind::Filter, &makeFilter < Class> }
-#define FILTER_WHEN(Class, condition)                                                                        \
-    { #Class, TaskKind::Filter, &makeFilter < Class>, condition }
-#define FILTER_THEN(Class, afterwards)                                                                       \
-    { #Class, TaskKind::Filter, &makeFilter < Class>, nullptr, afterwards }
-#define HISTOGRAM(Class)                                                                                     \
-    { #Class, TaskKind::Histogram, &makeMeasurement < Class> }
-#define HISTOGRAM_THEN(Class, afterwards)                                                                    \
-    { #Class, TaskKind::Histogram, &makeMeasurement < Class>, nullptr, afterwards }
-#define ANALYZER(Class)                                                                                      \
-    { #Class, TaskKind::Analyzer, &makeMeasurement < Class> }
+#define FILTER(Class) filter<Class>(#Class)
+#define FILTER_WHEN(Class, condition) filter<Class>(#Class, condition)
+#define HISTOGRAM(Class) measurement<Class>(#Class, TaskKind::Histogram)
+#define ANALYZER(Class) measurement<Class>(#Class, TaskKind::Analyzer)
 
 bool removesSpots(const CUserParams& params) {
     return params.mSliderParams.SaltPepperEnabled;
@@ -118,11 +121,11 @@ std::span<const PipelineStep> mainSteps() {
         {"Auto_Contrast_I", {FILTER(CAuto_Contrast_I)}},
         {"Super_ORV_II", {FILTER(Super_ORV_II)}},
         {"Smart Blur", {FILTER(Super_ORV), HISTOGRAM(CHistogram_IV)}},
-        {"Auto_Color", {FILTER_THEN(CAuto_Color, logAutoContrast)}},
+        {"Auto_Color", {followed(FILTER(CAuto_Color), logAutoContrast)}},
         {"Clarity", {FILTER(CClarity), HISTOGRAM(CHistogram_VII)}},
         {"NEW Auto_Contrast", {FILTER(Auto_Contrast)}},
         {"Saturation", {FILTER(Saturation)}},
-        {"Noise", {FILTER_THEN(CBilinear, testDarkness)}},
+        {"Noise", {followed(FILTER(CBilinear), testDarkness)}},
         {"Black & White spot", {FILTER(CMedian_Salt_Pepper)}, removesSpots},
         {"Gamma", {FILTER(CGamma_Simple_Filter)}},
         {"Contrast", {FILTER(CContrast_Simple_Filter)}},
@@ -162,7 +165,7 @@ std::span<const PipelineTask> finalTouchTasks() {
         FILTER(CLevel_Dark_Left),
         FILTER(CLevel_Middle),
         FILTER(CLevel_Light_Right),
-        HISTOGRAM_THEN(CHistogram0, takeInputLuma),
+        followed(HISTOGRAM(CHistogram0), takeInputLuma),
         ANALYZER(CSmartAnalyzer_Perceptual_Contrast_Brightness),
         FILTER(CSpecial_Contrast_Perceptual),
         FILTER(CContrast_Brightness_Perceptual),

@@ -6,6 +6,7 @@
 #include "support/LogCapture.h"
 #include "support/TestPlanes.h"
 
+#include <QMetaMethod>
 #include <QThread>
 
 #include <gmock/gmock.h>
@@ -202,6 +203,44 @@ TEST(CThreadedCore, FinalTouchAlwaysStartsFromItsOriginal) {
     EXPECT_EQ(testplanes::bytes(*in), original);
     EXPECT_EQ(testplanes::bytes(out), original);
     EXPECT_TRUE(core.params().Final_Touch_Mode_Enabled);
+}
+
+// The names of the tasks, in order, "~" for the prefix "CSmartAnalyzer_Perceptual_".
+std::string namesOf(std::span<const PipelineTask> tasks) {
+    QStringList names;
+    for (const PipelineTask& task : tasks)
+        names << QString::fromLatin1(task.name).replace("CSmartAnalyzer_Perceptual_", "~");
+    return names.join(' ').toStdString();
+}
+
+TEST(CThreadedCore, TasksWithoutAnAnnouncementStandInTheirPlaces) {
+    std::vector<std::string> several;
+    for (const PipelineStep& step : PipelineTable::mainSteps())
+        if (step.tasks.size() > 1)
+            several.push_back(namesOf(step.tasks));
+    EXPECT_THAT(several,
+                ElementsAre("Super_ORV CHistogram_IV", "CClarity CHistogram_VII", "CMoire CAverage",
+                            "CColor CHistogram_VII", "CLevel_Light_Right CHistogram_VII ~Contrast_Brightness",
+                            "CContrast_Brightness_Perceptual CHistogram_VIII "
+                            "CSmartAnalyzer_Digital_Flash CDigital_Flash_Perceptual",
+                            "CHistogram_III ~Level_Dark ~Level_Middle ~Level_Right"));
+    EXPECT_EQ(
+        namesOf(PipelineTable::finalTouchTasks()),
+        "CHistogram_Luma_Final CContrast_Simple_Filter CColor CHistogram_VII CLevel_Dark_Left "
+        "CLevel_Middle CLevel_Light_Right CHistogram0 ~Contrast_Brightness CSpecial_Contrast_Perceptual "
+        "CContrast_Brightness_Perceptual CHistogram_III ~Level_Dark CLevel_Dark_Left_Perceptual "
+        "CHistogram_III ~Level_Middle CLevel_Middle_Perceptual CHistogram_III ~Level_Right "
+        "CLevel_Light_Right_Perceptual");
+}
+
+TEST(CThreadedCore, SignalsAndSlotsKeepTheirNumbers) {
+    const QMetaObject& meta = CThreadedCore::staticMetaObject;
+    std::vector<std::string> signatures;
+    for (int i = meta.methodOffset(); i < meta.methodCount(); ++i)
+        signatures.push_back(meta.method(i).methodSignature().toStdString());
+    EXPECT_THAT(signatures, ElementsAre("stepDone(int,int,QString)", "stepDone(int,int)", "percentDone(int)",
+                                        "finished()", "started()", "terminated()", "lastProcessingDone()",
+                                        "emitPercentDone(int)"));
 }
 
 } // namespace
