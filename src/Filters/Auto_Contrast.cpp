@@ -5,7 +5,6 @@
 
 #include <algorithm>
 #include <cmath>
-#include <utility>
 
 namespace {
 
@@ -37,7 +36,7 @@ bool Auto_Contrast::PreApply() {
     mParams->m_Opaco = mLimits.isHazy();
     mThreshold = chooseThreshold();
     scanChannels(mThreshold);
-    mCurve = makeTable([this](int value) {
+    mCurve = TonalStretch::tabulate<std::uint8_t>([this](int value) {
         return mParams->m_Opaco ? hazyCurve(value, mLimits) : normalCurve(value, mLimits);
     });
     return true;
@@ -97,8 +96,7 @@ std::uint8_t Auto_Contrast::normalCurve(int value, TonalStretch::Limits limits) 
 
 void Auto_Contrast::ApplyRow(std::uint32_t row) {
     beginRow(row, "Filters/Auto_Contrast", 325);
-    const int y = static_cast<int>(row);
-    mapRow(mCurve, std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
+    TonalStretch::mapRow({&mCurve, &mCurve, &mCurve}, *mInPlane, *mOutPlane, static_cast<int>(row));
 }
 
 bool Auto_Contrast::PostApply() {

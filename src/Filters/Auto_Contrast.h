@@ -1,7 +1,6 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/RowMapping.h"
 #include "Filters/TonalStretch.h"
 
 /// The contrast step of the automatic-contrast mode: one black limit L and one white limit R, combined from
@@ -35,5 +34,5 @@ private:
     std::array<TonalStretch::Limits, 3> mChannels; ///< red, green, blue
     TonalStretch::Limits mLimits;                  ///< combined
     std::int32_t mThreshold = 0;                   ///< of the second scans, in samples
-    ChannelTable mCurve = {};
+    TonalStretch::Table<std::uint8_t> mCurve = {};
 };

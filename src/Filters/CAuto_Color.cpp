@@ -4,7 +4,6 @@
 
 #include <algorithm>
 #include <cmath>
-#include <utility>
 
 namespace {
 
@@ -51,8 +50,8 @@ bool CAuto_Color::PreApply() {
             white = rightLimit(*i, s);
             Log::log(LogLevel::Debug, "i= C_%s_Right_limit:%d %f", kNames[c], *i, static_cast<double>(white));
         }
-        mCurves[c] =
-            makeTable([limits = mLimits[c]](int value) { return curve(value, limits.black, limits.white); });
+        mCurves[c] = TonalStretch::tabulate<std::uint8_t>(
+            [limits = mLimits[c]](int value) { return curve(value, limits.black, limits.white); });
     }
     return true;
 }
@@ -93,9 +92,8 @@ std::uint8_t CAuto_Color::curve(int value, float black, float white) {
 
 void CAuto_Color::ApplyRow(std::uint32_t row) {
     beginRow(row, "Filters/CAuto_Color", 195);
-    const int y = static_cast<int>(row);
-    mapRow({&mCurves[0], &mCurves[1], &mCurves[2]}, std::as_const(*mInPlane).row(y), mOutPlane->row(y),
-           mInPlane->width());
+    TonalStretch::mapRow({&mCurves[0], &mCurves[1], &mCurves[2]}, *mInPlane, *mOutPlane,
+                         static_cast<int>(row));
 }
 
 bool CAuto_Color::PostApply() {

@@ -21,5 +21,5 @@ private:
     void prepareMain();
     void prepareTouch();
 
-    WideTables mMaps = {};
+    LevelMath::ChannelMaps mMaps = {};
 };

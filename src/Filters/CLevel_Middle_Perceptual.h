@@ -23,5 +23,5 @@ private:
     float mainGamma();
     void prepareTouch();
 
-    WideTables mMaps = {};
+    LevelMath::ChannelMaps mMaps = {};
 };

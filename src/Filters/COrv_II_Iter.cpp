@@ -23,15 +23,15 @@ bool COrv_II_Iter::PreApply() {
 
     const double level = static_cast<double>(sliders.OrvelaLevel2Value) * 31 / 1000 + 30;
     const auto lightness = static_cast<float>(PixelMath::trunc(level));
-    const auto epsilon = static_cast<float>(PixelMath::trunc(2 * lightness));
+    const auto dEpsilon2 = static_cast<float>(PixelMath::trunc(2 * lightness));
     const double light = static_cast<double>(lightness) / 1.275F;
     mParams->OrvelaLight2 = static_cast<float>(PixelMath::trunc(light));
     if (light > 70)
         mParams->Soft_Orvela = false;
-    mKernel.emplace(epsilon, mInPlane->pixelCount());
+    mKernel.emplace(dEpsilon2, mInPlane->pixelCount());
 
     Log::log(LogLevel::Debug, "Orvela_Lightness %f", static_cast<double>(lightness));
-    Log::log(LogLevel::Debug, "dEpsilon2  %f", static_cast<double>(epsilon));
+    Log::log(LogLevel::Debug, "dEpsilon2  %f", static_cast<double>(dEpsilon2));
     Log::log(LogLevel::Debug, "mSum_Color  %f", mParams->mSum_Color);
     return true;
 }

@@ -28,14 +28,14 @@ bool COrv_I_Iter::PreApply() {
 
     const double level = static_cast<double>(sliders.OrvelaLevelValue) * 31 / 1000 + 30;
     const auto lightness = static_cast<float>(PixelMath::trunc(level * 0.85F));
-    const auto epsilon = static_cast<float>(PixelMath::trunc(lightness * 3));
+    const auto dEpsilon = static_cast<float>(PixelMath::trunc(lightness * 3));
     mParams->OrvelaLight1 = lightness;
     if (static_cast<double>(lightness) / 0.85F > 70)
         mParams->Soft_Orvela = false;
-    mKernel.emplace(epsilon, mInPlane->pixelCount());
+    mKernel.emplace(dEpsilon, mInPlane->pixelCount());
 
     Log::log(LogLevel::Debug, "Orvela_Lightness %f", static_cast<double>(lightness));
-    Log::log(LogLevel::Debug, "dEpsilon  %f", static_cast<double>(epsilon));
+    Log::log(LogLevel::Debug, "dEpsilon  %f", static_cast<double>(dEpsilon));
     Log::log(LogLevel::Debug, "mSum_Color  %f", mParams->mSum_Color);
     return true;
 }

@@ -1,7 +1,8 @@
 #pragma once
 
+#include "Filters/ChannelTable.h"
 #include "Filters/IFilter.h"
-#include "Filters/RowMapping.h"
+#include "Filters/PixelMath.h"
 
 #include <array>
 
@@ -25,6 +26,7 @@ protected:
 
 private:
     void findTint();
+    PixelMath::Rgb correct(int r, int g, int b) const;
 
     std::array<float, 3> mTarget = {}; ///< colour to tint toward, each 0 or 255
     float mTint = 0;                   ///< v

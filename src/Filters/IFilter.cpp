@@ -26,10 +26,9 @@ void dumpAfter(const QByteArray& task, const CARGBPlane& plane) {
 
 const CARGBPlane& hostPlane() {
     const auto* direct = dynamic_cast<const CARGBPlaneProxyDirect*>(CARGBPlaneProxy::current());
-    if (!direct) {
-        qFatal("This version of GetRGBFromHost requires direct proxy. (IFilter::GetRGBFromHost, "
-               "Filters/IFilter:89)");
-    }
+    if (!direct)
+        qt_assert_x("IFilter::GetRGBFromHost", "This version of GetRGBFromHost requires direct proxy.",
+                    kSource, 89);
     return direct->plane();
 }
 
@@ -69,8 +68,4 @@ void IFilter::GetRGBFromHost(int x, int y, std::uint32_t& r, std::uint32_t& g, s
 
 ConstRow IFilter::hostRow(int y) {
     return hostPlane().row(y);
-}
-
-unsigned logAddress(const void* object) {
-    return static_cast<unsigned>(reinterpret_cast<std::uintptr_t>(object));
 }

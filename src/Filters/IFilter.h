@@ -37,6 +37,3 @@ protected:
 private:
     std::atomic<bool> mRowBegun = false;
 };
-
-/// An address as the filters' log lines show it.
-unsigned logAddress(const void* object);

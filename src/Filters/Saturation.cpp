@@ -127,17 +127,23 @@ void Saturation::prepareDominant(const Means& means) {
     const bool pulls = mParams->mSliderParams.SaturationValue < 600;
     const auto curve = [&](float mean) {
         const float distance = mean == middle ? max - middle : max - min;
-        return makeTable<WideTable>([=, this](int c) {
+        Curve results;
+        for (std::size_t i = 0; i < results.size(); ++i) {
+            const double c = static_cast<double>(i);
+            results[i] = static_cast<int>(i);
             if (!pulls || mean >= max)
-                return c;
+                continue;
             const double below = max - c;
             const double slope = below == 0 ? 0 : below / (mean * 0.025);
             const double pull = 1 / std::cosh((c - mean) / kWidth) * (std::tanh(slope) + 1);
             const auto value = static_cast<float>(c - pull * distance * mStrength / 2);
-            return PixelMath::trunc(std::max(value, 0.0F));
-        });
+            results[i] = PixelMath::trunc(std::max(value, 0.0F));
+        }
+        return results;
     };
-    mCurves = {curve(means.r), curve(means.g), curve(means.b)};
+    mRed = curve(means.r);
+    mGreen = curve(means.g);
+    mBlue = curve(means.b);
 }
 
 void Saturation::prepareSaturations() {
@@ -172,10 +178,15 @@ void Saturation::ApplyRow(std::uint32_t row) {
     const ConstRow in = std::as_const(*mInPlane).row(static_cast<int>(row));
     const Row out = mOutPlane->row(static_cast<int>(row));
     if (mDominant) {
-        mapKeepingHue(mCurves, in, out, width);
+        applyCurves(mRed, mGreen, mBlue, in, out, width);
         return;
     }
-    mapPixels(in, out, width, [this](int r, int g, int b) { return resaturate(r, g, b); });
+    for (int x = 0; x < width; ++x) {
+        const PixelMath::Rgb c = resaturate(in[0][x], in[1][x], in[2][x]);
+        out[0][x] = static_cast<std::uint8_t>(c.r);
+        out[1][x] = static_cast<std::uint8_t>(c.g);
+        out[2][x] = static_cast<std::uint8_t>(c.b);
+    }
 }
 
 bool Saturation::PostApply() {
@@ -183,15 +194,14 @@ bool Saturation::PostApply() {
     const float ratio = meanOut > 0 ? mMeanIn / meanOut : 1.0F;
     Log::log(LogLevel::Debug, " Saturation mean_out %f", static_cast<double>(meanOut));
     Log::log(LogLevel::Debug, " Saturation Radion_iso_Luma %f", static_cast<double>(ratio));
-    const auto gain = makeTable<WideTable>([ratio](int c) {
-        return PixelMath::trunc(std::min(static_cast<float>(c) * ratio, kLargestProduct));
-    });
-    const WideTables gains = {gain, gain, gain};
+    Curve gain;
+    for (std::size_t c = 0; c < gain.size(); ++c)
+        gain[c] = PixelMath::trunc(std::min(static_cast<float>(c) * ratio, kLargestProduct));
     const auto height = static_cast<unsigned>(mOutPlane->height());
     orvela::forEachRange(0, height, kRowGrain, [&](unsigned first, unsigned last) {
         for (unsigned y = first; y < last; ++y) {
             const Row row = mOutPlane->row(static_cast<int>(y));
-            mapKeepingHue(gains, {row[0], row[1], row[2]}, row, mOutPlane->width());
+            applyCurves(gain, gain, gain, {row[0], row[1], row[2]}, row, mOutPlane->width());
         }
     });
     Log::log(LogLevel::Debug, "Saturation Filter complete.");

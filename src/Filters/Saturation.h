@@ -1,7 +1,7 @@
 #pragma once
 
+#include "Filters/HueKeepingCurves.h"
 #include "Filters/IFilter.h"
-#include "Filters/RowMapping.h"
 
 #include <vector>
 
@@ -44,11 +44,13 @@ private:
     float saturationFor(float saturation) const;
     PixelMath::Rgb resaturate(int r, int g, int b) const;
 
-    float mAlfa = 1;                 ///< saturation factor
-    bool mDominant = false;          ///< dominant-colour mode
-    float mStrength = 0;             ///< k
-    float mMeanIn = 0;               ///< brightness to restore
-    std::int32_t mStep = 5;          ///< distance of the samples in rows and columns
-    WideTables mCurves = {};         ///< dominant-colour mode
+    float mAlfa = 1;        ///< saturation factor
+    bool mDominant = false; ///< dominant-colour mode
+    float mStrength = 0;    ///< k
+    float mMeanIn = 0;      ///< brightness to restore
+    std::int32_t mStep = 5; ///< distance of the samples in rows and columns
+    Curve mRed = {};        ///< dominant-colour mode: results by value
+    Curve mGreen = {};
+    Curve mBlue = {};
     std::vector<float> mSaturations; ///< new saturations by the largest channel and the range of the channels
 };

@@ -10,7 +10,6 @@ namespace {
 
 constexpr int kWindow = 2 * SmoothingKernel::kRadius + 1;
 constexpr int kTileColumns = 256;
-constexpr float kBrightnessDivisor = 3.0F;
 
 // Five rows of one channel around a run of columns, with the window's margin on both sides.
 using TileChannel = float[kWindow][kTileColumns + 2 * SmoothingKernel::kRadius];
@@ -96,7 +95,7 @@ void SmoothingKernel::applyRow(const CARGBPlane& in, CARGBPlane& out, int y, int
         for (std::size_t c = 0; c < 3; ++c)
             averageChannel(tile.channel[c], mGauss.data(), tile.average[c], count);
         for (int i = 0; i < count; ++i) {
-            if (!(tile.variation[i] / (tile.brightness[i] / kBrightnessDivisor) < mThreshold))
+            if (!(tile.variation[i] / (tile.brightness[i] / Gauss_denominator) < mThreshold))
                 continue;
             for (std::size_t c = 0; c < 3; ++c)
                 target[c][start + i] = static_cast<std::uint8_t>(tile.average[c][i]);
@@ -142,5 +141,5 @@ bool SmoothingKernel::isSmooth(const CARGBPlane& in, int x, int y) const {
             variation += std::sqrt(static_cast<float>(square));
         }
     }
-    return variation / (static_cast<float>(brightness) / kBrightnessDivisor) < mThreshold;
+    return variation / (static_cast<float>(brightness) / Gauss_denominator) < mThreshold;
 }

@@ -14,6 +14,7 @@
 class SmoothingKernel {
 public:
     static constexpr int kRadius = 2;
+    static constexpr float Gauss_denominator = 3.0F; ///< divides the brightness of the window
 
     explicit SmoothingKernel(double threshold);
 

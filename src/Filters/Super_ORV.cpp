@@ -13,7 +13,7 @@ bool Super_ORV::PreApply() {
     const bool tooSmall = mInPlane->height() - 2 <= 2 || mInPlane->width() - 2 <= 2;
     if (!mParams->mSliderParams.OrvelaLevel3Enabled || tooSmall)
         return false;
-    Log::log(LogLevel::Debug, "Gauss_denominator%f", 3.0);
+    Log::log(LogLevel::Debug, "Gauss_denominator%f", static_cast<double>(SmoothingKernel::Gauss_denominator));
     const float level = mParams->mSliderParams.OrvelaLevel3Value / 1000;
     mKernel.emplace(level * 0.3 + 0.05F);
     mVertStart = mRadius + 1;

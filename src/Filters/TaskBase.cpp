@@ -25,21 +25,17 @@ private:
 } // namespace
 
 bool TaskBase::Apply() {
-    bool passBegun = false;
-    bool succeeded = false;
     try {
-        succeeded = runPhases(passBegun);
-        if (!succeeded && passBegun)
-            onStopped();
+        if (runPhases())
+            return true;
     } catch (...) {
         Log::scopeExit(LogLevel::Error, "Unable to complete filter block.");
-        if (passBegun)
-            onStopped();
     }
-    return succeeded;
+    onStopped();
+    return false;
 }
 
-bool TaskBase::runPhases(bool& passBegun) {
+bool TaskBase::runPhases() {
     const PhaseTimer pre("PreApply");
     if (!PreApply()) {
         Log::scopeExit(LogLevel::Debug, "Task canceled in PreApply.");
@@ -48,7 +44,6 @@ bool TaskBase::runPhases(bool& passBegun) {
     pre.done();
 
     const PhaseTimer pass("Pre DoApplyParallel");
-    passBegun = true;
     if (!DoApplyParallel()) {
         Log::scopeExit(LogLevel::Debug, "Task canceled in DoApplyParallel.");
         return false;

@@ -33,7 +33,7 @@ protected:
     virtual void ApplyRow(std::uint32_t row);
     /// Completes the task; false is a quiet stop.
     virtual bool PostApply() { return true; }
-    /// Called instead of onSuccess() when the run ends after its row pass has begun.
+    /// Called at the end of a run that did not reach its end.
     virtual void onStopped() {}
 
     /// Calls ApplyRow(i * mVertStep) for the indices i from mVertStart, (mVertEnd - mVertStart) / mVertStep
@@ -46,7 +46,7 @@ protected:
     QByteArray mName; ///< for the names of debug dumps; empty unless set
 
 private:
-    bool runPhases(bool& passBegun);
+    bool runPhases();
 };
 
 /// Start of every row operation: ends the pass when a stop was requested, then reports the row's percentage.

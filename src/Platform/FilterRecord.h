@@ -53,26 +53,26 @@ using AdvanceStateProc = std::int16_t (*)();
 /// A host allocates at least 1 KiB for it, zeroed; the module neither copies it nor relies on its size.
 struct FilterRecord {
     std::int32_t serialNumber; ///< 0 in modern hosts
-    AbortProc abortProc;       ///< returns Boolean, no arguments
-    ProgressProc progressProc; ///< (i32 done, i32 total)
-    void* parameters;          ///< handle kept by the module
-    Point imageSize;           ///< h = width, v = height
-    std::int16_t planes;       ///< number of channels
-    Rect filterRect;           ///< area to filter
-    RGBColor background;       ///< old 16-bit form
-    RGBColor foreground;       ///< old 16-bit form
-    std::int32_t maxSpace;     ///< host: bytes available
-    std::int32_t bufferSpace;  ///< plug-in: bytes wanted (prepare)
-    Rect inRect;               ///< input request
-    std::int16_t inLoPlane;    ///< first input plane
-    std::int16_t inHiPlane;    ///< last input plane
-    Rect outRect;              ///< output request
-    std::int16_t outLoPlane;   ///< first output plane
-    std::int16_t outHiPlane;   ///< last output plane
-    void* inData;              ///< input buffer
-    std::int32_t inRowBytes;   ///< input stride
-    void* outData;             ///< output buffer
-    std::int32_t outRowBytes;  ///< output stride
+    AbortProc abortProc;       ///< true: the user asks to stop
+    ProgressProc progressProc;
+    void* parameters;         ///< handle kept by the module
+    Point imageSize;          ///< h = width, v = height
+    std::int16_t planes;      ///< number of channels
+    Rect filterRect;          ///< area to filter
+    RGBColor background;      ///< old 16-bit form
+    RGBColor foreground;      ///< old 16-bit form
+    std::int32_t maxSpace;    ///< host: bytes available
+    std::int32_t bufferSpace; ///< module: bytes wanted (prepare)
+    Rect inRect;              ///< input request
+    std::int16_t inLoPlane;   ///< first input plane
+    std::int16_t inHiPlane;   ///< last input plane
+    Rect outRect;             ///< output request
+    std::int16_t outLoPlane;  ///< first output plane
+    std::int16_t outHiPlane;  ///< last output plane
+    void* inData;             ///< input buffer
+    std::int32_t inRowBytes;  ///< input stride
+    void* outData;            ///< output buffer
+    std::int32_t outRowBytes; ///< output stride
     Boolean isFloating;
     Boolean haveMask; ///< selection is not a rectangle
     Boolean autoMask; ///< host masks the output
@@ -83,12 +83,12 @@ struct FilterRecord {
     FilterColor foreColor;  ///< 4 bytes
     std::uint32_t hostSig;  ///< four-char code of the host
     void* hostProc;         ///< (i16 selector, pointer-size*)
-    std::int16_t imageMode; ///< see Image modes
+    std::int16_t imageMode; ///< an ImageMode
     Fixed imageHRes;        ///< 16.16 dpi
     Fixed imageVRes;        ///< 16.16 dpi
     Point floatCoord;
     Point wholeSize;
-    PlugInMonitor monitor;      ///< 10 x Fixed
+    PlugInMonitor monitor;
     PlatformData* platformData; ///< Windows: pointer to PlatformData
     void* bufferProcs;
     void* resourceProcs;
@@ -98,10 +98,10 @@ struct FilterRecord {
     Boolean supportsDummyChannels;
     Boolean supportsAlternateLayouts;
     std::int16_t wantLayout;      ///< 0 = traditional (interleaved)
-    std::int16_t filterCase;      ///< 1..7, see below
+    std::int16_t filterCase;      ///< 1 to 7; 1: flat picture, no selection
     std::int16_t dummyPlaneValue; ///< -1 = undefined
     void* premiereHook;
-    AdvanceStateProc advanceState; ///< callback, no arguments, returns i16
+    AdvanceStateProc advanceState; ///< makes the requested buffers current
     Boolean supportsAbsolute;
     Boolean wantsAbsolute;
     void* getPropertyObsolete;

@@ -15,10 +15,6 @@ namespace {
 constexpr char kSource[] = "Utility/CARGBPlane";
 constexpr unsigned kCopyBlock = 1U << 18; // bytes; one piece of a parallel copy
 
-unsigned addressForLog(const void* object) {
-    return static_cast<unsigned>(reinterpret_cast<std::uintptr_t>(object));
-}
-
 // The product as the 32-bit count; sizes whose product does not fit are as good as out of memory.
 std::int32_t countPixels(std::int32_t width, std::int32_t height) {
     std::int32_t count = 0;
@@ -31,8 +27,7 @@ std::int32_t countPixels(std::int32_t width, std::int32_t height) {
 } // namespace
 
 CARGBPlane::CARGBPlane(std::int32_t width, std::int32_t height, const QString& name) : mName(name) {
-    Log::log(LogLevel::Debug, "CARGBPlane ctor ptr=0x%x source=%s", addressForLog(this),
-             qUtf8Printable(name));
+    Log::log(LogLevel::Debug, "CARGBPlane ctor ptr=0x%x source=%s", logAddress(this), qUtf8Printable(name));
     try {
         mWidth = width;
         mHeight = height;
@@ -45,8 +40,8 @@ CARGBPlane::CARGBPlane(std::int32_t width, std::int32_t height, const QString& n
 }
 
 CARGBPlane::CARGBPlane(const CARGBPlane& source, const QString& name) : mName(name) {
-    Log::log(LogLevel::Debug, "CARGBPlane ctor ptr=0x%x inplane=0x%x  source=%s", addressForLog(this),
-             addressForLog(&source), qUtf8Printable(name));
+    Log::log(LogLevel::Debug, "CARGBPlane ctor ptr=0x%x inplane=0x%x  source=%s", logAddress(this),
+             logAddress(&source), qUtf8Printable(name));
     try {
         copyFrom(source);
     } catch (...) {
@@ -55,7 +50,7 @@ CARGBPlane::CARGBPlane(const CARGBPlane& source, const QString& name) : mName(na
 }
 
 CARGBPlane::~CARGBPlane() {
-    Log::log(LogLevel::Debug, "CARGBPlane dtor ptr=0x%x", addressForLog(this));
+    Log::log(LogLevel::Debug, "CARGBPlane dtor ptr=0x%x", logAddress(this));
     release();
 }
 
@@ -123,7 +118,7 @@ void CARGBPlane::allocate() {
             channel.reset(new (std::nothrow) std::uint8_t[static_cast<std::size_t>(mPixelCount)]);
         const long long bytes = 3LL * mPixelCount;
         Log::log(LogLevel::Error, "CARGBPlane allocated %lld bytes (%lld MB) for this (0x%x) image.", bytes,
-                 bytes / 1048576, addressForLog(this));
+                 bytes / 1048576, logAddress(this));
         mAllocated = true;
     } catch (...) {
         release();

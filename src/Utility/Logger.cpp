@@ -2,6 +2,7 @@
 
 #include <atomic>
 #include <cstdarg>
+#include <cstdint>
 #include <mutex>
 
 namespace {
@@ -118,3 +119,7 @@ bool writes(LogLevel level) {
 }
 
 } // namespace Log
+
+unsigned logAddress(const void* object) {
+    return static_cast<unsigned>(reinterpret_cast<std::uintptr_t>(object));
+}

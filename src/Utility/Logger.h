@@ -60,3 +60,6 @@ const ILogger* current();
 bool writes(LogLevel level);
 
 } // namespace Log
+
+/// The low 32 bits of an address, as log lines show it.
+unsigned logAddress(const void* object);

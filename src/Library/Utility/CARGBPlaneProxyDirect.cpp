@@ -25,6 +25,6 @@ CARGBPlaneProxyDirect::~CARGBPlaneProxyDirect() {
 }
 
 void CARGBPlaneProxyDirect::getPixels(int, int, int, int, void*, int) {
-    qFatal("Do not use this method for CARGBPlaneProxyDirect! (CARGBPlaneProxyDirect::getPixels, "
-           "Library/Utility/CARGBPlaneProxyDirect)");
+    qt_assert_x("CARGBPlaneProxyDirect::getPixels", "Do not use this method for CARGBPlaneProxyDirect!",
+                "Library/Utility/CARGBPlaneProxyDirect", __LINE__);
 }

@@ -1,4 +1,5 @@
 #include "Filters/IFilter.h"
+#include "Library/Utility/CARGBPlaneProxyDirect.h"
 #include "SmartAnalyzers/ISmartAnalyzer.h"
 #include "Utility/CGenericEx.h"
 #include "Utility/RowScheduler.h"
@@ -26,6 +27,8 @@ public:
     ScriptedFilter(CUserParams* params, CARGBPlane* in, CARGBPlane* out) : IFilter(params, in, out) {
         mName = "Scripted";
     }
+
+    using IFilter::GetRGBFromHost;
 
     bool pre = true;
     bool post = true;
@@ -183,6 +186,21 @@ TEST_F(TaskTest, MissingObjectsAreReportedByTheConstructor) {
     EXPECT_TRUE(log.has("The User Settings object was invalid."));
     EXPECT_TRUE(log.has("The Output plane was invalid!"));
     ExceptionStack::clear();
+}
+
+TEST_F(TaskTest, HostPixelsNeedTheDirectProxyAndComeFromItsCopy) {
+    std::uint32_t r = 0;
+    std::uint32_t g = 0;
+    std::uint32_t b = 0;
+    EXPECT_DEATH(ScriptedFilter::GetRGBFromHost(0, 0, r, g, b),
+                 "IFilter::GetRGBFromHost: \"This version of GetRGBFromHost requires direct proxy.\", file "
+                 "Filters/IFilter, line 89");
+    CARGBPlaneProxyDirect proxy(*testplanes::noise(4, 7));
+    ScriptedFilter::GetRGBFromHost(3, 5, r, g, b);
+    const testplanes::Pixel expected = testplanes::at(*testplanes::noise(4, 7), 3, 5);
+    EXPECT_THAT((std::array{r, g, b}), ElementsAre(expected[0], expected[1], expected[2]));
+    EXPECT_DEATH(proxy.getPixels(0, 0, 1, 1, nullptr, 0),
+                 "\"Do not use this method for CARGBPlaneProxyDirect!\"");
 }
 
 class FailingAnalyzer final : public ISmartAnalyzer {
