@@ -15,19 +15,14 @@ CWgtPaneAdvancedImpl::CWgtPaneAdvancedImpl(QWidget* owner, EGUIMode mode) : IWgt
 
 void CWgtPaneAdvancedImpl::doSetSliders(const QString& presetName) {
     const CUserParamsPhotoshop factory(FactoryPresets::factoryPresetMode(presetName));
-    const CSliderParams& settings = factory.mSliderParams;
-    setUpSliders(SliderTable::advanced(), settings);
-    colrPickAutoColor->setColor(
-        QColor(int(settings.mColor_Value_R), int(settings.mColor_Value_G), int(settings.mColor_Value_B)));
+    setUpSliders(SliderTable::advanced(), factory.mSliderParams);
+    colrPickAutoColor->setColor(filterColor(factory.mSliderParams));
 }
 
 void CWgtPaneAdvancedImpl::applyGUIParams(CUserParams& params) {
     CSliderParams& settings = params.mSliderParams;
     writeSliders(SliderTable::advanced(), settings);
-    const QColor color = colrPickAutoColor->color();
-    settings.mColor_Value_R = static_cast<float>(color.red());
-    settings.mColor_Value_G = static_cast<float>(color.green());
-    settings.mColor_Value_B = static_cast<float>(color.blue());
+    writeColor(colrPickAutoColor, settings.mColor_Value_R, settings.mColor_Value_G, settings.mColor_Value_B);
     Log::log(LogLevel::Debug, "CWgtPaneAdvancedImpl::applyGUIParams");
     params.list(QStringLiteral("CWgtPaneAdvancedImpl::applyGUIParams"));
     Log::log(LogLevel::Debug, "CWgtPaneAdvancedImpl::applyGUIParams finished.");

@@ -84,6 +84,17 @@ void IWgtPane::writeSliders(std::span<const SliderDescription> sliders, CSliderP
     }
 }
 
+QColor IWgtPane::filterColor(const CSliderParams& settings) {
+    return QColor(int(settings.mColor_Value_R), int(settings.mColor_Value_G), int(settings.mColor_Value_B));
+}
+
+void IWgtPane::writeColor(const CColorPicker* picker, float& red, float& green, float& blue) {
+    const QColor color = picker->color();
+    red = static_cast<float>(color.red());
+    green = static_cast<float>(color.green());
+    blue = static_cast<float>(color.blue());
+}
+
 void IWgtPane::enableAfterRuns(QWidget* button, CThreadedCore* core) {
     connect(core, &CThreadedCore::started, button, [button] { button->setEnabled(false); });
     const auto ended = [button, core] { button->setEnabled(core->lastProcessingDone()); };

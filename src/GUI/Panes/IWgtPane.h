@@ -69,6 +69,11 @@ protected:
     /// Writes position and state of every slider into the fields that it drives.
     void writeSliders(std::span<const SliderDescription> sliders, CSliderParams& settings) const;
 
+    /// The colour of the colour filter.
+    static QColor filterColor(const CSliderParams& settings);
+    /// Writes the picker's components, 0 to 255.
+    static void writeColor(const CColorPicker* picker, float& red, float& green, float& blue);
+
     /// Disables `button` when a run of `core` starts and enables it again when it was completed.
     void enableAfterRuns(QWidget* button, CThreadedCore* core);
 

@@ -1,0 +1,33 @@
+#include "GUI/Panes/CWgtPane3SlidersImpl.h"
+
+#include "Core/CThreadedCore_Orvela.h"
+#include "Utility/DebugBoxes.h"
+#include "Utility/Logger.h"
+
+CWgtPane3SlidersImpl::CWgtPane3SlidersImpl(QWidget* owner, EGUIMode mode) : IWgtPane(owner, mode) {
+    setupUi(this);
+    doSetSliders(QString());
+}
+
+void CWgtPane3SlidersImpl::doSetSliders(const QString&) {
+    const auto sliders = SliderTable::threeSliders(mode());
+    for (const SliderDescription& slider : sliders) {
+        setUpSlider(slider, false, slider.initial);
+        Log::log(LogLevel::Debug, "SETUP_SLIDER_WITH_DEFVALUE%s", slider.label);
+    }
+    if (sliders.empty())
+        DebugBoxes::warningBox(window(), tr("Note:"), tr("invalid mode in CWgtPane3SlidersImpl::setSliders"));
+}
+
+void CWgtPane3SlidersImpl::applyGUIParams(CUserParams& params) {
+    const auto sliders = SliderTable::threeSliders(mode());
+    writeSliders(sliders, params.mSliderParams);
+    if (!sliders.empty())
+        return;
+    Log::log(LogLevel::Warning, "in CWgtPane3SlidersImpl::applyGUIParams");
+    DebugBoxes::warningBox(window(), tr("Note:"), tr("invalid mode in CWgtPane3SlidersImpl::applyGUIParams"));
+}
+
+CThreadedCore* CWgtPane3SlidersImpl::createCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* owner) {
+    return new CThreadedCore_Orvela(inPlane, outPlane, owner);
+}

@@ -1,0 +1,77 @@
+#include "GUI/Panes/CWgtPaneFinalTouchImpl.h"
+
+#include "Core/CThreadedCore_FinalTouch.h"
+#include "Utility/Logger.h"
+
+#include <QComboBox>
+#include <QTabBar>
+
+namespace {
+
+// The signal's own value is what was set; the block may have moved it to what its text tells. A block that
+// already has it keeps the text that is being typed.
+void mirror(COrvelaSliderBlockImpl* source, COrvelaSliderBlockImpl* target) {
+    QObject::connect(source, &COrvelaSliderBlockImpl::valueChanged, target, [source, target] {
+        if (target->value() != source->value())
+            target->setValue(source->value());
+    });
+    QObject::connect(source, &COrvelaSliderBlockImpl::stateChanged, target,
+                     &COrvelaSliderBlockImpl::setEnabled);
+}
+
+} // namespace
+
+CWgtPaneFinalTouchImpl::CWgtPaneFinalTouchImpl(QWidget* owner, EGUIMode mode) : IWgtPane(owner, mode) {
+    mAutoRefresh = true;
+    mTakesProcessedImage = true;
+    setupUi(this);
+    nameTabs();
+    mirrorColorFilters();
+    doSetSliders(QString());
+    setUpColorPicker(colrPickPercColorFilter, sldrPercColorFilter);
+    setUpColorPicker(colrPickAbsColorFilter, sldrAbsColorFilter);
+}
+
+// The tabs of the channels show no text.
+void CWgtPaneFinalTouchImpl::nameTabs() {
+    for (QTabWidget* channels : {tabCtnrPercRGB, tabCtnrAbsRGB})
+        for (int tab = 0; tab < channels->count(); ++tab)
+            channels->tabBar()->setAccessibleTabName(tab, channels->tabToolTip(tab));
+}
+
+void CWgtPaneFinalTouchImpl::mirrorColorFilters() {
+    mirror(sldrPercColorFilter, sldrAbsColorFilter);
+    mirror(sldrAbsColorFilter, sldrPercColorFilter);
+    connect(colrPickPercColorFilter, &CColorPicker::colorChanged, colrPickAbsColorFilter,
+            &CColorPicker::setColor);
+    connect(colrPickAbsColorFilter, &CColorPicker::colorChanged, colrPickPercColorFilter,
+            &CColorPicker::setColor);
+}
+
+void CWgtPaneFinalTouchImpl::doSetSliders(const QString&) {
+    for (const SliderDescription& slider : SliderTable::finalTouch())
+        setUpSlider(slider, false, slider.initial);
+}
+
+void CWgtPaneFinalTouchImpl::applyGUIParams(CUserParams& params) {
+    CSliderParams& settings = params.mSliderParams;
+    writeSliders(SliderTable::finalTouch(), settings);
+    writeColor(colrPickAbsColorFilter, settings.mColor_Touch_Value_R, settings.mColor_Touch_Value_G,
+               settings.mColor_Touch_Value_B);
+    Log::log(LogLevel::Debug, "TMP: params.mSliderParams.mColor_Touch_Enabled %d.",
+             settings.mColor_Touch_Enabled);
+}
+
+CThreadedCore* CWgtPaneFinalTouchImpl::createCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* owner) {
+    auto* core = new CThreadedCore_FinalTouch(inPlane, outPlane, owner);
+    enableAfterRuns(btnBack, core);
+    return core;
+}
+
+void CWgtPaneFinalTouchImpl::fillPresetList(QComboBox* list) {
+    list->addItem(QIcon(QStringLiteral(":/Mode_Automatic.png")), tr("Automatic"));
+}
+
+void CWgtPaneFinalTouchImpl::on_btnBack_clicked() {
+    Q_EMIT changeMode(Mode_Advanced);
+}

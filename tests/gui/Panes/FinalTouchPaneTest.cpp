@@ -1,0 +1,164 @@
+#include "Core/CThreadedCore.h"
+#include "GUI/Controls/CColorPicker.h"
+#include "GUI/Panes/CWgtPaneFinalTouchImpl.h"
+#include "GUI/Panes/TrackZones.h"
+#include "PaneFixture.h"
+#include "Utility/CARGBPlane.h"
+
+#include <QAccessible>
+#include <QComboBox>
+#include <QSignalSpy>
+#include <QTest>
+
+#include <gtest/gtest.h>
+
+#include <map>
+
+namespace {
+
+class FinalTouchPane : public testing::Test {
+protected:
+    Shown<CWgtPaneFinalTouchImpl> shown{Mode_FinalTouch};
+    CWgtPaneFinalTouchImpl* pane = shown.pane;
+};
+
+std::vector<Drives> drives() {
+    std::vector<Drives> sliders = {
+        {"sldrAbsContrast", "mContrast_Touch_Value", "mContrast_Touch_Enabled"},
+        {"sldrPercContrast", "mPerceptual_Contrast_Touch_Value", "mPerceptual_Contrast_Touch_Enabled"},
+        {"sldrAbsBrightness", "mBrightness_Touch_Value", "mBrightness_Touch_Enabled"},
+        {"sldrPercBrightness", "mPerceptual_Brightness_Touch_Value", "mPerceptual_Brightness_Touch_Enabled"},
+        {"sldrAbsColorFilter", "mColor_Intensity_Touch_Value", "mColor_Touch_Enabled"},
+    };
+    const std::pair<std::string, std::string> tones[] = {
+        {"Shadows", "Dark"}, {"Middle", "Middle"}, {"Highlights", "Light"}};
+    for (const auto& [shownTone, tone] : tones) {
+        for (const std::string channel : {"R", "G", "B", "RGB"}) {
+            sliders.push_back({"sldrAbs" + shownTone + channel, "m" + tone + "_Touch_Value_" + channel,
+                               "m" + tone + "_Touch_" + channel + "_Enabled"});
+            const std::string perceptual = "mPerceptual_Touch_" + tone;
+            sliders.push_back({"sldrPerc" + shownTone + channel, perceptual + "_Value_" + channel,
+                               perceptual + '_' + channel + "_Enabled"});
+        }
+    }
+    return sliders;
+}
+
+TEST_F(FinalTouchPane, StartsNeutralAndWritesEverySliderIntoItsOwnFields) {
+    pane->sldrAbsMiddleRGB->setEnabled(true);
+    for (int round = 0; round < 2; ++round) {
+        pane->setSliders(QStringLiteral("Automatic"));
+        const std::map<std::string, const char*> texts = {{"Shadows", "0.0"},      {"Middle", "1.0"},
+                                                          {"Highlights", "255.0"}, {"Contrast", "0.0"},
+                                                          {"Brightness", "0.0"},   {"Color Filter", "0.0"}};
+        for (const SliderDescription& slider : SliderTable::finalTouch()) {
+            const COrvelaSliderBlockImpl* block = blockOf(pane, slider.object);
+            EXPECT_FALSE(block->isEnabled()) << slider.object;
+            EXPECT_STREQ(qPrintable(block->txtValue->text()), texts.at(slider.label)) << slider.object;
+        }
+    }
+    EXPECT_EQ(SliderTable::finalTouch().size(), drives().size() + 1);
+    pane->colrPickPercColorFilter->setColor(QColor(9, 8, 7));
+    expectWrites(pane, drives(), "mColor_Touch_Value_", QColor(9, 8, 7));
+    for (const SliderDescription& slider : SliderTable::finalTouch())
+        expectShowsEveryPosition(pane, slider);
+}
+
+TEST_F(FinalTouchPane, ColorFiltersAndPickersMirrorEachOther) {
+    COrvelaSliderBlockImpl* const sliders[] = {pane->sldrPercColorFilter, pane->sldrAbsColorFilter};
+    CColorPicker* const pickers[] = {pane->colrPickPercColorFilter, pane->colrPickAbsColorFilter};
+    for (const int from : {0, 1}) {
+        const int to = 1 - from;
+        pane->tabCtnrFinalTouch->setCurrentIndex(from);
+        EXPECT_FALSE(pickers[from]->isVisible());
+        sliders[from]->setEnabled(true);
+        EXPECT_TRUE(sliders[to]->isEnabled());
+        EXPECT_TRUE(pickers[from]->isVisible());
+        sliders[from]->txtValue->selectAll();
+        QTest::keyClicks(sliders[from]->txtValue, from == 0 ? "12.3" : "45.6");
+        EXPECT_EQ(sliders[from]->txtValue->text(), QLatin1String(from == 0 ? "12.3" : "45.6"));
+        EXPECT_NEAR(sliders[to]->value(), from == 0 ? 123 : 456, 1e-9);
+        CThinHorizontalSlider* thin = sliders[from]->sldrValue;
+        QTest::mouseClick(thin, Qt::LeftButton, {}, QPoint(thin->width() / 3, 3));
+        EXPECT_GT(sliders[to]->value(), 300);
+        EXPECT_EQ(sliders[to]->value(), sliders[from]->value());
+        pickers[from]->setColor(QColor(from, 20, 30));
+        EXPECT_EQ(pickers[to]->color(), QColor(from, 20, 30));
+        sliders[from]->setEnabled(false);
+        EXPECT_FALSE(sliders[to]->isEnabled() || pickers[from]->isVisible());
+        pane->setSliders(QString());
+    }
+    CUserParams params;
+    const QByteArrayList lines = logged([&] {
+        pane->sldrPercColorFilter->setEnabled(true);
+        pane->applyGUIParams(params);
+    });
+    EXPECT_EQ(lines.last(), "TMP: params.mSliderParams.mColor_Touch_Enabled 1.");
+}
+
+TEST_F(FinalTouchPane, GoesOnFromTheProcessedImageAndLeadsBack) {
+    EXPECT_TRUE(pane->autoRefresh() && pane->takesProcessedImage() && !pane->showsPresets());
+    QComboBox list;
+    pane->fillPresetList(&list);
+    ASSERT_EQ(list.count(), 1);
+    EXPECT_EQ(list.itemText(0), QStringLiteral("Automatic"));
+    EXPECT_FALSE(list.itemIcon(0).isNull());
+    CARGBPlane in(8, 8, QStringLiteral("in"));
+    CARGBPlane out(8, 8, QStringLiteral("out"));
+    CThreadedCore* core = pane->createCore(&in, &out, &shown.owner);
+    EXPECT_STREQ(core->metaObject()->className(), "CThreadedCore_FinalTouch");
+    QSignalSpy changed(pane, &IWgtPane::changeMode);
+    Q_EMIT core->started();
+    Q_EMIT core->finished();
+    QTest::mouseClick(pane->btnBack, Qt::LeftButton);
+    EXPECT_EQ(changed.count(), 0) << "no run was completed";
+    QObject::connect(core, &CThreadedCore::stepDone, core, &CThreadedCore::stepHandled);
+    core->run();
+    Q_EMIT core->finished();
+    QTest::mouseClick(pane->btnBack, Qt::LeftButton);
+    ASSERT_EQ(changed.count(), 1);
+    EXPECT_EQ(changed[0][0].value<EGUIMode>(), Mode_Advanced);
+    EXPECT_EQ(QAccessible::queryAccessibleInterface(pane->tabCtnrAbsRGB->tabBar())
+                  ->child(3)
+                  ->text(QAccessible::Name),
+              QStringLiteral("All channels"));
+}
+
+// Every position of a set as one letter of its colour, runs counted: "600g300o101r".
+std::string described(const QList<ZoneStop>& stops) {
+    const std::map<QRgb, char> letters = {{qRgb(0, 255, 40), 'g'}, {qRgb(255, 120, 0), 'o'},
+                                          {qRgb(255, 40, 0), 'r'}, {qRgb(0, 0, 255), 'b'},
+                                          {qRgb(0, 40, 255), 'l'}, {qRgb(255, 170, 23), 'p'}};
+    std::string text;
+    int run = 0;
+    for (int position = 0; position <= 1000; ++position) {
+        const QRgb color = zoneColor(stops, position).rgb();
+        ++run;
+        if (position < 1000 && zoneColor(stops, position + 1).rgb() == color)
+            continue;
+        text += std::to_string(run) + letters.at(color);
+        run = 0;
+    }
+    return text;
+}
+
+TEST(TrackZones, SetsHoldTheirBandsAndSlidersTheirSets) {
+    const char* const sets[] = {
+        "600g300o101r",        "200r200o488g56o57r", "1001l",    "1001b",
+        "200r200o288g256o57r", "695g170o136r",       "750g251o", "700g301o",
+        "300g200o501r",        "350r150o501g",       "1001b",    "200r200o188g56o357r",
+        "200r200p288g256p57r"};
+    for (int number = 1; number <= 13; ++number)
+        EXPECT_EQ(described(TrackZones::set(number)), sets[number - 1]) << number;
+    EXPECT_TRUE(TrackZones::set(0).isEmpty() && TrackZones::set(14).isEmpty());
+    Shown<CWgtPaneFinalTouchImpl> shown(Mode_FinalTouch);
+    const std::pair<const char*, int> expected[] = {
+        {"sldrPercMiddleRGB", 13}, {"sldrPercMiddleB", 5},      {"sldrPercBrightness", 5},
+        {"sldrPercContrast", 1},   {"sldrPercShadowsRGB", 1},   {"sldrPercColorFilter", 3},
+        {"sldrAbsShadowsR", 3},    {"sldrAbsHighlightsRGB", 3}, {"sldrAbsHighlightsG", 4},
+        {"sldrAbsContrast", 4},    {"sldrAbsBrightness", 4},    {"sldrAbsColorFilter", 4}};
+    for (const auto& [object, number] : expected)
+        EXPECT_EQ(blockOf(shown.pane, object)->zoneStops(), TrackZones::set(number)) << object;
+}
+
+} // namespace
