@@ -1,37 +1,21 @@
-// Writes pictures of every control to a folder: control_screenshots FOLDER SUFFIX [dark]. The scale is that
-// of the environment variable QT_SCALE_FACTOR; the suffix tells the variants apart.
-
-#include "GUI/Controls/Artwork.h"
 #include "GUI/Controls/CColorPicker.h"
 #include "GUI/Controls/CColorPickerPopup.h"
 #include "GUI/Controls/COrvelaSliderBlockImpl.h"
 #include "GUI/Controls/COrvelaStatusIndicator.h"
 #include "GUI/Controls/CSignaledGraphicsView.h"
 #include "GUI/Controls/PreviewScene.h"
+#include "Shots.h"
 #include "Utility/CARGBPlane.h"
 
-#include <QApplication>
 #include <QDirIterator>
 #include <QGraphicsScene>
 #include <QGridLayout>
 #include <QLabel>
 #include <QToolButton>
 
-#include <cstdio>
-#include <memory>
-
 namespace {
 
 using Widget = std::unique_ptr<QWidget>;
-
-QPalette darkPalette() {
-    QPalette dark(QColor(53, 53, 53));
-    dark.setColor(QPalette::Base, QColor(35, 35, 35));
-    dark.setColor(QPalette::Highlight, QColor(42, 130, 218));
-    for (auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText})
-        dark.setColor(QPalette::Disabled, role, QColor(140, 140, 140));
-    return dark;
-}
 
 COrvelaSliderBlockImpl* addBlock(QWidget* parent, const char* name, const SliderScale& scale, double position,
                                  bool on) {
@@ -130,16 +114,6 @@ Widget logo() {
     return label;
 }
 
-bool save(QWidget& widget, const QString& path) {
-    widget.show();
-    widget.activateWindow();
-    QCoreApplication::processEvents();
-    const bool saved = widget.grab().save(path);
-    if (!saved)
-        std::fprintf(stderr, "control_screenshots: cannot write %s\n", qPrintable(path));
-    return saved;
-}
-
 // Hues along the columns, darker towards the foot.
 void fill(CARGBPlane& plane) {
     plane.setColorMode(CARGBPlane::Color);
@@ -156,30 +130,15 @@ void fill(CARGBPlane& plane) {
 
 } // namespace
 
-int main(int argc, char** argv) {
-    QApplication application(argc, argv);
-    const QStringList arguments = QCoreApplication::arguments();
-    if (arguments.size() < 3) {
-        std::fputs("usage: control_screenshots FOLDER SUFFIX [dark]\n", stderr);
-        return 2;
-    }
-    if (arguments.value(3) == QLatin1String("dark"))
-        QApplication::setPalette(darkPalette());
-    QApplication::setStyle(QStringLiteral("Fusion"));
-    initArtwork();
-    CARGBPlane plane(240, 160, QStringLiteral("preview"));
+std::vector<Shot> controlShots(CARGBPlane& plane) {
     fill(plane);
-    std::pair<const char*, Widget> shots[] = {
-        {"slider-blocks", sliderBlocks()},
-        {"color-pickers", colorPickers()},
-        {"color-field", std::make_unique<CColorPickerPopup>()},
-        {"status-indicators", statusIndicators()},
-        {"preview", preview(plane)},
-        {"icons", icons()},
-        {"logo", logo()},
-    };
-    bool saved = true;
-    for (auto& [name, widget] : shots)
-        saved = save(*widget, QStringLiteral("%1/%2-%3.png").arg(arguments[1], name, arguments[2])) && saved;
-    return saved ? 0 : 1;
+    std::vector<Shot> shots;
+    shots.emplace_back("slider-blocks", sliderBlocks());
+    shots.emplace_back("color-pickers", colorPickers());
+    shots.emplace_back("color-field", std::make_unique<CColorPickerPopup>());
+    shots.emplace_back("status-indicators", statusIndicators());
+    shots.emplace_back("preview", preview(plane));
+    shots.emplace_back("icons", icons());
+    shots.emplace_back("logo", logo());
+    return shots;
 }

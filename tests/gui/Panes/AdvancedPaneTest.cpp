@@ -1,6 +1,7 @@
 #include "Core/CThreadedCore.h"
 #include "GUI/Controls/CColorPicker.h"
 #include "GUI/Panes/CWgtPaneAdvancedImpl.h"
+#include "GUI/Panes/TrackZones.h"
 #include "PaneFixture.h"
 #include "Utility/CARGBPlane.h"
 #include "Utility/ModeTable.h"
@@ -62,10 +63,16 @@ TEST_F(AdvancedPane, WritesEverySliderIntoItsOwnFields) {
     EXPECT_EQ(lines.last(), "CWgtPaneAdvancedImpl::applyGUIParams finished.");
 }
 
-TEST_F(AdvancedPane, SlidersShowEveryPosition) {
+TEST_F(AdvancedPane, SlidersShowEveryPositionOnTracksOfTheirOwnColors) {
     load("Portrait");
-    for (const SliderDescription& slider : SliderTable::advanced())
+    constexpr int kZones[] = {4, 4, 1, 1,  4, 1, 4, 2, 7,  8, 8, 1,  6,
+                              6, 9, 1, 12, 1, 4, 4, 4, 12, 1, 1, 10, 4};
+    const int* zones = kZones;
+    for (const SliderDescription& slider : SliderTable::advanced()) {
         expectShowsEveryPosition(pane, slider);
+        EXPECT_EQ(blockOf(pane, slider.object)->zoneStops(), TrackZones::set(*zones++)) << slider.object;
+        EXPECT_EQ(blockOf(pane, slider.object)->toolTip(), QLatin1String(slider.label));
+    }
 }
 
 TEST_F(AdvancedPane, FactoryPresetsGiveTheValuesOfTheirModes) {

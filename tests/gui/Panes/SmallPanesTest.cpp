@@ -2,6 +2,7 @@
 #include "GUI/Controls/CColorPicker.h"
 #include "GUI/Panes/CWgtPane3SlidersImpl.h"
 #include "GUI/Panes/CWgtPaneGenericImpl.h"
+#include "GUI/Panes/TrackZones.h"
 #include "PaneFixture.h"
 #include "Utility/CARGBPlane.h"
 
@@ -68,6 +69,7 @@ TEST(GenericPane, DrivesTheOneFieldOfItsMode) {
                                   "SaltPepperValue",    "BilinearFilteringValue",
                                   "mMoire_Value",       "Temperature_Value",
                                   "mAuto_Color_Value",  "mColor_Effect_Intensity_Value"};
+    constexpr int kZones[] = {6, 9, 7, 8, 8, 1, 2, 12, 1, 1, 1, 11, 1, 11};
     for (int number = Mode_SmartSharpness; number <= Mode_ColorFilter; ++number) {
         SCOPED_TRACE(number);
         const auto mode = static_cast<EGUIMode>(number);
@@ -75,6 +77,7 @@ TEST(GenericPane, DrivesTheOneFieldOfItsMode) {
         COrvelaSliderBlockImpl* block = shown.pane->sldrGeneric;
         EXPECT_TRUE(block->isEnabled());
         EXPECT_EQ(block->width(), 240);
+        EXPECT_EQ(block->zoneStops(), TrackZones::set(kZones[number - Mode_SmartSharpness]));
         const bool halfway =
             mode == Mode_Saturation || mode == Mode_SmartBrightness || mode == Mode_SmartGamma;
         EXPECT_NEAR(block->value(), halfway ? 500 : 0, 1e-9);
@@ -96,6 +99,10 @@ TEST(GenericPane, ColorFilterStartsWithGreenAndShowsItsPickerWhileOn) {
     EXPECT_TRUE(picker->isVisible());
     shown.pane->sldrGeneric->setEnabled(false);
     EXPECT_FALSE(picker->isVisible());
+    shown.pane->sldrGeneric->setEnabled(true);
+    shown.pane->setSliders(QString()); // no factory preset of this pane: only the reset
+    EXPECT_FALSE(shown.pane->sldrGeneric->isEnabled());
+    EXPECT_EQ(shown.pane->sldrGeneric->value(), 500);
     picker->setColor(Qt::blue);
     EXPECT_EQ(shown.owner.colors.last(), QColor(Qt::blue));
 }

@@ -1,0 +1,55 @@
+// Writes pictures of every control, or of every pane, to a folder:
+//     gui_screenshots controls|panes FOLDER SUFFIX [dark]
+// The scale is that of the environment variable QT_SCALE_FACTOR; the suffix tells the variants apart.
+
+#include "GUI/Controls/Artwork.h"
+#include "Shots.h"
+#include "Utility/CARGBPlane.h"
+
+#include <QApplication>
+
+#include <cstdio>
+
+namespace {
+
+QPalette darkPalette() {
+    QPalette dark(QColor(53, 53, 53));
+    dark.setColor(QPalette::Base, QColor(35, 35, 35));
+    dark.setColor(QPalette::Highlight, QColor(42, 130, 218));
+    for (auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText})
+        dark.setColor(QPalette::Disabled, role, QColor(140, 140, 140));
+    return dark;
+}
+
+bool save(QWidget& widget, const QString& path) {
+    widget.show();
+    widget.activateWindow();
+    QCoreApplication::processEvents();
+    const bool saved = widget.grab().save(path);
+    if (!saved)
+        std::fprintf(stderr, "gui_screenshots: cannot write %s\n", qPrintable(path));
+    return saved;
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+    QApplication application(argc, argv);
+    const QStringList arguments = QCoreApplication::arguments();
+    if (arguments.size() < 4) {
+        std::fputs("usage: gui_screenshots controls|panes FOLDER SUFFIX [dark]\n", stderr);
+        return 2;
+    }
+    if (arguments.value(4) == QLatin1String("dark"))
+        QApplication::setPalette(darkPalette());
+    QApplication::setStyle(QStringLiteral("Fusion"));
+    initArtwork();
+    CARGBPlane plane(240, 160, QStringLiteral("preview"));
+    const bool panes = arguments[1] == QLatin1String("panes");
+    bool saved = true;
+    for (auto& [name, widget] : panes ? paneShots() : controlShots(plane)) {
+        const QString file = QString::fromStdString(name) + QLatin1Char('-') + arguments[3];
+        saved = save(*widget, QStringLiteral("%1/%2.png").arg(arguments[2], file)) && saved;
+    }
+    return saved ? 0 : 1;
+}
