@@ -1,13 +1,10 @@
-#include "Core/CThreadedCore.h"
 #include "GUI/Controls/CColorPicker.h"
 #include "GUI/Panes/CWgtPaneFinalTouchImpl.h"
 #include "GUI/Panes/TrackZones.h"
 #include "PaneFixture.h"
-#include "Utility/CARGBPlane.h"
 
 #include <QAccessible>
 #include <QComboBox>
-#include <QSignalSpy>
 #include <QTest>
 
 #include <gtest/gtest.h>
@@ -103,51 +100,40 @@ TEST_F(FinalTouchPane, GoesOnFromTheProcessedImageAndLeadsBack) {
     ASSERT_EQ(list.count(), 1);
     EXPECT_EQ(list.itemText(0), QStringLiteral("Automatic"));
     EXPECT_FALSE(list.itemIcon(0).isNull());
-    CARGBPlane in(8, 8, QStringLiteral("in"));
-    CARGBPlane out(8, 8, QStringLiteral("out"));
-    CThreadedCore* core = pane->createCore(&in, &out, &shown.owner);
-    EXPECT_STREQ(core->metaObject()->className(), "CThreadedCore_FinalTouch");
-    QSignalSpy changed(pane, &IWgtPane::changeMode);
-    Q_EMIT core->started();
-    Q_EMIT core->finished();
-    QTest::mouseClick(pane->btnBack, Qt::LeftButton);
-    EXPECT_EQ(changed.count(), 0) << "no run was completed";
-    QObject::connect(core, &CThreadedCore::stepDone, core, &CThreadedCore::stepHandled);
-    core->run();
-    Q_EMIT core->finished();
-    QTest::mouseClick(pane->btnBack, Qt::LeftButton);
-    ASSERT_EQ(changed.count(), 1);
-    EXPECT_EQ(changed[0][0].value<EGUIMode>(), Mode_Advanced);
+    expectLeadsOn(pane, pane->btnBack, "CThreadedCore_FinalTouch", Mode_Advanced);
     EXPECT_EQ(QAccessible::queryAccessibleInterface(pane->tabCtnrAbsRGB->tabBar())
                   ->child(3)
                   ->text(QAccessible::Name),
               QStringLiteral("All channels"));
 }
 
-// Every position of a set as one letter of its colour, runs counted: "600g300o101r".
+// The bands of a set, each as its last position and the letter of its colour: "599g 899o 1000r ".
 std::string described(const QList<ZoneStop>& stops) {
-    const std::map<QRgb, char> letters = {{qRgb(0, 255, 40), 'g'}, {qRgb(255, 120, 0), 'o'},
-                                          {qRgb(255, 40, 0), 'r'}, {qRgb(0, 0, 255), 'b'},
-                                          {qRgb(0, 40, 255), 'l'}, {qRgb(255, 170, 23), 'p'}};
+    const std::map<QRgb, char> letters = {{0xff00ff28, 'g'}, {0xffff7800, 'o'}, {0xffff2800, 'r'},
+                                          {0xff0000ff, 'b'}, {0xff0028ff, 'l'}, {0xffffaa17, 'p'}};
     std::string text;
-    int run = 0;
-    for (int position = 0; position <= 1000; ++position) {
-        const QRgb color = zoneColor(stops, position).rgb();
-        ++run;
-        if (position < 1000 && zoneColor(stops, position + 1).rgb() == color)
-            continue;
-        text += std::to_string(run) + letters.at(color);
-        run = 0;
+    for (int i = 0; i + 1 < stops.size(); i += 2) {
+        EXPECT_EQ(stops[i].position, i == 0 ? 0 : stops[i - 1].position + 1);
+        EXPECT_EQ(stops[i].color, stops[i + 1].color);
+        text += std::to_string(int(stops[i + 1].position)) + letters.at(stops[i].color.rgb()) + ' ';
     }
     return text;
 }
 
 TEST(TrackZones, SetsHoldTheirBandsAndSlidersTheirSets) {
-    const char* const sets[] = {
-        "600g300o101r",        "200r200o488g56o57r", "1001l",    "1001b",
-        "200r200o288g256o57r", "695g170o136r",       "750g251o", "700g301o",
-        "300g200o501r",        "350r150o501g",       "1001b",    "200r200o188g56o357r",
-        "200r200p288g256p57r"};
+    const char* const sets[] = {"599g 899o 1000r ",
+                                "199r 399o 887g 943o 1000r ",
+                                "1000l ",
+                                "1000b ",
+                                "199r 399o 687g 943o 1000r ",
+                                "694g 864o 1000r ",
+                                "749g 1000o ",
+                                "699g 1000o ",
+                                "299g 499o 1000r ",
+                                "349r 499o 1000g ",
+                                "1000b ",
+                                "199r 399o 587g 643o 1000r ",
+                                "199r 399p 687g 943p 1000r "};
     for (int number = 1; number <= 13; ++number)
         EXPECT_EQ(described(TrackZones::set(number)), sets[number - 1]) << number;
     EXPECT_TRUE(TrackZones::set(0).isEmpty() && TrackZones::set(14).isEmpty());

@@ -1,8 +1,12 @@
 #include "PaneFixture.h"
 
+#include "Core/CThreadedCore.h"
+#include "Utility/CARGBPlane.h"
 #include "Utility/DebugBoxes.h"
 #include "Utility/Logger.h"
 #include "Utility/SettingFields.h"
+
+#include <QSignalSpy>
 
 #include <gtest/gtest.h>
 
@@ -85,6 +89,27 @@ void expectShowsEveryPosition(const QWidget* pane, const SliderDescription& slid
         Q_EMIT block->txtValue->editingFinished();
         EXPECT_EQ(block->txtValue->text(), text) << "inside the range";
     }
+}
+
+void expectLeadsOn(IWgtPane* pane, QAbstractButton* button, const char* coreClass, EGUIMode mode) {
+    QSignalSpy changed(pane, &IWgtPane::changeMode);
+    CARGBPlane in(16, 16, QStringLiteral("in"));
+    CARGBPlane out(16, 16, QStringLiteral("out"));
+    CThreadedCore* core = pane->createCore(&in, &out, pane);
+    EXPECT_STREQ(core->metaObject()->className(), coreClass);
+    EXPECT_EQ(core->parent(), pane);
+    Q_EMIT core->started();
+    button->click();
+    Q_EMIT core->finished();
+    button->click();
+    EXPECT_EQ(changed.count(), 0) << "no run was completed";
+    QObject::connect(core, &CThreadedCore::stepDone, core, &CThreadedCore::stepHandled);
+    core->setParams(CUserParamsPhotoshop(pane->mode()));
+    core->run();
+    Q_EMIT core->terminated();
+    button->click();
+    ASSERT_EQ(changed.count(), 1);
+    EXPECT_EQ(changed[0][0].value<EGUIMode>(), mode);
 }
 
 QByteArrayList logged(const std::function<void()>& action) {

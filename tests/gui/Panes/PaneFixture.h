@@ -3,6 +3,7 @@
 #include "GUI/Controls/COrvelaSliderBlockImpl.h"
 #include "GUI/Panes/IWgtPane.h"
 
+#include <QAbstractButton>
 #include <QColor>
 #include <QVBoxLayout>
 
@@ -53,6 +54,10 @@ void expectShowsEveryPosition(const QWidget* pane, const SliderDescription& slid
 
 /// How far the text's one decimal may move the slider from `position`.
 double snapping(const SliderDescription& slider, double position);
+
+/// Expects a core of that class, and `button` to ask for `mode` unless the core's last run began and was not
+/// completed.
+void expectLeadsOn(IWgtPane* pane, QAbstractButton* button, const char* coreClass, EGUIMode mode);
 
 /// The lines logged at any level while `action` runs, without their indentation.
 QByteArrayList logged(const std::function<void()>& action);

@@ -62,13 +62,12 @@ TEST(ThreeSlidersPane, LogsEachSetUpAndReportsOtherModes) {
 }
 
 TEST(GenericPane, DrivesTheOneFieldOfItsMode) {
-    const char* const fields[] = {"OrvelaLevelValue",   "OrvelaLevel3Value",
-                                  "ClarityFilterValue", "mDigital_Flash_Value",
-                                  "SaturationValue",    "Contrast2Value",
-                                  "Brightness2Value",   "PerceptualGamma",
-                                  "SaltPepperValue",    "BilinearFilteringValue",
-                                  "mMoire_Value",       "Temperature_Value",
-                                  "mAuto_Color_Value",  "mColor_Effect_Intensity_Value"};
+    const QByteArrayList fields =
+        QByteArray(
+            "OrvelaLevelValue OrvelaLevel3Value ClarityFilterValue mDigital_Flash_Value SaturationValue "
+            "Contrast2Value Brightness2Value PerceptualGamma SaltPepperValue BilinearFilteringValue "
+            "mMoire_Value Temperature_Value mAuto_Color_Value mColor_Effect_Intensity_Value")
+            .split(' ');
     constexpr int kZones[] = {6, 9, 7, 8, 8, 1, 2, 12, 1, 1, 1, 11, 1, 11};
     for (int number = Mode_SmartSharpness; number <= Mode_ColorFilter; ++number) {
         SCOPED_TRACE(number);
@@ -85,7 +84,7 @@ TEST(GenericPane, DrivesTheOneFieldOfItsMode) {
         ASSERT_EQ(picker != nullptr, mode == Mode_ColorFilter);
         if (picker)
             picker->setColor(QColor(1, 2, 200));
-        expectWrites(shown.pane, {{"sldrGeneric", fields[number - Mode_SmartSharpness], ""}},
+        expectWrites(shown.pane, {{"sldrGeneric", fields[number - Mode_SmartSharpness].toStdString(), ""}},
                      picker ? "mColor_Value_" : "", QColor(1, 2, 200));
         expectShowsEveryPosition(shown.pane, *SliderTable::single(mode));
         expectPlainPane(shown.pane);
