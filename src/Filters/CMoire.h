@@ -1,16 +1,13 @@
 #pragma once
 
 #include "Filters/IFilter.h"
+#include "Filters/MoireKernel.h"
 
-#include <array>
+#include <optional>
 
-/// Moire guard: where a darkness-biased Gaussian average of the processed 5x5 neighbourhood lies more than 15
-/// levels from the unprocessed host pixel in all three channels, the host pixel is put back.
-///
-///     average = sum of min(centre, neighbour) * w / sum of w,   w = 1 / exp(d^2 / D)
-///     D = 2 * s^4,   s = mMoire_Value * 1.5 / 1000 + 0.5
-///
-/// The last column and row of the picture never enter a window; a pixel without a window stays as it is.
+/// Moire guard: puts the unprocessed host pixel back where the processed neighbourhood has moved far from it
+/// in all three channels (see MoireKernel), by mMoire_Value. Stays away where corrections that change the
+/// brightness are on.
 class CMoire final : public IFilter {
 public:
     using IFilter::IFilter;
@@ -21,8 +18,5 @@ protected:
     bool PostApply() override;
 
 private:
-    bool differsFrom(const ConstRow& host, int x, int y) const;
-
-    static constexpr std::int32_t mRadius = 2;
-    std::array<float, 2 * mRadius* mRadius + 1> mGauss = {}; ///< by squared distance
+    std::optional<MoireKernel> mKernel; ///< between PreApply and PostApply
 };
