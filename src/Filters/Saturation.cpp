@@ -14,45 +14,6 @@ constexpr float kWidth = 11.0F;        // of the window around a channel mean
 constexpr float kLargestProduct = 1e9; // keeps extreme brightness ratios within integers
 constexpr unsigned kRowGrain = 16;
 
-// Values 0 to 1 of the channels of a colour of hue (degrees), saturation and value.
-std::array<float, 3> fromHsv(float hue, float saturation, float v) {
-    if (saturation == 0)
-        return {v, v, v};
-    const float h = hue / 60;
-    const float i = std::floor(h);
-    const float f = h - i;
-    const float p = v * (1 - saturation);
-    const float q = v * (1 - f * saturation);
-    const float t = v * (1 - (1 - f) * saturation);
-    switch (static_cast<int>(i)) {
-    case 1:
-        return {q, v, p};
-    case 2:
-        return {p, v, t};
-    case 3:
-        return {p, q, v};
-    case 4:
-        return {t, p, v};
-    case 5:
-        return {v, p, q};
-    default:
-        return {v, t, p};
-    }
-}
-
-float hueOf(int r, int g, int b, int largest, int range) {
-    if (range == 0)
-        return 0;
-    const auto share = [range](int difference) {
-        return static_cast<float>(difference) * 60 / static_cast<float>(range);
-    };
-    if (r == largest)
-        return g < b ? share(g - b) + 360 : share(g - b);
-    if (g == largest)
-        return share(b - r) + 120;
-    return share(r - g) + 240;
-}
-
 } // namespace
 
 Saturation::Saturation(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
@@ -76,7 +37,7 @@ bool Saturation::PreApply() {
     if (mDominant)
         prepareDominant(means);
     else
-        prepareSaturations();
+        mHsv.emplace(mChange, mAlfa);
     return true;
 }
 
@@ -84,6 +45,7 @@ void Saturation::chooseStrength(float position) {
     const int n = PixelMath::trunc(position);
     const double above = static_cast<double>(position) - 500;
     mDominant = n >= 500 && n <= 600;
+    mChange = n < 500 ? SaturationKernel::Change::Lower : SaturationKernel::Change::Raise;
     if (mDominant)
         mStrength = static_cast<float>(above / 200);
     else if (n > 600)
@@ -146,32 +108,6 @@ void Saturation::prepareDominant(const Means& means) {
     mBlue = curve(means.b);
 }
 
-void Saturation::prepareSaturations() {
-    mSaturations.assign(256 * 256, 0.0F);
-    for (std::size_t largest = 1; largest < 256; ++largest) {
-        for (std::size_t range = 0; range <= largest; ++range)
-            mSaturations[largest * 256 + range] =
-                saturationFor(static_cast<float>(range) / static_cast<float>(largest));
-    }
-}
-
-float Saturation::saturationFor(float saturation) const {
-    if (PixelMath::trunc(mParams->mSliderParams.SaturationValue) < 501)
-        return saturation - saturation * mAlfa;
-    const double boost = mAlfa / std::cosh(static_cast<double>((255 - 255 * saturation) / 120));
-    const float headroom = 2 - saturation;
-    return static_cast<float>(std::min(saturation + boost / (headroom * headroom), 1.0));
-}
-
-PixelMath::Rgb Saturation::resaturate(int r, int g, int b) const {
-    const int largest = std::max({r, g, b});
-    const int range = largest - std::min({r, g, b});
-    const float saturation = mSaturations[static_cast<std::size_t>(largest * 256 + range)];
-    const float v = static_cast<float>(largest) / 255;
-    const std::array<float, 3> c = fromHsv(hueOf(r, g, b, largest, range), saturation, v);
-    return {PixelMath::trunc(255 * c[0]), PixelMath::trunc(255 * c[1]), PixelMath::trunc(255 * c[2])};
-}
-
 void Saturation::ApplyRow(std::uint32_t row) {
     beginRow(row, "Filters/Saturation", 146);
     const int width = mInPlane->width();
@@ -181,12 +117,7 @@ void Saturation::ApplyRow(std::uint32_t row) {
         applyCurves(mRed, mGreen, mBlue, in, out, width);
         return;
     }
-    for (int x = 0; x < width; ++x) {
-        const PixelMath::Rgb c = resaturate(in[0][x], in[1][x], in[2][x]);
-        out[0][x] = static_cast<std::uint8_t>(c.r);
-        out[1][x] = static_cast<std::uint8_t>(c.g);
-        out[2][x] = static_cast<std::uint8_t>(c.b);
-    }
+    mHsv->applyRow(in, out, width);
 }
 
 bool Saturation::PostApply() {

@@ -2,8 +2,9 @@
 
 #include "Filters/HueKeepingCurves.h"
 #include "Filters/IFilter.h"
+#include "Filters/SaturationKernel.h"
 
-#include <vector>
+#include <optional>
 
 /// Lowers or raises saturation in HSV space, or strengthens the picture's dominant colour, and then restores
 /// the picture's mean brightness. By the slider position S:
@@ -40,11 +41,9 @@ private:
     Means measure(const CARGBPlane& plane, int margin) const;
     bool restoresOriginalLuma() const;
     void prepareDominant(const Means& means);
-    void prepareSaturations();
-    float saturationFor(float saturation) const;
-    PixelMath::Rgb resaturate(int r, int g, int b) const;
 
-    float mAlfa = 1;        ///< saturation factor
+    float mAlfa = 1; ///< saturation factor
+    SaturationKernel::Change mChange = SaturationKernel::Change::Raise;
     bool mDominant = false; ///< dominant-colour mode
     float mStrength = 0;    ///< k
     float mMeanIn = 0;      ///< brightness to restore
@@ -52,5 +51,5 @@ private:
     Curve mRed = {};        ///< dominant-colour mode: results by value
     Curve mGreen = {};
     Curve mBlue = {};
-    std::vector<float> mSaturations; ///< new saturations by the largest channel and the range of the channels
+    std::optional<SaturationKernel> mHsv; ///< otherwise
 };
