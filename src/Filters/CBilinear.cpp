@@ -1,14 +1,13 @@
 #include "Filters/CBilinear.h"
 
+#include "Filters/BilateralKernel.h"
 #include "Filters/PixelMath.h"
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
 #include "Utility/RowScheduler.h"
 
-#include <algorithm>
 #include <cmath>
 #include <new>
-#include <utility>
 
 namespace {
 
@@ -17,16 +16,8 @@ constexpr std::size_t kDistances = 4; // of which 0, 1 and 2 occur
 constexpr std::size_t kRanges = 3 * 255 * 255 + 1;
 constexpr double kRangeScale = 0.05;
 constexpr float kLargeSide = 700; // square root of the pixel count
-constexpr int kTileWidth = 256;
 
 } // namespace
-
-// The running sums of neighbouring pixels of a row, side by side, so that the additions run on vectors.
-struct CBilinear::Tile {
-    int count;
-    std::array<double, kTileWidth> weight;
-    std::array<std::array<double, kTileWidth>, 3> sums;
-};
 
 CBilinear::CBilinear(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
     : IFilter(params, inPlane, outPlane) {
@@ -96,52 +87,8 @@ CBilinear::Floats CBilinear::allocate(std::size_t count) const {
 
 void CBilinear::ApplyRow(std::uint32_t row) {
     beginRow(row, kSource, 124);
-    const int end = mInPlane->width() - 1;
-    for (int first = 1; first < end; first += kTileWidth)
-        smoothTile(static_cast<int>(row), first, std::min(kTileWidth, end - first));
-}
-
-void CBilinear::smoothTile(int y, int first, int count) const {
-    const auto at = [this](int x, int line) {
-        const ConstRow row = std::as_const(*mInPlane).row(line);
-        return ConstRow{row[0] + x, row[1] + x, row[2] + x};
-    };
-    Tile tile;
-    tile.count = count;
-    tile.weight.fill(0);
-    for (auto& sums : tile.sums)
-        sums.fill(0);
-    for (int dy = -1; dy <= 1; ++dy) {
-        for (int dx = -1; dx <= 1; ++dx) {
-            const float spatial = m_cBilinear[static_cast<std::size_t>(dx * dx + dy * dy)];
-            addNeighbour(at(first, y), at(first + dx, y + dy), spatial, tile);
-        }
-    }
-    const Row out = mOutPlane->row(y);
-    for (std::size_t c = 0; c < 3; ++c) {
-        for (int i = 0; i < count; ++i) {
-            const auto k = static_cast<std::size_t>(i);
-            out[c][first + i] =
-                static_cast<std::uint8_t>(static_cast<float>(tile.sums[c][k] / tile.weight[k]));
-        }
-    }
-}
-
-void CBilinear::addNeighbour(const ConstRow& centre, const ConstRow& neighbour, float spatial,
-                             Tile& tile) const {
-    std::array<float, kTileWidth> weights;
-    const auto count = static_cast<std::size_t>(tile.count);
-    for (std::size_t i = 0; i < count; ++i) {
-        const int r = centre[0][i] - neighbour[0][i];
-        const int g = centre[1][i] - neighbour[1][i];
-        const int b = centre[2][i] - neighbour[2][i];
-        weights[i] = m_sBilinear[static_cast<std::size_t>(r * r + g * g + b * b)] * spatial;
-        tile.weight[i] += static_cast<double>(weights[i]);
-    }
-    for (std::size_t c = 0; c < 3; ++c) {
-        for (std::size_t i = 0; i < count; ++i)
-            tile.sums[c][i] += static_cast<double>(weights[i]) * neighbour[c][i];
-    }
+    BilateralKernel(m_cBilinear.get(), m_sBilinear.get())
+        .applyRow(*mInPlane, *mOutPlane, static_cast<int>(row));
 }
 
 bool CBilinear::PostApply() {

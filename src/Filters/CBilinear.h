@@ -4,16 +4,15 @@
 
 #include <memory>
 
-/// Noise filter: edge-preserving 3x3 bilateral smoothing. D is the squared colour distance to the pixel, d^2
-/// the squared distance in pixels (0 to 2), q the square root of the pixel count.
+/// Noise filter: edge-preserving 3x3 bilateral smoothing (see BilateralKernel). D is the squared colour
+/// distance to the pixel, d^2 the squared distance in pixels (0 to 2), q the square root of the pixel count.
 ///
-///     out = sum of w * c / sum of w,   w = exp(-D / 1125) * exp(-d^2 / s^2)
-///     s = V * 4.5 / 1000 + 0.5,        V = BilinearFilteringValue, times 0.6 where q > 700
+///     w = exp(-D / 1125) * exp(-d^2 / s^2),   s = V * 4.5 / 1000 + 0.5
+///     V = BilinearFilteringValue, times 0.6 where q > 700
 ///
 /// Runs when its slider is on, and by itself on large pictures (q > 700) that an illumination iteration has
 /// treated. The range variance 1125 gains 2 to 4 dB on noise of 5 to 20 levels and keeps 39 dB of a clean
-/// photograph. Sums are double: float sums would darken flat areas by one level. The one-pixel border is left
-/// alone.
+/// photograph. The one-pixel border is left alone.
 class CBilinear : public IFilter {
 public:
     CBilinear(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
@@ -30,12 +29,8 @@ protected:
     virtual Floats allocate(std::size_t count) const;
 
 private:
-    struct Tile;
-
     bool matches(float side) const;
     void prepareTables(float spatialVariance);
-    void smoothTile(int y, int first, int count) const;
-    void addNeighbour(const ConstRow& centre, const ConstRow& neighbour, float spatial, Tile& tile) const;
 
     Floats m_cBilinear; ///< spatial weights by d^2
     Floats m_sBilinear; ///< range weights by D
