@@ -37,6 +37,11 @@ TEST(Auto_Contrast, StaysAwayFromAPictureThatLacksAColour) {
     }
 }
 
+TEST(Auto_Contrast, BaseThresholdBeginsAboveASideOf700) {
+    EXPECT_EQ(TonalStretch::baseThreshold(490000), 0);
+    EXPECT_NEAR(TonalStretch::baseThreshold(490001), 70.00007, 1e-5);
+}
+
 // By red alone: bins above 100 samples at first. Green ends its left scan at 254, blue its right one at 2.
 TEST(Auto_Contrast, ScansOfALargePicture) {
     for (const float luma : {127.0F, 128.0F}) {

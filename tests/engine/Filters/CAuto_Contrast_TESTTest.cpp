@@ -39,3 +39,14 @@ TEST(CAuto_Contrast_TEST, KeepsTheHueAboveTheLimitAndPixelsBelow) {
         EXPECT_EQ(params.pHisto_Red[250], 9);
     }
 }
+
+// The left scans end at 253, the right ones at 2.
+TEST(CAuto_Contrast_TEST, ExtremeBinsSetNoChannelLimit) {
+    U params = with({&P::ContrastEnabled});
+    const auto light = uniform(4, 4, {254, 254, 254}); // 0 and 254: the factor is 255 / 254
+    ASSERT_TRUE(apply<CAuto_Contrast_TEST>(params, *light));
+    EXPECT_EQ(at(*light, 0, 0), (Pixel{255, 255, 255}));
+    const auto dark = testplanes::make(4, 4, [](int x, int) { return x ? Pixel{1, 1, 1} : Pixel{}; });
+    ASSERT_TRUE(apply<CAuto_Contrast_TEST>(params, *dark));
+    EXPECT_EQ(at(*dark, 3, 0), (Pixel{1, 1, 1})); // 0 and 255
+}

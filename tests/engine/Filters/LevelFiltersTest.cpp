@@ -202,6 +202,18 @@ TEST(LevelFilters, LogTheirBranchAndFactors) {
                  "Perceptual_Touch_Middle_Value_G 1000. m_M_H_H_F_G 1.500000 ; m_M_H_L_F_G 0.250000",
                  "CLevel_Middle_Perceptual TOUCH 2nd Condition matched.", "Shadow_Radio_RGB 1.000000.",
                  "Shadow_Radio_G 2.094828."}); // 255 * 0.2^(1 / 1.85) / 51
+    const std::string red =
+        "Final_Touch_Mode_Enabled=1 mPerceptual_Touch_Middle_R_Enabled=1 m_M_H_L_F_R=0.1 ";
+    const auto expectRed = [&](const std::string& settings, const std::string& ratio) {
+        expectLines("CLevel_Middle_Perceptual", (red + settings).c_str(), {"Shadow_Radio_R " + ratio});
+    };
+    // At most the imbalance 2, times 1.5 above 100: then 255 * (101 / 255)^(1 / 7) / 101.
+    const std::string high = "mPerceptual_Touch_Middle_Value_R=1000 m_M_H_H_F_R=5 ";
+    expectRed(high + "m_OriginalLumaR=100 m_OriginalLumaG=200 m_OriginalLumaB=200", "2.000000.");
+    expectRed(high + "m_OriginalLumaR=101 m_OriginalLumaG=202 m_OriginalLumaB=202", "2.211867.");
+    // At least 1.3 over the imbalance, times 1.1 above 80.
+    expectRed("m_OriginalLumaR=80 m_OriginalLumaG=160 m_OriginalLumaB=160", "0.650000.");
+    expectRed("m_OriginalLumaR=81 m_OriginalLumaG=162 m_OriginalLumaB=162", "0.715000.");
 }
 
 } // namespace

@@ -74,9 +74,10 @@ bool applies(U params, const QString& source) {
 }
 
 /// 720 x 720 pixels, half of `dark` and half of `light`, but for the first `odd` pixels of the first row. A
-/// bin counts from 73 samples on, in the second scan of a hazy picture from 721 on.
-inline auto halves(Pixel dark, Pixel light, Pixel oddColour, int odd) {
-    return testplanes::make(720, 720, [=](int x, int y) {
+/// bin counts from 73 samples on, in the second scan of a hazy picture from 721 on. With a side of 700 every
+/// bin counts at first.
+inline auto halves(Pixel dark, Pixel light, Pixel oddColour, int odd, int side = 720) {
+    return testplanes::make(side, side, [=](int x, int y) {
         return y == 0 && x < odd ? oddColour : y < 360 ? dark : light;
     });
 }
@@ -84,12 +85,14 @@ inline auto halves(Pixel dark, Pixel light, Pixel oddColour, int odd) {
 /// A hazy picture, by luma 60 to 120 at first, 80 to 120 once the thin bins no longer count.
 template <typename Filter>
 void expectHazyStretch(U params) {
-    const auto plane = halves({80, 90, 70}, {120, 120, 120}, {60, 60, 60}, 100);
-    const LogCapture log;
-    ASSERT_TRUE(apply<Filter>(params, *plane));
-    EXPECT_TRUE(params.m_Opaco && log.has("C_Left_limit: 60.000000 ") &&
-                log.has("i= C_Left_limit:80 80.000000"));
-    EXPECT_EQ(at(*plane, 0, 1), (Pixel{0, 63, 0})); // 10 + 215 * 10 / 40
+    for (const int side : {720, 700}) {
+        const auto plane = halves({80, 90, 70}, {120, 120, 120}, {60, 60, 60}, 100, side);
+        const LogCapture log;
+        ASSERT_TRUE(apply<Filter>(params, *plane));
+        EXPECT_TRUE(params.m_Opaco && log.has("C_Left_limit: 60.000000 ") &&
+                    log.has("i= C_Left_limit:80 80.000000"));
+        EXPECT_EQ(at(*plane, 0, 1), (Pixel{0, 63, 0})); // 10 + 215 * 10 / 40
+    }
 }
 
 } // namespace stretchtest

@@ -1,6 +1,7 @@
 #include "SmartAnalyzers/ISmartAnalyzer.h"
 
 #include "Histograms/HistogramRecount.h"
+#include "SmartAnalyzers/ToneMass.h"
 #include "Utility/CGenericEx.h"
 #include "support/StatisticMap.h"
 #include "support/TaskSettings.h"
@@ -113,4 +114,28 @@ TEST(SmartAnalyzers, FailureReachesTheCallerAsOneError) {
     }
     EXPECT_THROW(FailingAnalyzer(nullptr, plane.get()).Apply(), CBadPtrEx);
     EXPECT_THROW(FailingAnalyzer(&params, nullptr).Apply(), CBadPtrEx);
+}
+
+// The outermost bins that can hold a limit, and one step beyond them.
+TEST(SmartAnalyzers, LimitSearchReachesTheEndsOfTheHistogram) {
+    const auto counted = [](std::initializer_list<std::size_t> filled) {
+        CUserParams params;
+        for (const std::size_t i : filled)
+            params.pHisto_Red[i] = params.pHisto_Green[i] = params.pHisto_Blue[i] = 1;
+        return params;
+    };
+    EXPECT_EQ(ToneMass::leftLimit(counted({253, 254, 255})), 253);
+    EXPECT_EQ(ToneMass::leftLimit(counted({254, 255})), 0);
+    EXPECT_EQ(ToneMass::rightLimit(counted({1, 2})), 2);
+    EXPECT_EQ(ToneMass::rightLimit(counted({0, 1})), 255);
+}
+
+// The last bin stays in the histogram: 0.077 / ((tanh(1) + 1) / 2) * 50 is 4.37.
+TEST(SmartAnalyzers, DigitalFlashCountsAWhitePicture) {
+    CUserParams params = tasksettings::paramsFor("CSmartAnalyzer_Digital_Flash");
+    params.m_OriginalLuma = 255;
+    params.pHisto_Luma[255] = 4;
+    const auto plane = testplanes::uniform(2, 2, {255, 255, 255});
+    EXPECT_TRUE(tasksettings::run("CSmartAnalyzer_Digital_Flash", params, *plane, *plane));
+    EXPECT_EQ(params.m_P_C_H_C_F_H, 4);
 }
