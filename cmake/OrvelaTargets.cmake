@@ -23,13 +23,19 @@ function(orvela_automoc target)
     file(REMOVE ${CMAKE_CURRENT_BINARY_DIR}/${target}_autogen/timestamp)
 endfunction()
 
-# orvela_library(NAME FOLDER...): a static library of every source below the given folders.
+# orvela_library(NAME FOLDER...): a static library of every source below the given folders, those for another system
+# left out.
 function(orvela_library name)
     set(sources)
     foreach(folder IN LISTS ARGN)
         file(GLOB_RECURSE found CONFIGURE_DEPENDS ${folder}/*.cpp ${folder}/*.h)
         list(APPEND sources ${found})
     endforeach()
+    if(WIN32)
+        list(FILTER sources EXCLUDE REGEX "_Linux\\.cpp$")
+    else()
+        list(FILTER sources EXCLUDE REGEX "_Windows\\.cpp$")
+    endif()
     add_library(${name} STATIC ${sources})
     set_target_properties(${name} PROPERTIES POSITION_INDEPENDENT_CODE ON)
     orvela_automoc(${name})

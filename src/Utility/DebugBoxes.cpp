@@ -17,6 +17,10 @@ void setMainWindow(void* widget) {
     gMainWindow = widget;
 }
 
+void* mainWindow() {
+    return gMainWindow;
+}
+
 int debugBox(void* parent, const QString& title, const QString& text, int buttons, int defaultButton) {
     if (!qEnvironmentVariableIsSet("ORVELA_DEBUG_MBOX"))
         return Ok;

@@ -19,6 +19,7 @@ void setPresenter(Presenter presenter);
 
 /// The parent of debug warnings: the main window, null while there is none.
 void setMainWindow(void* widget);
+void* mainWindow();
 
 /// Shows the box only when the environment variable "ORVELA_DEBUG_MBOX" is set; else returns OK at once.
 int debugBox(void* parent, const QString& title, const QString& text, int buttons = Ok,

@@ -1,0 +1,56 @@
+#include "GUI/Presets/CBatchMode.h"
+
+#include "Platform/Keyboard.h"
+#include "Presets/PresetTree.h"
+#include "Utility/DebugBoxes.h"
+#include "Utility/Logger.h"
+
+#include <QCoreApplication>
+#include <QMessageBox>
+#include <QSettings>
+
+namespace {
+
+const QString kEnabled = QStringLiteral("batchModeEnabled");
+const QString kMode = QStringLiteral("batchMode");
+
+void write(const QString& name, const QVariant& value) {
+    SettingsEdit edit;
+    edit.set(PresetTree::guiKey(name), value);
+    edit.commit();
+}
+
+} // namespace
+
+CBatchMode& CBatchMode::instance() {
+    static CBatchMode batchMode;
+    return batchMode;
+}
+
+CBatchMode::CBatchMode() {
+    const int shift = Keyboard::shiftState();
+    Log::log(LogLevel::Debug, "SHIFT key state %d", shift);
+    if (!shift)
+        return;
+    QMessageBox::information(static_cast<QWidget*>(DebugBoxes::mainWindow()),
+                             QCoreApplication::translate("CBatchMode", "Batch Mode"),
+                             QCoreApplication::translate("CBatchMode", "Batch mode is now off."),
+                             QMessageBox::Ok);
+    setBatchModeEnabled(false);
+}
+
+bool CBatchMode::isBatchModeEnabled() const {
+    return PresetTree::switchOf(QSettings().value(PresetTree::guiKey(kEnabled)));
+}
+
+void CBatchMode::setBatchModeEnabled(bool enabled) {
+    write(kEnabled, enabled);
+}
+
+int CBatchMode::batchMode() const {
+    return QSettings().value(PresetTree::guiKey(kMode), -1).toInt();
+}
+
+void CBatchMode::setBatchMode(int mode) {
+    write(kMode, mode);
+}

@@ -1,0 +1,28 @@
+#pragma once
+
+/// The two values that let the next start replay the last operation without any dialog. They live in the
+/// settings store only: every query reads it, every change writes it.
+class CBatchMode {
+public:
+    /// The object, made on the first call and kept until the module is unloaded.
+    static CBatchMode& instance();
+
+    CBatchMode(const CBatchMode&) = delete;
+    CBatchMode& operator=(const CBatchMode&) = delete;
+
+    /// Whether the next start replays the last operation.
+    bool isBatchModeEnabled() const;
+    /// @throws CGenericEx when the store cannot be written
+    void setBatchModeEnabled(bool enabled);
+
+    /// The number of the last recorded mode (EGUIMode); -1 when there is none.
+    int batchMode() const;
+    /// @throws CGenericEx when the store cannot be written
+    void setBatchMode(int mode);
+
+protected:
+    /// Switches batch mode off, with a message, when the SHIFT key is held.
+    /// @throws CGenericEx when the store cannot be written
+    CBatchMode();
+    ~CBatchMode() = default;
+};

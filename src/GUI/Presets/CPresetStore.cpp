@@ -1,0 +1,147 @@
+#include "GUI/Presets/CPresetStore.h"
+
+#include "GUI/Controls/CColorPicker.h"
+#include "GUI/Controls/COrvelaSliderBlockImpl.h"
+#include "GUI/Panes/CWgtPaneAdvancedImpl.h"
+#include "Presets/PresetTree.h"
+#include "Utility/DebugBoxes.h"
+#include "Utility/Logger.h"
+
+#include <QCheckBox>
+#include <QCoreApplication>
+#include <QMessageBox>
+
+#include <algorithm>
+
+namespace {
+
+QString text(const char* source) {
+    return QCoreApplication::translate("CPresetStore", source);
+}
+
+void warnOfMissing(const QString& object, const QString& what) {
+    DebugBoxes::debugWarning(object + what, QStringLiteral("Debug Warning"));
+}
+
+void load(const QWidget* parent, const PresetSlider& stored) {
+    auto* block = parent->findChild<COrvelaSliderBlockImpl*>(stored.object);
+    if (!block)
+        return warnOfMissing(stored.object, QStringLiteral(", the slider can not be found."));
+    block->setEnabled(stored.enabled); // first, so that the state is announced before the value
+    block->setValue(stored.value);
+}
+
+void load(const QWidget* parent, const PresetColor& stored) {
+    if (auto* picker = parent->findChild<CColorPicker*>(stored.object))
+        return picker->setColor(QColor(stored.red, stored.green, stored.blue));
+    Log::log(LogLevel::Warning, "The color picker for preset (%s) can not be found.",
+             stored.object.toUtf8().constData());
+}
+
+void load(const QWidget* parent, const PresetCheckBox& stored) {
+    auto* box = parent->findChild<QCheckBox*>(stored.object);
+    if (!box)
+        return warnOfMissing(stored.object,
+                             QStringLiteral(", the checkbox for this preset can not be found."));
+    box->setChecked(stored.checked);
+}
+
+template <typename Control>
+QList<Control*> namedControls(const QWidget* parent) {
+    QList<Control*> controls = parent->findChildren<Control*>();
+    controls.removeIf([](const Control* control) { return control->objectName().isEmpty(); });
+    return controls;
+}
+
+PresetContent contentOf(const QWidget* parent) {
+    PresetContent content;
+    for (const auto* block : namedControls<COrvelaSliderBlockImpl>(parent))
+        content.sliders.append({block->objectName(), block->value(), block->isEnabled()});
+    for (const auto* picker : namedControls<CColorPicker>(parent)) {
+        const QColor color = picker->color();
+        content.colors.append({picker->objectName(), color.red(), color.green(), color.blue()});
+    }
+    for (const auto* box : namedControls<QCheckBox>(parent))
+        content.checkBoxes.append({box->objectName(), box->isChecked()});
+    return content;
+}
+
+bool mayOverwrite() {
+    return QMessageBox::question(static_cast<QWidget*>(DebugBoxes::mainWindow()), text("Warning"),
+                                 text("This preset already exists. Do you want to overwrite it?"),
+                                 QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes;
+}
+
+} // namespace
+
+namespace CPresetStore {
+
+QString batchPresetName() {
+    return PresetTree::batchPresetName();
+}
+
+QStringList listPresets(EGUIMode mode, bool excludeBatch) {
+    QStringList names = PresetTree::names(mode);
+    if (excludeBatch)
+        names.removeAll(batchPresetName());
+    return names;
+}
+
+bool presetExists(EGUIMode mode, const QString& name) {
+    return listPresets(mode, true).contains(name);
+}
+
+bool hasPresets() {
+    return PresetTree::hasPresets();
+}
+
+void removePreset(EGUIMode mode, const QString& name) {
+    SettingsEdit edit;
+    PresetTree::remove(edit, mode, name);
+    edit.commit();
+}
+
+void loadPreset(QWidget* parent, EGUIMode mode, const QString& name) {
+    const std::optional<PresetContent> stored = PresetTree::read(mode, name);
+    if (!stored)
+        return;
+    for (const PresetSlider& slider : stored->sliders)
+        load(parent, slider);
+    for (const PresetColor& color : stored->colors)
+        load(parent, color);
+    for (const PresetCheckBox& box : stored->checkBoxes)
+        load(parent, box);
+}
+
+void savePreset(QWidget* parent, EGUIMode mode, const QString& name, bool& saved, bool& isNew,
+                bool askOverwrite) {
+    saved = isNew = false;
+    if (name.isEmpty()) {
+        DebugBoxes::warningBox(DebugBoxes::mainWindow(), text("Warning"), text("A preset needs a name."));
+        return;
+    }
+    const bool asks = askOverwrite && presetExists(mode, name);
+    if (asks && !mayOverwrite())
+        return;
+    isNew = !asks;
+    SettingsEdit edit;
+    PresetTree::write(edit, mode, name, contentOf(parent));
+    edit.commit();
+    saved = true;
+}
+
+void ensureFactoryPresets(QWidget* parent) {
+    const QStringList stored = listPresets(Mode_Advanced, true);
+    const QStringList names = FactoryPresets::names();
+    if (std::all_of(names.begin(), names.end(), [&](const QString& name) { return stored.contains(name); }))
+        return;
+    CWgtPaneAdvancedImpl pane(parent, Mode_Advanced);
+    SettingsEdit edit;
+    for (const QString& name : names) {
+        pane.setSliders(name);
+        PresetTree::write(edit, Mode_Advanced, name, contentOf(&pane));
+    }
+    edit.commit();
+}
+
+} // namespace CPresetStore

@@ -1,0 +1,49 @@
+#pragma once
+
+#include "GUI/Presets/FactoryPresets.h"
+
+class QWidget;
+
+/// Keeps the state of a pane's slider blocks, colour pickers and check boxes by name in the settings store.
+/// Nothing is cached: each operation opens the store, reads or writes, and closes it.
+namespace CPresetStore {
+
+using FactoryPresets::factoryPresetMode;
+using FactoryPresets::factoryPresetName;
+using FactoryPresets::isFactoryMode;
+using FactoryPresets::isFactoryPresetName;
+
+/// The reserved name under which the last accepted run's settings are kept.
+QString batchPresetName();
+
+/// The names of the mode's presets in the store's order, without the reserved one if wished.
+QStringList listPresets(EGUIMode mode, bool excludeBatch);
+
+/// Whether the mode has a preset of that name; never for the reserved one.
+bool presetExists(EGUIMode mode, const QString& name);
+
+/// Whether there is a preset of any mode, reserved ones included.
+bool hasPresets();
+
+/// Removes a preset, whichever it is. @throws CGenericEx when the store cannot be written
+void removePreset(EGUIMode mode, const QString& name);
+
+/// Puts a preset onto the controls below `parent`. Controls without an entry keep their state, entries
+/// without a control are skipped; without such a preset nothing happens.
+void loadPreset(QWidget* parent, EGUIMode mode, const QString& name);
+
+/// Writes the controls below `parent` that have a name as a preset; entries of other controls stay in it. An
+/// empty name is refused with a message.
+/// @param saved         becomes true when the preset was written
+/// @param isNew         becomes true when there was no such preset or the question was not asked
+/// @param askOverwrite  asks before an existing preset is written over
+/// @throws CGenericEx when the store cannot be written; `saved` is false then and the old preset stays
+void savePreset(QWidget* parent, EGUIMode mode, const QString& name, bool& saved, bool& isNew,
+                bool askOverwrite);
+
+/// Writes all twelve factory presets when one of them is missing.
+/// @param parent  becomes the owner of a temporary pane, see IWgtPane
+/// @throws CGenericEx when the store cannot be written
+void ensureFactoryPresets(QWidget* parent);
+
+} // namespace CPresetStore

@@ -1,0 +1,12 @@
+#pragma once
+
+/// The keys that are held down right now.
+namespace Keyboard {
+
+/// The high byte of the SHIFT key's state: not 0 while the key is held.
+int shiftState();
+
+/// Has shiftState() answer what `answer` does, for a test; null asks the system again.
+void setShiftState(int (*answer)());
+
+} // namespace Keyboard
