@@ -3,6 +3,7 @@
 #include "Utility/PresetFile.h"
 #include "command/EnhanceCommand.h"
 #include "command/ModesCommand.h"
+#include "command/PresetsCommand.h"
 
 #include <QCoreApplication>
 
@@ -28,6 +29,12 @@ void addModes(CLI::App& program, Action& action) {
     const auto asJson = std::make_shared<bool>(false);
     command->add_flag("--json", *asJson, "as JSON");
     command->callback([&action, asJson] { action = [asJson] { return listModes(*asJson); }; });
+}
+
+void addPresets(CLI::App& program, Action& action) {
+    CLI::App* command = program.add_subcommand("presets", "List, export, import and remove stored presets");
+    const auto options = std::make_shared<PresetsOptions>();
+    options->declare(*command, [&action, options](Action chosen) { action = std::move(chosen); });
 }
 
 ExitStatus refuse(const char* text) {
@@ -59,6 +66,7 @@ int runCommand(int argc, char** argv) {
     Action action;
     addEnhance(program, action, signals);
     addModes(program, action);
+    addPresets(program, action);
     try {
         program.parse(argc, argv);
     } catch (const CLI::ParseError& error) {

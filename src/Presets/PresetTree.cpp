@@ -50,6 +50,11 @@ double numberOf(const QVariant& value) {
     return std::isfinite(number) ? number : 0;
 }
 
+// A text of one decimal may stand for a position a little beyond the ends; no control bears more.
+double positionOf(const QVariant& value) {
+    return std::clamp(numberOf(value), -1.0, 1001.0);
+}
+
 int channelOf(const QVariant& value) {
     return static_cast<int>(std::clamp(numberOf(value), 0.0, 255.0));
 }
@@ -72,7 +77,7 @@ PresetContent contentOf(QSettings& settings) {
     const auto value = [&settings](const char* key) { return settings.value(QLatin1String(key)); };
     PresetContent content;
     content.sliders = entriesOf<PresetSlider>(settings, kSliders, [&](const QString& object) {
-        return PresetSlider{object, numberOf(value("Value")), PresetTree::switchOf(value("Enabled"))};
+        return PresetSlider{object, positionOf(value("Value")), PresetTree::switchOf(value("Enabled"))};
     });
     content.colors = entriesOf<PresetColor>(settings, kColorPickers, [&](const QString& object) {
         return PresetColor{object, channelOf(value("Red")), channelOf(value("Green")),

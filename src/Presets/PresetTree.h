@@ -61,7 +61,7 @@ QStringList names(EGUIMode mode);
 bool hasPresets();
 
 /// A stored preset, its entries in the store's order; none when there is no preset of that name. Values that
-/// are missing or of another type are 0 or false, colours out of range are clamped.
+/// are missing or of another type are 0 or false, numbers out of range are clamped.
 std::optional<PresetContent> read(EGUIMode mode, const QString& name);
 
 /// Puts writing a preset into `edit`. Entries of an older preset of that name which `content` does not have

@@ -3,15 +3,19 @@
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
 
+#include <QDir>
 #include <QFile>
 #include <QFileInfo>
 #include <QSettings>
+#include <QTemporaryFile>
 
 #include <algorithm>
 
 namespace {
 
 using Changes = std::vector<SettingsEdit::Change>;
+
+const QString kUnwritten = QStringLiteral("The settings could not be written to %1.");
 
 [[noreturn]] void fail(const QString& text, const QString& store, int line) {
     throw CGenericEx(text.arg(store), "SettingsEdit.cpp", line);
@@ -47,6 +51,28 @@ void keepForeignFile(const QString& path) {
              copy.toUtf8().constData());
 }
 
+// At least the bytes that the changes add to the file, every character escaped.
+qint64 sizeOf(const Changes& changes) {
+    qint64 size = 0;
+    for (const auto& [key, value] : changes)
+        size += 4 * (key.toUtf8().size() + value.value_or(QVariant()).toByteArray().size()) + 64;
+    return size;
+}
+
+// The store takes a short write for a whole one and would put a cut file in the place of the old one: make
+// sure beforehand that there is room for both.
+void checkRoom(const QString& path, const Changes& changes) {
+    if (path.startsWith(QLatin1String("\\HKEY_")))
+        return; // a registry
+    constexpr qint64 kLockFile = 4096;
+    const QFileInfo file(path);
+    const QByteArray bytes(file.size() + sizeOf(changes) + kLockFile, '\0');
+    QTemporaryFile probe(file.path() + QStringLiteral("/.room-XXXXXX"));
+    if (!QDir().mkpath(file.path()) || !probe.open() || probe.write(bytes) != bytes.size() ||
+        !probe.flush() || QFileInfo(probe.fileName()).size() != bytes.size())
+        fail(kUnwritten, path, __LINE__);
+}
+
 // What undoes the changes.
 Changes valuesBefore(const QSettings& settings, const Changes& changes) {
     const QStringList keys = settings.allKeys();
@@ -77,6 +103,7 @@ void SettingsEdit::commit() const {
     // the other tells of the writing alone.
     const QSettings reader;
     keepForeignFile(reader.fileName());
+    checkRoom(reader.fileName(), mChanges);
     const Changes before = valuesBefore(reader, mChanges);
     QSettings writer;
     apply(writer, mChanges);
@@ -85,5 +112,5 @@ void SettingsEdit::commit() const {
         return;
     // The process remembers unwritten values and would show them, and write them at the next occasion.
     apply(writer, before);
-    fail(QStringLiteral("The settings could not be written to %1."), reader.fileName(), __LINE__);
+    fail(kUnwritten, reader.fileName(), __LINE__);
 }

@@ -1,6 +1,7 @@
 #include <QApplication>
 #include <QRegularExpression>
 #include <QStringList>
+#include <QTemporaryDir>
 
 #include <gtest/gtest.h>
 
@@ -27,6 +28,8 @@ class WarningListener : public testing::EmptyTestEventListener {
 
 int main(int argc, char** argv) {
     testing::InitGoogleTest(&argc, argv);
+    const QTemporaryDir settings; // nobody's own settings are touched
+    qputenv("XDG_CONFIG_HOME", settings.path().toLocal8Bit());
     qInstallMessageHandler(collect);
     QApplication application(argc, argv);
     QCoreApplication::setOrganizationName(QStringLiteral("Kestrand"));

@@ -1,9 +1,12 @@
 #include <QCoreApplication>
+#include <QTemporaryDir>
 
 #include <gtest/gtest.h>
 
 int main(int argc, char** argv) {
     testing::InitGoogleTest(&argc, argv);
+    const QTemporaryDir settings; // nobody's own settings are touched
+    qputenv("XDG_CONFIG_HOME", settings.path().toLocal8Bit());
     QCoreApplication application(argc, argv);
     QCoreApplication::setOrganizationName(QStringLiteral("Kestrand"));
     QCoreApplication::setApplicationName(QStringLiteral("OrvelaTests"));

@@ -1,0 +1,158 @@
+#include "command/PresetsCommand.h"
+
+#include "Presets/PresetConversion.h"
+#include "Utility/CGenericEx.h"
+#include "Utility/PresetFile.h"
+#include "command/ModeNames.h"
+
+#include <QFileInfo>
+
+#include <CLI/CLI.hpp>
+#include <algorithm>
+#include <iostream>
+
+namespace {
+
+ExitStatus report(ExitStatus status, const QString& text) {
+    std::cerr << "orvela: " << text.toStdString() << std::endl;
+    return status;
+}
+
+// The mode whose pane the presets belong to; of two modes with one display name the first with a pane.
+EGUIMode modeOf(const std::string& name) {
+    const std::string wanted = ModeNames::plain(name);
+    std::string known;
+    for (const ModeDescription& mode : ModeTable::all()) {
+        if (!PresetConversion::hasControls(mode.mode))
+            continue;
+        if (wanted == ModeNames::plain(mode.displayName) ||
+            wanted == ModeNames::plain(ModeNames::identifierOf(mode)))
+            return mode.mode;
+        known += (known.empty() ? "" : ", ") + ModeNames::identifierOf(mode);
+    }
+    throw UsageError("--mode: \"" + name + "\" has no presets of its own; the modes that have are " + known);
+}
+
+QString nameOf(const PresetsOptions& options) {
+    const QString name = options.name.empty()
+                             ? QFileInfo(QString::fromStdString(options.file)).completeBaseName()
+                             : QString::fromStdString(options.name);
+    if (name.isEmpty() || name == PresetTree::batchPresetName())
+        throw UsageError("\"" + name.toStdString() + "\" cannot be the name of a preset");
+    return name;
+}
+
+bool isFactoryPreset(EGUIMode mode, const QString& name) {
+    const auto modes = ModeTable::all();
+    return mode == Mode_Advanced && std::any_of(modes.begin(), modes.end(), [&](const ModeDescription& each) {
+               return each.presetName && name == QLatin1String(each.presetName);
+           });
+}
+
+ExitStatus reportMissing(EGUIMode mode, const QString& name) {
+    return report(ExitStatus::NothingMatched,
+                  QStringLiteral("%1 has no preset \"%2\"").arg(getModeAsString(mode), name));
+}
+
+ExitStatus commit(const SettingsEdit& edit) {
+    try {
+        edit.commit();
+        return ExitStatus::Done;
+    } catch (const CGenericEx& error) {
+        return report(ExitStatus::TargetTrouble, error.message());
+    }
+}
+
+// An overwritten preset keeps the names that this version does not know.
+PresetFile fileToWrite(const QString& path) {
+    try {
+        return QFileInfo::exists(path) ? PresetFile::read(path) : PresetFile();
+    } catch (const PresetError&) {
+        return {};
+    }
+}
+
+} // namespace
+
+void PresetsOptions::declare(CLI::App& app, const std::function<void(std::function<ExitStatus()>)>& chosen) {
+    app.require_subcommand(1);
+    const auto add = [&](const char* name, const char* help, ExitStatus (*perform)(const PresetsOptions&)) {
+        CLI::App* command = app.add_subcommand(name, help);
+        command->add_option("--mode", mode, "the mode that the presets belong to")->capture_default_str();
+        command->callback([this, chosen, perform] { chosen([this, perform] { return perform(*this); }); });
+        return command;
+    };
+    const char* const force = "overwrite what is there under that name";
+    add("list", "List the presets by name", listPresets);
+    CLI::App* exporting = add("export", "Write a preset to a file", exportPreset);
+    exporting->add_option("NAME", name, "the preset")->required();
+    exporting->add_option("FILE", file, "the JSON file")->required();
+    exporting->add_flag("--force", overwrite, force);
+    CLI::App* importing = add("import", "Store a file as a preset", importPreset);
+    importing->add_option("FILE", file, "the JSON file")->required();
+    importing->add_option("NAME", name, "the preset (default: the name of the file)");
+    importing->add_flag("--force", overwrite, force);
+    add("remove", "Remove a preset", removePreset)->add_option("NAME", name, "the preset")->required();
+}
+
+ExitStatus listPresets(const PresetsOptions& options) {
+    for (const QString& name : PresetTree::names(modeOf(options.mode)))
+        if (name != PresetTree::batchPresetName())
+            std::cout << name.toStdString() << '\n';
+    std::cout.flush();
+    return ExitStatus::Done;
+}
+
+ExitStatus exportPreset(const PresetsOptions& options) {
+    const EGUIMode mode = modeOf(options.mode);
+    const QString name = nameOf(options);
+    const QString path = QString::fromStdString(options.file);
+    const std::optional<PresetContent> stored = PresetTree::read(mode, name);
+    if (!stored)
+        return reportMissing(mode, name);
+    if (QFileInfo::exists(path) && !options.overwrite)
+        return report(ExitStatus::TargetTrouble,
+                      QStringLiteral("%1 exists; --force overwrites it").arg(path));
+    PresetFile preset = fileToWrite(path);
+    preset.take(PresetConversion::paramsOf(mode, *stored));
+    try {
+        preset.write(path);
+    } catch (const PresetError& error) {
+        return report(ExitStatus::TargetTrouble, QString::fromStdString(error.what()));
+    }
+    return ExitStatus::Done;
+}
+
+ExitStatus importPreset(const PresetsOptions& options) {
+    const EGUIMode mode = modeOf(options.mode);
+    const QString name = nameOf(options);
+    const PresetFile preset = PresetFile::read(QString::fromStdString(options.file));
+    const bool exists = PresetTree::names(mode).contains(name) || isFactoryPreset(mode, name);
+    if (exists && !options.overwrite)
+        return report(
+            ExitStatus::TargetTrouble,
+            QStringLiteral("%1 has a preset \"%2\"; --force overwrites it").arg(getModeAsString(mode), name));
+    if (const QStringList unknown = preset.unknownNames(); !unknown.isEmpty())
+        report(ExitStatus::Done, QStringLiteral("left out, as this version does not know them: ") +
+                                     unknown.join(QStringLiteral(", ")));
+    CSliderParams sliders;
+    preset.applyTo(sliders);
+    SettingsEdit edit;
+    PresetTree::remove(edit, mode, name);
+    PresetTree::write(edit, mode, name, PresetConversion::contentOf(mode, sliders));
+    return commit(edit);
+}
+
+ExitStatus removePreset(const PresetsOptions& options) {
+    const EGUIMode mode = modeOf(options.mode);
+    const QString name = nameOf(options);
+    if (isFactoryPreset(mode, name))
+        return report(ExitStatus::PhotographFailed,
+                      QStringLiteral("The current preset cannot be deleted, since it's one of the factory "
+                                     "presets."));
+    if (!PresetTree::names(mode).contains(name))
+        return reportMissing(mode, name);
+    SettingsEdit edit;
+    PresetTree::remove(edit, mode, name);
+    return commit(edit);
+}

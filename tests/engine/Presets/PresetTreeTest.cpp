@@ -1,0 +1,126 @@
+#include "Presets/PresetConversion.h"
+#include "Utility/CGenericEx.h"
+#include "Utility/ModeTable.h"
+
+#include <QElapsedTimer>
+#include <QPoint>
+#include <QSettings>
+
+#include <gtest/gtest.h>
+
+namespace {
+
+class PresetTreeTest : public testing::Test {
+protected:
+    PresetTreeTest() { QSettings().clear(); }
+
+    static void write(EGUIMode mode, const QString& name, const PresetContent& content) {
+        SettingsEdit edit;
+        PresetTree::write(edit, mode, name, content);
+        edit.commit();
+    }
+};
+
+TEST_F(PresetTreeTest, KeysAreTheKnownOnes) {
+    write(Mode_AutoColor, QStringLiteral("Mine"),
+          {{{QStringLiteral("s"), 123.4, true}},
+           {{QStringLiteral("c"), 1, 2, 255}},
+           {{QStringLiteral("b"), true}}});
+    const QString preset = QStringLiteral("2000/UserPresets/Auto Color/Mine/");
+    const QSettings settings;
+    QStringList expected;
+    for (const char* key : {"CheckBoxes/b/Checked", "ColorPickers/c/Blue", "ColorPickers/c/Green",
+                            "ColorPickers/c/Red", "Sliders/s/Enabled", "Sliders/s/Value"})
+        expected << preset + QLatin1String(key);
+    EXPECT_EQ(settings.allKeys(), expected);
+    EXPECT_EQ(settings.value(preset + "Sliders/s/Value").toDouble(), 123.4);
+    EXPECT_EQ(PresetTree::guiKey(QStringLiteral("batchMode")), "2000/GUI/batchMode");
+    EXPECT_EQ(PresetTree::names(Mode_AutoColorFilter), QStringList("Mine")) << "one group for two modes";
+    EXPECT_TRUE(PresetTree::names(static_cast<EGUIMode>(16)).isEmpty());
+}
+
+TEST_F(PresetTreeTest, EveryNameComesBack) {
+    QStringList names;
+    for (const char* name :
+         {"a/b", "a\\b", "/", "//x/", "%2F", "%252F", "%25/", "%/5C", "50%", "\"quoted\"", " blank ", "a=b;c",
+          "[x]", "Grüße 你好 🎞", "General", "Sliders", "line\nbreak"})
+        names << QString::fromUtf8(name);
+    for (const QString& name : names)
+        write(Mode_Advanced, name, {{{name, 1.5, true}}, {}, {}});
+    QStringList listed = PresetTree::names(Mode_Advanced);
+    QSettings().sync();
+    for (const QString& name : names) {
+        EXPECT_EQ(listed.removeAll(name), 1) << qPrintable(name);
+        const auto stored = PresetTree::read(Mode_Advanced, name);
+        EXPECT_TRUE(stored && stored->sliders.value(0).object == name) << qPrintable(name);
+        SettingsEdit edit;
+        PresetTree::remove(edit, Mode_Advanced, name);
+        edit.commit();
+    }
+    EXPECT_TRUE(listed.isEmpty()) << qPrintable(listed.join(' '));
+    EXPECT_FALSE(PresetTree::hasPresets());
+    SettingsEdit edit;
+    EXPECT_THROW(PresetTree::remove(edit, Mode_Advanced, QString()), CGenericEx);
+    EXPECT_THROW(PresetTree::write(edit, static_cast<EGUIMode>(-1), names[0], {}), CGenericEx);
+}
+
+TEST_F(PresetTreeTest, GarbageReadsAsZeroAndOff) {
+    const QVariantList garbage = {
+        QVariant(),   "abc",        "nan", "-inf", QStringList{"1", "2"}, QByteArray("\0\1", 2),
+        QPoint(3, 4), "@Variant(x", ""};
+    for (const QVariant& value : garbage) {
+        QSettings settings;
+        settings.beginGroup("2000/UserPresets/Advanced/x");
+        for (const char* key : {"Sliders/s/Value", "Sliders/s/Enabled", "ColorPickers/c/Red",
+                                "CheckBoxes/b/Checked", "Sliders/t"})
+            settings.setValue(key, value);
+        settings.setValue("ColorPickers/c/Green", 1e99);
+        settings.setValue("Sliders/far/Value", "1e300");
+        settings.sync();
+        const auto stored = PresetTree::read(Mode_Advanced, QStringLiteral("x"));
+        ASSERT_TRUE(stored && stored->sliders.size() == 2);
+        EXPECT_EQ(stored->sliders[0].value, 1001);
+        EXPECT_EQ(stored->sliders[1].value, 0);
+        EXPECT_FALSE(stored->sliders[1].enabled || stored->checkBoxes[0].checked);
+        EXPECT_EQ(stored->colors[0].red, 0);
+        EXPECT_EQ(stored->colors[0].green, 255);
+    }
+}
+
+TEST_F(PresetTreeTest, TenThousandPresetsAreListedSoon) {
+    const PresetContent content = {{{QStringLiteral("a"), 1, true}, {QStringLiteral("b"), 2, false}}, {}, {}};
+    SettingsEdit edit;
+    for (int i = 0; i < 10000; ++i)
+        PresetTree::write(edit, Mode_Advanced, QString::number(i), content);
+    edit.commit();
+    QElapsedTimer timer;
+    timer.start();
+    EXPECT_EQ(PresetTree::names(Mode_Advanced).size(), 10000);
+    EXPECT_LT(timer.elapsed(), 5000);
+    RecordProperty("milliseconds", int(timer.elapsed()));
+}
+
+TEST_F(PresetTreeTest, SettingsBecomeControlsAndComeBack) {
+    for (const ModeDescription& mode : ModeTable::all()) {
+        SCOPED_TRACE(mode.displayName);
+        CSliderParams sliders;
+        float value = 0;
+        for (const SliderField& field : sliderFields())
+            field.flag ? void(sliders.*field.flag = true) : void(sliders.*field.value = ++value);
+        const PresetContent content = PresetConversion::contentOf(mode.mode, sliders);
+        const CSliderParams back = PresetConversion::paramsOf(mode.mode, content);
+        int kept = 0;
+        for (const SliderField& field : sliderFields())
+            if (field.flag ? back.*field.flag : back.*field.value != 0) {
+                ++kept;
+                EXPECT_TRUE(field.flag || back.*field.value == sliders.*field.value) << field.name;
+            }
+        // A position and a switch each, the automatic contrast only its switch, three parts of a colour.
+        const auto count = 2 * content.sliders.size() + 3 * content.colors.size();
+        EXPECT_EQ(kept, mode.mode == Mode_Advanced ? count - 1 : count);
+        EXPECT_EQ(PresetConversion::hasControls(mode.mode),
+                  mode.mode == Mode_Advanced || mode.mode > Mode_Batch);
+    }
+}
+
+} // namespace

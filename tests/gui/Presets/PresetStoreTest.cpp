@@ -1,0 +1,207 @@
+#include "../Panes/PaneFixture.h"
+#include "GUI/Controls/CColorPicker.h"
+#include "GUI/Panes/CWgtPaneAdvancedImpl.h"
+#include "GUI/Presets/CBatchMode.h"
+#include "GUI/Presets/CPresetStore.h"
+#include "Platform/Keyboard.h"
+#include "Presets/PresetConversion.h"
+#include "Utility/CGenericEx.h"
+#include "Utility/ModeTable.h"
+#include "support/LogCapture.h"
+
+#include <QApplication>
+#include <QCheckBox>
+#include <QDir>
+#include <QMessageBox>
+#include <QSettings>
+#include <QTimer>
+
+#include <gtest/gtest.h>
+
+namespace {
+
+class PresetStore : public testing::Test {
+protected:
+    PresetStore() {
+        QSettings().clear();
+        first->setObjectName("first");
+        second->setObjectName("a/b");
+        picker->setObjectName("picker");
+        box->setObjectName("box");
+    }
+    bool save(const char* name, EGUIMode mode = Mode_Advanced) {
+        CPresetStore::savePreset(&pane, mode, name, saved, isNew, true);
+        return saved;
+    }
+    /// Presses a button of the next message box and keeps what the box said.
+    void answer(QMessageBox::StandardButton button) {
+        QTimer::singleShot(0, qApp, [this, button] {
+            auto* shown = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
+            ASSERT_TRUE(shown && shown->button(button));
+            said = shown->windowTitle() + "|" + shown->text();
+            EXPECT_FALSE(shown->defaultButton() && shown->buttons().size() > 1);
+            shown->button(button)->click();
+        });
+    }
+
+    RecordingOwner pane;
+    QWidget inner{&pane};
+    COrvelaSliderBlockImpl* first = new COrvelaSliderBlockImpl(&inner);
+    COrvelaSliderBlockImpl* second = new COrvelaSliderBlockImpl(&pane);
+    CColorPicker* picker = new CColorPicker(&inner);
+    QCheckBox* box = new QCheckBox(&inner);
+    QCheckBox* unnamed = new QCheckBox(&inner);
+    QString said;
+    bool saved = false;
+    bool isNew = false;
+};
+
+TEST_F(PresetStore, LoadsWhatWasSaved) {
+    first->setValue(123.4);
+    second->setValue(1000);
+    second->setEnabled(false);
+    picker->setColor(QColor(1, 2, 3, 40));
+    box->setChecked(true);
+    ASSERT_TRUE(save("mine", Mode_AutoColor) && isNew);
+    first->setValue(0);
+    second->setValue(0);
+    second->setEnabled(true);
+    picker->setColor(Qt::white);
+    box->setChecked(false);
+    QStringList signalsOfSecond;
+    QObject::connect(second, &COrvelaSliderBlockImpl::stateChanged, [&] { signalsOfSecond << "state"; });
+    QObject::connect(second, &COrvelaSliderBlockImpl::valueChanged, [&] { signalsOfSecond << "value"; });
+    CPresetStore::loadPreset(&pane, Mode_AutoColorFilter, "mine");
+    EXPECT_EQ(first->value(), 123.4);
+    EXPECT_EQ(second->value(), 1000);
+    EXPECT_TRUE(first->isEnabled() && !second->isEnabled() && box->isChecked());
+    EXPECT_EQ(picker->color(), QColor(1, 2, 3, 255));
+    EXPECT_EQ(signalsOfSecond.value(0), "state");
+    EXPECT_EQ(signalsOfSecond.value(1), "value");
+    EXPECT_FALSE(QSettings().allKeys().join(' ').contains("CheckBoxes/Checked")) << "has no name";
+}
+
+TEST_F(PresetStore, MissingPartsLeaveControlsAsTheyAre) {
+    qputenv("ORVELA_DEBUG_MBOX", "1");
+    ASSERT_TRUE(save("x"));
+    QSettings settings;
+    settings.beginGroup("2000/UserPresets/Advanced/x");
+    settings.remove("ColorPickers");
+    settings.remove("CheckBoxes/box");
+    settings.remove("Sliders/first/Value");
+    settings.setValue("Sliders/gone/Value", 5);
+    settings.setValue("CheckBoxes/lost/Checked", true);
+    settings.setValue("ColorPickers/away/Red", 5);
+    settings.sync();
+    first->setValue(500);
+    box->setChecked(true);
+    picker->setColor(Qt::red);
+    EXPECT_TRUE(boxes([&] { CPresetStore::loadPreset(&pane, Mode_Advanced, "unknown"); }).isEmpty());
+    EXPECT_EQ(first->value(), 500);
+    LogCapture log;
+    EXPECT_EQ(boxes([&] { CPresetStore::loadPreset(&pane, Mode_Advanced, "x"); }),
+              QStringList({"Debug Warning|gone, the slider can not be found.",
+                           "Debug Warning|lost, the checkbox for this preset can not be found."}));
+    EXPECT_TRUE(log.has("The color picker for preset (away) can not be found."));
+    EXPECT_EQ(first->value(), 0);
+    EXPECT_TRUE(box->isChecked() && picker->color() == QColor(Qt::red));
+    qunsetenv("ORVELA_DEBUG_MBOX");
+}
+
+TEST_F(PresetStore, AsksBeforeOverwriting) {
+    ASSERT_TRUE(save("x") && save(CPresetStore::batchPresetName().toUtf8()));
+    ASSERT_TRUE(save(CPresetStore::batchPresetName().toUtf8()) && isNew) << "never asked for";
+    EXPECT_EQ(CPresetStore::listPresets(Mode_Advanced, true), QStringList("x"));
+    EXPECT_EQ(CPresetStore::listPresets(Mode_Advanced, false).size(), 2);
+    EXPECT_FALSE(CPresetStore::presetExists(Mode_Advanced, CPresetStore::batchPresetName()));
+    first->setValue(700);
+    answer(QMessageBox::No);
+    EXPECT_FALSE(save("x"));
+    EXPECT_EQ(said, "Warning|This preset already exists. Do you want to overwrite it?");
+    const QString key = "2000/UserPresets/Advanced/x/Sliders/first/Value";
+    EXPECT_EQ(QSettings().value(key).toDouble(), 0);
+    answer(QMessageBox::Yes);
+    EXPECT_TRUE(save("x") && !isNew);
+    EXPECT_EQ(QSettings().value(key).toDouble(), 700);
+    EXPECT_EQ(boxes([&] { EXPECT_FALSE(save("")); }), QStringList("Warning|A preset needs a name."));
+    CPresetStore::removePreset(Mode_Advanced, "x");
+    EXPECT_TRUE(CPresetStore::listPresets(Mode_Advanced, true).isEmpty());
+    EXPECT_TRUE(CPresetStore::hasPresets());
+}
+
+TEST_F(PresetStore, ReportsWhatCannotBeWritten) {
+    const QString path = QSettings().fileName();
+    QFile::remove(path);
+    ASSERT_TRUE(QDir().mkpath(path));
+    EXPECT_THROW(save("x"), CGenericEx);
+    EXPECT_FALSE(saved || CPresetStore::hasPresets());
+    EXPECT_THROW(CPresetStore::ensureFactoryPresets(&pane), CGenericEx);
+    ASSERT_TRUE(QDir().rmdir(path));
+}
+
+TEST_F(PresetStore, FactoryPresetsAreThoseOfTheModes) {
+    CPresetStore::ensureFactoryPresets(&pane);
+    int modes = 0;
+    for (const ModeDescription& mode : ModeTable::all()) {
+        EXPECT_EQ(CPresetStore::isFactoryMode(mode.mode), mode.mode < Mode_Advanced);
+        if (!CPresetStore::isFactoryMode(mode.mode))
+            continue;
+        ++modes;
+        const QString name = CPresetStore::factoryPresetName(mode.mode);
+        SCOPED_TRACE(qPrintable(name));
+        EXPECT_TRUE(CPresetStore::isFactoryPresetName(name) &&
+                    !CPresetStore::isFactoryPresetName(name.toLower()));
+        EXPECT_EQ(CPresetStore::factoryPresetMode(name), mode.mode);
+        const auto content = PresetTree::read(Mode_Advanced, name);
+        ASSERT_TRUE(content && content->sliders.size() == 26 && content->colors.size() == 1);
+        const CSliderParams stored = PresetConversion::paramsOf(Mode_Advanced, *content);
+        const CUserParamsPhotoshop factory(mode.mode);
+        for (const SliderDescription& slider : SliderTable::advanced()) {
+            SCOPED_TRACE(slider.object);
+            EXPECT_EQ(stored.*slider.enabled, factory.mSliderParams.*slider.enabled);
+            const float position = slider.value ? factory.mSliderParams.*slider.value : 0;
+            EXPECT_NEAR(slider.value ? stored.*slider.value : 0, position, snapping(slider, position));
+        }
+        EXPECT_EQ(stored.mColor_Value_R + stored.mColor_Value_G + stored.mColor_Value_B, 0);
+    }
+    EXPECT_EQ(modes, 12);
+    EXPECT_EQ(boxes([] {
+                  EXPECT_EQ(CPresetStore::factoryPresetMode("portrait"), Mode_Portrait);
+                  EXPECT_EQ(CPresetStore::factoryPresetName(Mode_Custom), QString(QChar(0xFFFF)));
+              }),
+              QStringList({"Note:|Unknown preset:portrait", "Note:|Unknown preset:13"}));
+}
+
+TEST_F(PresetStore, OneMissingFactoryPresetBringsAllBack) {
+    const QString key = "2000/UserPresets/Advanced/Portrait/Sliders/sldrContrast_Perc/Value";
+    CPresetStore::ensureFactoryPresets(&pane);
+    QSettings().setValue(key, 1);
+    CPresetStore::ensureFactoryPresets(&pane);
+    EXPECT_EQ(QSettings().value(key).toDouble(), 1) << "none is missing";
+    CPresetStore::removePreset(Mode_Advanced, "AutoSaturation");
+    CPresetStore::ensureFactoryPresets(&pane);
+    EXPECT_EQ(QSettings().value(key).toDouble(), 550);
+    EXPECT_TRUE(CPresetStore::presetExists(Mode_Advanced, "AutoSaturation"));
+    EXPECT_TRUE(pane.findChildren<CWgtPaneAdvancedImpl*>().isEmpty());
+}
+
+TEST_F(PresetStore, ShiftSwitchesBatchModeOff) {
+    struct Started : CBatchMode {};
+    EXPECT_EQ(CBatchMode::instance().batchMode(), -1);
+    EXPECT_FALSE(CBatchMode::instance().isBatchModeEnabled());
+    CBatchMode::instance().setBatchModeEnabled(true);
+    CBatchMode::instance().setBatchMode(Mode_SmartLevels);
+    LogCapture log;
+    EXPECT_TRUE(Started().isBatchModeEnabled());
+    EXPECT_TRUE(log.has("SHIFT key state 0"));
+    Keyboard::setShiftState([] { return 128; });
+    answer(QMessageBox::Ok);
+    EXPECT_FALSE(Started().isBatchModeEnabled());
+    Keyboard::setShiftState(nullptr);
+    EXPECT_TRUE(log.has("SHIFT key state 128"));
+    EXPECT_EQ(said, "Batch Mode|Batch mode is now off.");
+    EXPECT_EQ(CBatchMode::instance().batchMode(), 32);
+    EXPECT_EQ(QSettings().value("2000/GUI/batchModeEnabled"), QVariant(false));
+}
+
+} // namespace
