@@ -1,6 +1,7 @@
 #include "Filters/CMedian_Salt_Pepper.h"
 
 #include "Filters/PixelMath.h"
+#include "Filters/ScaledTile.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>
@@ -16,10 +17,6 @@ int brightness(const ConstRow& row, int x) {
 
 int thirdSmallest(int a, int b, int c, int d) {
     return std::max(std::min(std::max(a, b), std::max(c, d)), std::max(std::min(a, b), std::min(c, d)));
-}
-
-PixelMath::Rgb scaleTo(int median, PixelMath::Rgb c) {
-    return PixelMath::scaled(c, static_cast<float>(median * 3) / static_cast<float>(c.r + c.g + c.b));
 }
 
 } // namespace
@@ -48,19 +45,17 @@ void CMedian_Salt_Pepper::ApplyRow(std::uint32_t row) {
     const ConstRow above = std::as_const(*mInPlane).row(y - mRadius);
     const ConstRow here = std::as_const(*mInPlane).row(y);
     const Row out = mOutPlane->row(y);
-    for (int x = mRadius; x < mInPlane->width() - mRadius; ++x) {
+    recolourRow(out, mRadius, mInPlane->width() - mRadius, [&](ScaledTile& tile, int i, int x) {
         const int upperLeft = brightness(above, x - 1);
         const int upper = brightness(above, x);
         const int left = brightness(here, x - 1);
         const int centre = brightness(here, x);
         const float mean = static_cast<float>(upperLeft + upper + left + centre) / 4;
-        PixelMath::Rgb c = {here[0][x], here[1][x], here[2][x]};
-        if (centre >= kDarkestSpot && centre > PixelMath::trunc(mean * mSpotFactor))
-            c = scaleTo(thirdSmallest(upperLeft, upper, left, centre), c);
-        out[0][x] = static_cast<std::uint8_t>(c.r);
-        out[1][x] = static_cast<std::uint8_t>(c.g);
-        out[2][x] = static_cast<std::uint8_t>(c.b);
-    }
+        const bool isSpot = centre >= kDarkestSpot && centre > PixelMath::trunc(mean * mSpotFactor);
+        const int median = thirdSmallest(upperLeft, upper, left, centre);
+        const PixelMath::Rgb c = {here[0][x], here[1][x], here[2][x]};
+        tile.set(i, c, isSpot ? static_cast<float>(median * 3) / static_cast<float>(c.r + c.g + c.b) : 1.0F);
+    });
 }
 
 bool CMedian_Salt_Pepper::PostApply() {

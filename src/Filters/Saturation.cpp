@@ -1,6 +1,7 @@
 #include "Filters/Saturation.h"
 
 #include "Filters/PictureConditions.h"
+#include "Filters/ScaledTile.h"
 #include "Utility/Logger.h"
 #include "Utility/RowScheduler.h"
 
@@ -10,8 +11,7 @@
 
 namespace {
 
-constexpr float kWidth = 11.0F;        // of the window around a channel mean
-constexpr float kLargestProduct = 1e9; // keeps extreme brightness ratios within integers
+constexpr float kWidth = 11.0F; // of the window around a channel mean
 constexpr unsigned kRowGrain = 16;
 
 } // namespace
@@ -125,14 +125,13 @@ bool Saturation::PostApply() {
     const float ratio = meanOut > 0 ? mMeanIn / meanOut : 1.0F;
     Log::log(LogLevel::Debug, " Saturation mean_out %f", static_cast<double>(meanOut));
     Log::log(LogLevel::Debug, " Saturation Radion_iso_Luma %f", static_cast<double>(ratio));
-    Curve gain;
-    for (std::size_t c = 0; c < gain.size(); ++c)
-        gain[c] = PixelMath::trunc(std::min(static_cast<float>(c) * ratio, kLargestProduct));
     const auto height = static_cast<unsigned>(mOutPlane->height());
     orvela::forEachRange(0, height, kRowGrain, [&](unsigned first, unsigned last) {
         for (unsigned y = first; y < last; ++y) {
             const Row row = mOutPlane->row(static_cast<int>(y));
-            applyCurves(gain, gain, gain, {row[0], row[1], row[2]}, row, mOutPlane->width());
+            recolourRow(row, 0, mOutPlane->width(), [&row, ratio](ScaledTile& tile, int i, int x) {
+                tile.set(i, {row[0][x], row[1][x], row[2][x]}, ratio);
+            });
         }
     });
     Log::log(LogLevel::Debug, "Saturation Filter complete.");
