@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <utility>
 
 namespace {
 
@@ -36,7 +37,7 @@ bool Auto_Contrast::PreApply() {
     mParams->m_Opaco = mLimits.isHazy();
     mThreshold = chooseThreshold();
     scanChannels(mThreshold);
-    mCurve = TonalStretch::tabulate<std::uint8_t>([this](int value) {
+    mCurve = makeTable([this](int value) {
         return mParams->m_Opaco ? hazyCurve(value, mLimits) : normalCurve(value, mLimits);
     });
     return true;
@@ -96,7 +97,8 @@ std::uint8_t Auto_Contrast::normalCurve(int value, TonalStretch::Limits limits) 
 
 void Auto_Contrast::ApplyRow(std::uint32_t row) {
     beginRow(row, "Filters/Auto_Contrast", 325);
-    TonalStretch::mapRow({&mCurve, &mCurve, &mCurve}, *mInPlane, *mOutPlane, static_cast<int>(row));
+    const int y = static_cast<int>(row);
+    mapRow(mCurve, std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
 }
 
 bool Auto_Contrast::PostApply() {

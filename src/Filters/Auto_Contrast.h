@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Filters/IFilter.h"
+#include "Filters/RowMapping.h"
 #include "Filters/TonalStretch.h"
 
 /// The contrast step of the automatic-contrast mode: one black limit L and one white limit R, combined from
@@ -34,5 +35,5 @@ private:
     std::array<TonalStretch::Limits, 3> mChannels; ///< red, green, blue
     TonalStretch::Limits mLimits;                  ///< combined
     std::int32_t mThreshold = 0;                   ///< of the second scans, in samples
-    TonalStretch::Table<std::uint8_t> mCurve = {};
+    ChannelTable mCurve = {};
 };

@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <utility>
 
 namespace {
 
@@ -50,8 +51,8 @@ bool CAuto_Color::PreApply() {
             white = rightLimit(*i, s);
             Log::log(LogLevel::Debug, "i= C_%s_Right_limit:%d %f", kNames[c], *i, static_cast<double>(white));
         }
-        mCurves[c] = TonalStretch::tabulate<std::uint8_t>(
-            [limits = mLimits[c]](int value) { return curve(value, limits.black, limits.white); });
+        mCurves[c] =
+            makeTable([limits = mLimits[c]](int value) { return curve(value, limits.black, limits.white); });
     }
     return true;
 }
@@ -92,8 +93,9 @@ std::uint8_t CAuto_Color::curve(int value, float black, float white) {
 
 void CAuto_Color::ApplyRow(std::uint32_t row) {
     beginRow(row, "Filters/CAuto_Color", 195);
-    TonalStretch::mapRow({&mCurves[0], &mCurves[1], &mCurves[2]}, *mInPlane, *mOutPlane,
-                         static_cast<int>(row));
+    const int y = static_cast<int>(row);
+    mapRow({&mCurves[0], &mCurves[1], &mCurves[2]}, std::as_const(*mInPlane).row(y), mOutPlane->row(y),
+           mInPlane->width());
 }
 
 bool CAuto_Color::PostApply() {

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Filters/IFilter.h"
+#include "Filters/RowMapping.h"
 #include "Filters/TonalStretch.h"
 
 /// Automatic colour correction: each channel is stretched softly between limits of its own, which it reads
@@ -32,5 +33,5 @@ private:
         float white = 255;
     };
     std::array<FloatLimits, 3> mLimits; ///< red, green, blue
-    std::array<TonalStretch::Table<std::uint8_t>, 3> mCurves = {};
+    std::array<ChannelTable, 3> mCurves = {};
 };

@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <utility>
 
 namespace {
 
@@ -39,7 +40,7 @@ bool CAuto_Contrast_I::PreApply() {
     prepareRatios();
     logRatios();
     const auto gains = [](float ratio) {
-        return TonalStretch::tabulate<int>(
+        return makeTable<WideTable>(
             [ratio](int value) { return PixelMath::trunc(static_cast<float>(value) * ratio); });
     };
     mGains = {gains(RatioR), gains(RatioG), gains(RatioB)};
@@ -139,7 +140,7 @@ void CAuto_Contrast_I::ApplyRow(std::uint32_t row) {
     const int width = mInPlane->width();
     const Row out = mOutPlane->row(y);
     const ConstRow host = hostRow(y);
-    TonalStretch::mapKeepingHue(mGains, *mInPlane, *mOutPlane, y);
+    mapKeepingHue(mGains, std::as_const(*mInPlane).row(y), out, width);
     if (y < 50 && Log::writes(LogLevel::Debug))
         logOverflows({out[0], out[1], out[2]}, host);
     for (std::size_t c = 0; c < 3; ++c) {

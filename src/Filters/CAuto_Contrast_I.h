@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Filters/IFilter.h"
+#include "Filters/RowMapping.h"
 #include "Filters/TonalStretch.h"
 
 /// Brings the channel means back to what they were before the illumination iterations, keeping the hue where
@@ -37,5 +38,5 @@ private:
     float RatioB = 1.0F;
     float Fade_Inverse = 1.0F;      ///< share of the balanced pixel
     float Fade_Value_factor = 0.0F; ///< share of the host's pixel
-    std::array<TonalStretch::Table<int>, 3> mGains = {};
+    WideTables mGains = {};
 };

@@ -3,10 +3,12 @@
 #include "Filters/PictureConditions.h"
 #include "Filters/PixelMath.h"
 #include "Histograms/HistogramRecount.h"
+#include "Utility/LevelSwitches.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>
 #include <cmath>
+#include <utility>
 
 CAuto_Contrast_TEST::CAuto_Contrast_TEST(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
     : IFilter(params, inPlane, outPlane) {
@@ -29,18 +31,17 @@ bool CAuto_Contrast_TEST::PreApply() {
         readChannelLimits();
     C_Left_limit = luma.black;
     C_Right_limit = luma.white;
-    mHazyCurve = TonalStretch::tabulate<std::uint8_t>(
-        [luma](int value) { return TonalStretch::stretchHazy(value, luma); });
+    mHazyCurve = makeTable([luma](int value) { return TonalStretch::stretchHazy(value, luma); });
     return true;
 }
 
 bool CAuto_Contrast_TEST::applies() const {
     const CSliderParams& s = mParams->mSliderParams;
-    const bool corrected = s.AutoContrast_Enabled || s.PerceptualDarkEnabled || s.PerceptualLightEnabled ||
-                           s.PerceptualMiddleEnabled || s.OrvelaLevelEnabled || s.OrvelaLevel2Enabled;
+    const bool corrected = s.AutoContrast_Enabled || LevelSwitches::anyPerceptual(s) ||
+                           s.OrvelaLevelEnabled || s.OrvelaLevel2Enabled;
     const bool plain = isAutomaticMode(s) || !corrected;
-    const bool manual = s.mAbsolute_Dark_Enabled || s.mAbsolute_Light_Enabled || s.mAbsolute_Middle_Enabled ||
-                        s.BrightnessEnabled || s.ContrastEnabled || s.GammaCorrectionEnabled;
+    const bool manual =
+        LevelSwitches::anyAbsolute(s) || s.BrightnessEnabled || s.ContrastEnabled || s.GammaCorrectionEnabled;
     const bool purelyAutomatic = !manual && plain && !s.ClarityFilterEnabled && mParams->Normal_Picture &&
                                  !mParams->Under_Exposed_Picture;
     return !s.mAuto_Color_Enabled && !purelyAutomatic;
@@ -64,8 +65,7 @@ void CAuto_Contrast_TEST::readChannelLimits() {
     mLimits = TonalStretch::combine(channels);
     const int range = mLimits.white - mLimits.black;
     mFactor = range > 0 ? static_cast<float>(255.0 / range) : 1.0F;
-    mCurve =
-        TonalStretch::tabulate<int>([this](int value) { return stretch(value, mLimits.black, mFactor); });
+    mCurve = makeTable<WideTable>([this](int value) { return stretch(value, mLimits.black, mFactor); });
 }
 
 int CAuto_Contrast_TEST::stretch(int value, int black, float factor) {
@@ -74,24 +74,18 @@ int CAuto_Contrast_TEST::stretch(int value, int black, float factor) {
 
 void CAuto_Contrast_TEST::ApplyRow(std::uint32_t row) {
     beginRow(row, "Filters/CAuto_Contrast_TEST", 315);
-    const int y = static_cast<int>(row);
-    if (mParams->m_Opaco)
-        TonalStretch::mapRow({&mHazyCurve, &mHazyCurve, &mHazyCurve}, *mInPlane, *mOutPlane, y);
-    else
-        stretchRow(*mInPlane, y);
-}
-
-void CAuto_Contrast_TEST::stretchRow(const CARGBPlane& plane, int y) const {
-    const ConstRow in = plane.row(y);
-    const Row out = mOutPlane->row(y);
-    for (int x = 0; x < plane.width(); ++x) {
-        PixelMath::Rgb pixel = {in[0][x], in[1][x], in[2][x]};
-        if (std::min({pixel.r, pixel.g, pixel.b}) >= mLimits.black)
-            pixel = PixelMath::keepHue({mCurve[in[0][x]], mCurve[in[1][x]], mCurve[in[2][x]]});
-        out[0][x] = static_cast<std::uint8_t>(pixel.r);
-        out[1][x] = static_cast<std::uint8_t>(pixel.g);
-        out[2][x] = static_cast<std::uint8_t>(pixel.b);
+    const ConstRow in = std::as_const(*mInPlane).row(static_cast<int>(row));
+    const Row out = mOutPlane->row(static_cast<int>(row));
+    const int width = mInPlane->width();
+    if (mParams->m_Opaco) {
+        mapRow(mHazyCurve, in, out, width);
+        return;
     }
+    mapPixels(in, out, width, [this](std::uint8_t r, std::uint8_t g, std::uint8_t b) {
+        if (std::min({r, g, b}) < mLimits.black)
+            return PixelMath::Rgb{r, g, b};
+        return PixelMath::keepHue({mCurve[r], mCurve[g], mCurve[b]});
+    });
 }
 
 bool CAuto_Contrast_TEST::PostApply() {

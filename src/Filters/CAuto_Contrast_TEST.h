@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Filters/IFilter.h"
+#include "Filters/RowMapping.h"
 #include "Filters/TonalStretch.h"
 
 /// Stretches the picture between a common black limit L and white limit R; runs when the purely automatic
@@ -26,13 +27,12 @@ protected:
 private:
     bool applies() const;
     void readChannelLimits();
-    void stretchRow(const CARGBPlane& plane, int y) const;
 
     std::int32_t C_Left_limit = 0;          ///< by luma
     std::int32_t C_Right_limit = 255;       ///< by luma
     TonalStretch::Limits mLimits{999, 999}; ///< combined from the channels; unset in a hazy picture
     float mFactor = 1.0F;                   ///< 255 / (R - L), or 1
     std::int32_t mThreshold = 0;            ///< in samples
-    TonalStretch::Table<std::uint8_t> mHazyCurve = {};
-    TonalStretch::Table<int> mCurve = {};
+    ChannelTable mHazyCurve = {};
+    WideTable mCurve = {};
 };

@@ -6,6 +6,7 @@
 #include "Utility/Logger.h"
 
 #include <cmath>
+#include <utility>
 
 CAuto_Contrast_TEST_II::CAuto_Contrast_TEST_II(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
     : IFilter(params, inPlane, outPlane) {
@@ -84,11 +85,11 @@ void CAuto_Contrast_TEST_II::readChannelLimits() {
 }
 
 void CAuto_Contrast_TEST_II::prepareCurves() {
-    mHazyCurve = TonalStretch::tabulate<std::uint8_t>([this](int value) {
+    mHazyCurve = makeTable([this](int value) {
         return TonalStretch::stretchHazy(value, {C_Left_limit, C_Right_limit});
     });
     const auto curve = [](int left, int right, float factor) {
-        return TonalStretch::tabulate<int>([=](int value) { return stretch(value, {left, right}, factor); });
+        return makeTable<WideTable>([=](int value) { return stretch(value, {left, right}, factor); });
     };
     mCurves = {curve(Left_Limit_R, Right_Limit_R, HighLight_Radio_R),
                curve(Left_Limit_G, Right_Limit_G, HighLight_Radio_G),
@@ -104,11 +105,12 @@ int CAuto_Contrast_TEST_II::stretch(int value, TonalStretch::Limits limits, floa
 
 void CAuto_Contrast_TEST_II::ApplyRow(std::uint32_t row) {
     beginRow(row, "Filters/CAuto_Contrast_TEST_II", 310);
-    const int y = static_cast<int>(row);
+    const ConstRow in = std::as_const(*mInPlane).row(static_cast<int>(row));
+    const Row out = mOutPlane->row(static_cast<int>(row));
     if (mParams->m_Opaco)
-        TonalStretch::mapRow({&mHazyCurve, &mHazyCurve, &mHazyCurve}, *mInPlane, *mOutPlane, y);
+        mapRow(mHazyCurve, in, out, mInPlane->width());
     else
-        TonalStretch::mapKeepingHue(mCurves, *mInPlane, *mOutPlane, y);
+        mapKeepingHue(mCurves, in, out, mInPlane->width());
 }
 
 bool CAuto_Contrast_TEST_II::PostApply() {

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Filters/IFilter.h"
+#include "Filters/RowMapping.h"
 #include "Filters/TonalStretch.h"
 
 /// The stretch of the automatic modes, by limits that go only half way: from 0 to the first and from 255 to
@@ -39,6 +40,6 @@ private:
     float HighLight_Radio_G = 1.0F;
     float HighLight_Radio_B = 1.0F;
     float mThreshold = 0; ///< in samples
-    TonalStretch::Table<std::uint8_t> mHazyCurve = {};
-    std::array<TonalStretch::Table<int>, 3> mCurves = {};
+    ChannelTable mHazyCurve = {};
+    WideTables mCurves = {};
 };

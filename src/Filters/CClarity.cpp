@@ -8,16 +8,13 @@
 
 namespace {
 
-Curve curveAround(int mean, float variance, float sloper) {
-    Curve curve;
-    for (std::size_t i = 0; i < curve.size(); ++i) {
-        const int c = static_cast<int>(i);
+WideTable curveAround(int mean, float variance, float sloper) {
+    return makeTable<WideTable>([=](int c) {
         const int d = c - mean;
         const double weight = static_cast<float>(std::exp(-std::abs(d) / (2.0 * variance)) * d);
         const double value = d >= 0 ? (255 - c) * weight / sloper + c : c - (255 - c) * weight / 511;
-        curve[i] = PixelMath::trunc(static_cast<float>(value));
-    }
-    return curve;
+        return PixelMath::trunc(static_cast<float>(value));
+    });
 }
 
 } // namespace
@@ -38,9 +35,9 @@ bool CClarity::PreApply() {
     const auto sigma = static_cast<float>(value * 50 / 1000 + 2);
     const float variance = sigma * sigma;
     const auto sloper = static_cast<float>(value <= 600 ? 511 : 1120 - value * 102 / 100);
-    mRed = curveAround(PixelMath::trunc(mParams->m_OriginalLumaR), variance, sloper);
-    mGreen = curveAround(PixelMath::trunc(mParams->m_OriginalLumaG), variance, sloper);
-    mBlue = curveAround(PixelMath::trunc(mParams->m_OriginalLumaB), variance, sloper);
+    mCurves = {curveAround(PixelMath::trunc(mParams->m_OriginalLumaR), variance, sloper),
+               curveAround(PixelMath::trunc(mParams->m_OriginalLumaG), variance, sloper),
+               curveAround(PixelMath::trunc(mParams->m_OriginalLumaB), variance, sloper)};
     Log::log(LogLevel::Debug, "sloper= %f", static_cast<double>(sloper));
     return true;
 }
@@ -48,7 +45,7 @@ bool CClarity::PreApply() {
 void CClarity::ApplyRow(std::uint32_t row) {
     beginRow(row, "Filters/CClarity", 67);
     const int y = static_cast<int>(row);
-    applyCurves(mRed, mGreen, mBlue, std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
+    mapKeepingHue(mCurves, std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
 }
 
 bool CClarity::PostApply() {

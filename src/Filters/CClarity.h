@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Filters/HueKeepingCurves.h"
 #include "Filters/IFilter.h"
+#include "Filters/RowMapping.h"
 
 /// Clarity: brightens each channel by its distance d from the picture's channel mean, most at a moderate
 /// distance, least near white.
@@ -20,7 +20,5 @@ protected:
     bool PostApply() override;
 
 private:
-    Curve mRed = {};
-    Curve mGreen = {};
-    Curve mBlue = {};
+    WideTables mCurves = {};
 };

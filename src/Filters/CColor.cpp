@@ -6,20 +6,17 @@
 
 namespace {
 
-Curve mix(float colour, float v, float keep) {
-    Curve curve;
-    for (std::size_t c = 0; c < curve.size(); ++c) {
+WideTable mix(float colour, float v, float keep) {
+    return makeTable<WideTable>([=](int c) {
         const double mixed = static_cast<double>(colour) * v + static_cast<double>(c) * keep;
-        curve[c] = PixelMath::trunc(static_cast<float>(mixed));
-    }
-    return curve;
+        return PixelMath::trunc(static_cast<float>(mixed));
+    });
 }
 
 } // namespace
 
 CColor::Tint::Tint(float intensity, float r, float g, float b)
-    : v(intensity / 1000), keep(1.0F - v), red(mix(r, v, keep)), green(mix(g, v, keep)),
-      blue(mix(b, v, keep)) {}
+    : v(intensity / 1000), keep(1.0F - v), curves{mix(r, v, keep), mix(g, v, keep), mix(b, v, keep)} {}
 
 bool CColor::PreApply() {
     const CSliderParams& sliders = mParams->mSliderParams;
@@ -49,16 +46,10 @@ bool CColor::PreApply() {
 void CColor::ApplyRow(std::uint32_t row) {
     beginRow(row, "Filters/CColor", 92);
     const Tint& tint = mParams->Final_Touch_Mode_Enabled ? mTouch : mNormal;
-    const ConstRow in = std::as_const(*mInPlane).row(static_cast<int>(row));
-    const Row out = mOutPlane->row(static_cast<int>(row));
-    for (int x = 0; x < mInPlane->width(); ++x) {
-        const std::uint8_t r = in[0][x];
-        const std::uint8_t g = in[1][x];
-        const std::uint8_t b = in[2][x];
-        const PixelMath::Rgb c =
-            PixelMath::restoreMean({tint.red[r], tint.green[g], tint.blue[b]}, (r + g + b) / 3);
-        out[0][x] = static_cast<std::uint8_t>(c.r);
-        out[1][x] = static_cast<std::uint8_t>(c.g);
-        out[2][x] = static_cast<std::uint8_t>(c.b);
-    }
+    const int y = static_cast<int>(row);
+    const auto recolour = [&tint](std::uint8_t r, std::uint8_t g, std::uint8_t b) {
+        return PixelMath::restoreMean({tint.curves[0][r], tint.curves[1][g], tint.curves[2][b]},
+                                      (r + g + b) / 3);
+    };
+    mapPixels(std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width(), recolour);
 }

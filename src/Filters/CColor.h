@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Filters/HueKeepingCurves.h"
 #include "Filters/IFilter.h"
+#include "Filters/RowMapping.h"
 
 /// Colour filter: tints every pixel toward a chosen colour T, then restores the pixel's mean brightness.
 ///
@@ -24,9 +24,7 @@ private:
 
         float v = 0;    ///< weight of the colour
         float keep = 1; ///< weight of the pixel
-        Curve red = {};
-        Curve green = {};
-        Curve blue = {};
+        WideTables curves = {};
     };
 
     Tint mNormal;

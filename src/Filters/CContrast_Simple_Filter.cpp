@@ -21,7 +21,7 @@ bool CContrast_Simple_Filter::PreApply() {
         takeValues(s.ContrastEnabled, s.ContrastValue, s.BrightnessEnabled, s.BrightnessValue);
     if (finalTouch ? touch : mContrast != 0 || mBrightness != 0)
         Log::log(LogLevel::Debug, "CContrast_Simple_Filter Condition matched.");
-    mTable = makeChannelTable([this](int c) {
+    mTable = makeTable([this](int c) {
         const float brightened = std::trunc(PivotCurve::clampAdd(c, mBrightness));
         return PixelMath::trunc(PivotCurve::apply(brightened, mPivot, mContrast));
     });

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Filters/ChannelTable.h"
 #include "Filters/IFilter.h"
+#include "Filters/RowMapping.h"
 
 /// Gamma by slider (see GammaCurve).
 ///

@@ -1,6 +1,6 @@
 #include "Filters/CLevel_Dark_Left.h"
 
-#include "Filters/LevelSwitches.h"
+#include "Utility/LevelSwitches.h"
 #include "Utility/Logger.h"
 
 #include <utility>

@@ -1,7 +1,7 @@
 #include "Filters/CLevel_Middle.h"
 
-#include "Filters/LevelSwitches.h"
-#include "Filters/PixelMath.h"
+#include "Filters/GammaCurve.h"
+#include "Utility/LevelSwitches.h"
 #include "Utility/Logger.h"
 
 #include <utility>
@@ -44,7 +44,7 @@ void CLevel_Middle::prepareTouch() {
     mMaps = LevelMath::factorMaps(common, own);
 
     const float gamma = LevelMath::sliderToGamma(sliders.mMiddle_Touch_Value_RGB);
-    const float moved = LevelMath::gammaTransfer(PixelMath::trunc(mean), gamma);
+    const float moved = GammaCurve::transfer(PixelMath::trunc(mean), gamma);
     Log::log(LogLevel::Debug, "CLevel_Middle TOUCH Condition matched.");
     Log::log(LogLevel::Debug, "Luma_GAMMA_Factor %f", static_cast<double>(gamma));
     Log::log(LogLevel::Debug, "Ori_aux %f", static_cast<double>(moved));
@@ -57,5 +57,5 @@ void CLevel_Middle::prepareTouch() {
 void CLevel_Middle::ApplyRow(std::uint32_t row) {
     beginRow(row, "Filters/CLevel_Middle", __LINE__);
     const int y = static_cast<int>(row);
-    LevelMath::mapRow(std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width(), mMaps);
+    mapKeepingHue(mMaps, std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
 }

@@ -21,5 +21,5 @@ private:
     void prepareMain();
     void prepareTouch();
 
-    LevelMath::ChannelMaps mMaps = {};
+    WideTables mMaps = {};
 };

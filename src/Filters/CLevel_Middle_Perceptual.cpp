@@ -1,6 +1,6 @@
 #include "Filters/CLevel_Middle_Perceptual.h"
 
-#include "Filters/LevelSwitches.h"
+#include "Utility/LevelSwitches.h"
 #include "Utility/Logger.h"
 
 #include <limits>
@@ -142,5 +142,5 @@ void CLevel_Middle_Perceptual::prepareTouch() {
 void CLevel_Middle_Perceptual::ApplyRow(std::uint32_t row) {
     beginRow(row, "Filters/CLevel_Middle_Perceptual", __LINE__);
     const int y = static_cast<int>(row);
-    LevelMath::mapRow(std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width(), mMaps);
+    mapKeepingHue(mMaps, std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
 }

@@ -23,5 +23,5 @@ private:
     float mainGamma();
     void prepareTouch();
 
-    LevelMath::ChannelMaps mMaps = {};
+    WideTables mMaps = {};
 };

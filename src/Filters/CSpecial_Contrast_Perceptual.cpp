@@ -33,7 +33,7 @@ bool CSpecial_Contrast_Perceptual::PreApply() {
     const double keep = 1 - mTint;
     for (std::size_t channel = 0; channel < mTables.size(); ++channel) {
         const double added = static_cast<double>(mTint) * mTarget[channel];
-        mTables[channel] = makeChannelTable(
+        mTables[channel] = makeTable(
             [keep, added](int c) { return PixelMath::trunc(static_cast<float>(c * keep + added)); });
     }
     return true;
@@ -57,21 +57,10 @@ void CSpecial_Contrast_Perceptual::findTint() {
 void CSpecial_Contrast_Perceptual::ApplyRow(std::uint32_t row) {
     beginRow(row, "Filters/CSpecial_Contrast_Perceptual", 76);
     const int y = static_cast<int>(row);
-    const ConstRow in = std::as_const(*mInPlane).row(y);
-    const Row out = mOutPlane->row(y);
-    for (int x = 0; x < mInPlane->width(); ++x) {
-        const PixelMath::Rgb pixel = correct(in[0][x], in[1][x], in[2][x]);
-        out[0][x] = static_cast<std::uint8_t>(pixel.r);
-        out[1][x] = static_cast<std::uint8_t>(pixel.g);
-        out[2][x] = static_cast<std::uint8_t>(pixel.b);
-    }
-}
-
-PixelMath::Rgb CSpecial_Contrast_Perceptual::correct(int r, int g, int b) const {
-    const PixelMath::Rgb tinted = {mTables[0][static_cast<std::size_t>(r)],
-                                   mTables[1][static_cast<std::size_t>(g)],
-                                   mTables[2][static_cast<std::size_t>(b)]};
-    return PixelMath::restoreMean(tinted, (r + g + b) / 3);
+    const auto correct = [this](std::uint8_t r, std::uint8_t g, std::uint8_t b) {
+        return PixelMath::restoreMean({mTables[0][r], mTables[1][g], mTables[2][b]}, (r + g + b) / 3);
+    };
+    mapPixels(std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width(), correct);
 }
 
 bool CSpecial_Contrast_Perceptual::PostApply() {

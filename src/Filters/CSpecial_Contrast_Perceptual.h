@@ -1,8 +1,7 @@
 #pragma once
 
-#include "Filters/ChannelTable.h"
 #include "Filters/IFilter.h"
-#include "Filters/PixelMath.h"
+#include "Filters/RowMapping.h"
 
 #include <array>
 
@@ -26,7 +25,6 @@ protected:
 
 private:
     void findTint();
-    PixelMath::Rgb correct(int r, int g, int b) const;
 
     std::array<float, 3> mTarget = {}; ///< colour to tint toward, each 0 or 255
     float mTint = 0;                   ///< v

@@ -1,6 +1,6 @@
 #include "Filters/CTemperature.h"
 
-#include "Filters/PixelMath.h"
+#include "Filters/RowMapping.h"
 #include "Utility/Logger.h"
 
 #include <utility>
@@ -61,24 +61,20 @@ void CTemperature::prepareGains() {
 
 void CTemperature::ApplyRow(std::uint32_t row) {
     beginRow(row, "Filters/CTemperature", 72);
-    const ConstRow in = std::as_const(*mInPlane).row(static_cast<int>(row));
-    const Row out = mOutPlane->row(static_cast<int>(row));
-    for (int x = 0; x < mInPlane->width(); ++x) {
-        PixelMath::Rgb c = {in[0][x], in[1][x], in[2][x]};
-        const int sum = c.r + c.g + c.b;
-        if (sum >= kDarkestSum) {
-            const Gains& gains = mGains[static_cast<std::size_t>(sum)];
-            const float r = gains.r * static_cast<float>(c.r);
-            const float g = gains.g * static_cast<float>(c.g);
-            const float b = gains.b * static_cast<float>(c.b);
-            const auto k = static_cast<float>(sum / (static_cast<double>(r) + g + b));
-            c = PixelMath::keepHue(
-                {PixelMath::trunc(r * k), PixelMath::trunc(g * k), PixelMath::trunc(b * k)});
-        }
-        out[0][x] = static_cast<std::uint8_t>(c.r);
-        out[1][x] = static_cast<std::uint8_t>(c.g);
-        out[2][x] = static_cast<std::uint8_t>(c.b);
-    }
+    const int y = static_cast<int>(row);
+    const auto warm = [this](int red, int green, int blue) {
+        const int sum = red + green + blue;
+        if (sum < kDarkestSum)
+            return PixelMath::Rgb{red, green, blue};
+        const Gains& gains = mGains[static_cast<std::size_t>(sum)];
+        const float r = gains.r * static_cast<float>(red);
+        const float g = gains.g * static_cast<float>(green);
+        const float b = gains.b * static_cast<float>(blue);
+        const auto k = static_cast<float>(sum / (static_cast<double>(r) + g + b));
+        return PixelMath::keepHue(
+            {PixelMath::trunc(r * k), PixelMath::trunc(g * k), PixelMath::trunc(b * k)});
+    };
+    mapPixels(std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width(), warm);
 }
 
 bool CTemperature::PostApply() {

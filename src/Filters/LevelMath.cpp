@@ -1,6 +1,6 @@
 #include "Filters/LevelMath.h"
 
-#include "Filters/PixelMath.h"
+#include "Filters/GammaCurve.h"
 
 #include <cmath>
 
@@ -30,51 +30,27 @@ Levels replacing(const Levels& levels) {
     return result;
 }
 
-namespace {
-
-constexpr std::size_t kSums = 3 * 255 + 1;
-constexpr std::size_t kTableSize = kSums * 256;
-
-// Only the values that can occur in a pixel of the sum are filled in.
-void fillTable(std::uint8_t* table, const std::array<float, kSums>& weights, float common, float own,
-               MoveTables::Move move) {
-    for (std::size_t sum = 0; sum < kSums; ++sum) {
-        const std::size_t first = sum > 510 ? sum - 510 : 0;
-        const std::size_t last = std::min<std::size_t>(sum, 255);
-        for (std::size_t x = first; x <= last; ++x) {
-            const float moved = move(static_cast<float>(x), weights[sum], common);
-            table[sum * 256 + x] = static_cast<std::uint8_t>(move(moved, weights[sum], own));
-        }
-    }
-}
-
-} // namespace
-
 MoveTables::MoveTables(const Levels& levels, const std::function<float(double luma)>& weight, Move move) {
-    std::array<float, kSums> weights;
-    for (std::size_t sum = 0; sum < kSums; ++sum)
+    std::array<float, SumValueTable::kSums> weights;
+    for (std::size_t sum = 0; sum < weights.size(); ++sum)
         weights[sum] = weight(static_cast<double>(sum) / 3);
     for (std::size_t c = 0; c < 3; ++c) {
-        const auto same = std::find(levels.own.begin(), levels.own.end(), levels.own[c]);
-        const auto model = static_cast<std::size_t>(same - levels.own.begin());
-        mOfChannel[c] = model < c ? mOfChannel[model] : mTables.size();
-        if (model < c)
+        const float own = levels.own[c];
+        const auto model = std::find(levels.own.begin(), levels.own.end(), own) - levels.own.begin();
+        mOfChannel[c] = static_cast<std::size_t>(model);
+        if (mOfChannel[c] < c)
             continue;
-        mTables.resize(mTables.size() + kTableSize);
-        fillTable(mTables.data() + mOfChannel[c], weights, levels.common, levels.own[c], move);
+        mTables[c].build([&, own](int sum) {
+            return [&, own, k = weights[static_cast<std::size_t>(sum)]](int x) {
+                return move(move(static_cast<float>(x), k, levels.common), k, own);
+            };
+        });
     }
 }
 
 void MoveTables::applyRow(const ConstRow& in, const Row& out, int width) const {
-    const std::uint8_t* const red = mTables.data() + mOfChannel[0];
-    const std::uint8_t* const green = mTables.data() + mOfChannel[1];
-    const std::uint8_t* const blue = mTables.data() + mOfChannel[2];
-    for (int x = 0; x < width; ++x) {
-        const auto line = static_cast<std::size_t>(in[0][x] + in[1][x] + in[2][x]) * 256;
-        out[0][x] = red[line + in[0][x]];
-        out[1][x] = green[line + in[1][x]];
-        out[2][x] = blue[line + in[2][x]];
-    }
+    SumValueTable::mapRow({&mTables[mOfChannel[0]], &mTables[mOfChannel[1]], &mTables[mOfChannel[2]]}, in,
+                          out, width);
 }
 
 float sliderToGamma(float position) {
@@ -82,45 +58,26 @@ float sliderToGamma(float position) {
     return static_cast<float>(v >= 500 ? (v - 500) * 9 / 500 + 1 : v * 0.9 / 500 + 0.1);
 }
 
-float gammaTransfer(int level, float gamma) {
-    if (level < 1 || gamma <= 0)
-        return 0;
-    return static_cast<float>(std::pow(level / 255.0, 1.0 / gamma)) * 255.0F;
-}
-
 float gammaRatio(float mean, float gamma) {
     if (mean <= 0 || gamma == 1)
         return 1;
-    return gammaTransfer(PixelMath::trunc(mean), gamma) / mean;
+    return GammaCurve::transfer(PixelMath::trunc(mean), gamma) / mean;
 }
 
-ChannelMaps factorMaps(float common, const std::array<float, 3>& own) {
-    ChannelMaps maps;
-    for (std::size_t c = 0; c < 3; ++c) {
-        for (std::size_t x = 0; x < 256; ++x) {
+WideTables factorMaps(float common, const std::array<float, 3>& own) {
+    const auto map = [common](float factor) {
+        return makeTable<WideTable>([common, factor](int x) {
             const int scaled = PixelMath::trunc(static_cast<float>(x) * common);
-            maps[c][x] = PixelMath::trunc(static_cast<float>(scaled) * own[c]);
-        }
-    }
-    return maps;
+            return PixelMath::trunc(static_cast<float>(scaled) * factor);
+        });
+    };
+    return {map(own[0]), map(own[1]), map(own[2])};
 }
 
-ChannelMaps gammaMaps(float gamma) {
-    ChannelMaps maps;
-    for (int x = 0; x < 256; ++x)
-        maps[0][static_cast<std::size_t>(x)] = gamma > 0 ? PixelMath::trunc(gammaTransfer(x, gamma)) : x;
-    maps[1] = maps[2] = maps[0];
-    return maps;
-}
-
-void mapRow(const ConstRow& in, const Row& out, int width, const ChannelMaps& maps) {
-    for (int x = 0; x < width; ++x) {
-        const PixelMath::Rgb mapped =
-            PixelMath::keepHue({maps[0][in[0][x]], maps[1][in[1][x]], maps[2][in[2][x]]});
-        out[0][x] = static_cast<std::uint8_t>(mapped.r);
-        out[1][x] = static_cast<std::uint8_t>(mapped.g);
-        out[2][x] = static_cast<std::uint8_t>(mapped.b);
-    }
+WideTables gammaMaps(float gamma) {
+    const auto map =
+        makeTable<WideTable>([gamma](int x) { return gamma > 0 ? GammaCurve::apply(x, gamma) : x; });
+    return {map, map, map};
 }
 
 } // namespace LevelMath

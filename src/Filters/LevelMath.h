@@ -1,13 +1,12 @@
 #pragma once
 
-#include "Utility/CARGBPlane.h"
+#include "Filters/RowMapping.h"
+#include "Filters/SumValueTable.h"
 
 #include <algorithm>
 #include <array>
 #include <cstddef>
-#include <cstdint>
 #include <functional>
-#include <vector>
 
 /// What the filters of the shadow, midtone and highlight levels share.
 namespace LevelMath {
@@ -72,30 +71,21 @@ public:
     void applyRow(const ConstRow& in, const Row& out, int width) const;
 
 private:
-    std::vector<std::uint8_t> mTables;          ///< 766 rows of 256 values for each different level
-    std::array<std::size_t, 3> mOfChannel = {}; ///< start of each channel's table
+    std::array<SumValueTable, 3> mTables;       ///< built for each different level
+    std::array<std::size_t, 3> mOfChannel = {}; ///< each channel's table
 };
 
 /// The gamma of an absolute midtone slider: 0.1 at position 0, 1 at 500, 10 at 1000.
 float sliderToGamma(float position);
 
-/// 255 * (level / 255)^(1 / gamma); 0 for a level below 1 or a gamma that is not positive.
-float gammaTransfer(int level, float gamma);
-
 /// How much a gamma brightens the mean: the transfer of its whole part divided by it. Exactly 1 for gamma 1
 /// and for a mean that is not positive.
 float gammaRatio(float mean, float gamma);
 
-/// New values of each channel by its old value; above 255 where the hue has to be kept.
-using ChannelMaps = std::array<std::array<int, 256>, 3>;
-
 /// Multiplication by a common factor, then by the channel's own one, truncated after each.
-ChannelMaps factorMaps(float common, const std::array<float, 3>& own);
+WideTables factorMaps(float common, const std::array<float, 3>& own);
 
 /// The gamma transfer of every value; the identity when gamma is not positive.
-ChannelMaps gammaMaps(float gamma);
-
-/// Maps the pixels of a row; one that exceeds 255 is scaled as a whole (PixelMath::keepHue).
-void mapRow(const ConstRow& in, const Row& out, int width, const ChannelMaps& maps);
+WideTables gammaMaps(float gamma);
 
 } // namespace LevelMath

@@ -89,23 +89,17 @@ void Saturation::prepareDominant(const Means& means) {
     const bool pulls = mParams->mSliderParams.SaturationValue < 600;
     const auto curve = [&](float mean) {
         const float distance = mean == middle ? max - middle : max - min;
-        Curve results;
-        for (std::size_t i = 0; i < results.size(); ++i) {
-            const double c = static_cast<double>(i);
-            results[i] = static_cast<int>(i);
+        return makeTable<WideTable>([=, this](int c) {
             if (!pulls || mean >= max)
-                continue;
+                return c;
             const double below = max - c;
             const double slope = below == 0 ? 0 : below / (mean * 0.025);
             const double pull = 1 / std::cosh((c - mean) / kWidth) * (std::tanh(slope) + 1);
             const auto value = static_cast<float>(c - pull * distance * mStrength / 2);
-            results[i] = PixelMath::trunc(std::max(value, 0.0F));
-        }
-        return results;
+            return PixelMath::trunc(std::max(value, 0.0F));
+        });
     };
-    mRed = curve(means.r);
-    mGreen = curve(means.g);
-    mBlue = curve(means.b);
+    mCurves = {curve(means.r), curve(means.g), curve(means.b)};
 }
 
 void Saturation::ApplyRow(std::uint32_t row) {
@@ -114,7 +108,7 @@ void Saturation::ApplyRow(std::uint32_t row) {
     const ConstRow in = std::as_const(*mInPlane).row(static_cast<int>(row));
     const Row out = mOutPlane->row(static_cast<int>(row));
     if (mDominant) {
-        applyCurves(mRed, mGreen, mBlue, in, out, width);
+        mapKeepingHue(mCurves, in, out, width);
         return;
     }
     mHsv->applyRow(in, out, width);

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Filters/HueKeepingCurves.h"
 #include "Filters/IFilter.h"
+#include "Filters/RowMapping.h"
 #include "Filters/SaturationKernel.h"
 
 #include <optional>
@@ -44,12 +44,10 @@ private:
 
     float mAlfa = 1; ///< saturation factor
     SaturationKernel::Change mChange = SaturationKernel::Change::Raise;
-    bool mDominant = false; ///< dominant-colour mode
-    float mStrength = 0;    ///< k
-    float mMeanIn = 0;      ///< brightness to restore
-    std::int32_t mStep = 5; ///< distance of the samples in rows and columns
-    Curve mRed = {};        ///< dominant-colour mode: results by value
-    Curve mGreen = {};
-    Curve mBlue = {};
+    bool mDominant = false;               ///< dominant-colour mode
+    float mStrength = 0;                  ///< k
+    float mMeanIn = 0;                    ///< brightness to restore
+    std::int32_t mStep = 5;               ///< distance of the samples in rows and columns
+    WideTables mCurves = {};              ///< dominant-colour mode
     std::optional<SaturationKernel> mHsv; ///< otherwise
 };

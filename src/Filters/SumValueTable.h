@@ -3,6 +3,7 @@
 #include "Utility/CARGBPlane.h"
 
 #include <algorithm>
+#include <array>
 #include <cstddef>
 #include <cstdint>
 #include <vector>
@@ -11,6 +12,8 @@
 /// pixel can have. 196 KB.
 class SumValueTable {
 public:
+    static constexpr int kSums = 3 * 255 + 1; ///< different sums of a pixel
+
     /// Fills the table.
     /// @param curveOf  R + G + B (0 to 765) to a curve, which takes a channel value (0 to 255) to another
     template <typename CurveOf>
@@ -26,19 +29,27 @@ public:
     }
 
     /// Maps the three channels of a row.
-    void mapRow(ConstRow in, Row out, int width) const {
+    void mapRow(const ConstRow& in, const Row& out, int width) const {
+        mapRow({this, this, this}, in, out, width);
+    }
+
+    /// Maps the channels of a row, each by its own table.
+    static void mapRow(const std::array<const SumValueTable*, 3>& tables, const ConstRow& in, const Row& out,
+                       int width) {
+        const std::uint8_t* const red = tables[0]->mValues.data();
+        const std::uint8_t* const green = tables[1]->mValues.data();
+        const std::uint8_t* const blue = tables[2]->mValues.data();
         for (int x = 0; x < width; ++x) {
             const int r = in[0][x];
             const int g = in[1][x];
             const int b = in[2][x];
-            const std::uint8_t* values = mValues.data() + (r + g + b) * 256;
-            out[0][x] = values[r];
-            out[1][x] = values[g];
-            out[2][x] = values[b];
+            const int line = (r + g + b) * 256;
+            out[0][x] = red[line + r];
+            out[1][x] = green[line + g];
+            out[2][x] = blue[line + b];
         }
     }
 
 private:
-    static constexpr int kSums = 3 * 255 + 1;
     std::vector<std::uint8_t> mValues;
 };

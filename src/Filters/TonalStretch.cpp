@@ -1,6 +1,5 @@
 #include "Filters/TonalStretch.h"
 
-#include "Filters/PixelMath.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>
@@ -80,28 +79,6 @@ float pullShadows(float value, float black) {
 float liftHighlights(float value, float white) {
     const auto lifted = static_cast<float>(value + (1 - (255.0 - value) / 255) * (255.0 - white));
     return std::min(lifted, 255.0F);
-}
-
-void mapRow(const std::array<const Table<std::uint8_t>*, 3>& tables, const CARGBPlane& in, CARGBPlane& out,
-            int y) {
-    const ConstRow from = in.row(y);
-    const Row to = out.row(y);
-    for (std::size_t c = 0; c < 3; ++c) {
-        const auto lookUp = [&table = *tables[c]](std::uint8_t value) { return table[value]; };
-        std::transform(from[c], from[c] + in.width(), to[c], lookUp);
-    }
-}
-
-void mapKeepingHue(const std::array<Table<int>, 3>& tables, const CARGBPlane& in, CARGBPlane& out, int y) {
-    const ConstRow from = in.row(y);
-    const Row to = out.row(y);
-    for (int x = 0; x < in.width(); ++x) {
-        const PixelMath::Rgb mapped =
-            PixelMath::keepHue({tables[0][from[0][x]], tables[1][from[1][x]], tables[2][from[2][x]]});
-        to[0][x] = static_cast<std::uint8_t>(mapped.r);
-        to[1][x] = static_cast<std::uint8_t>(mapped.g);
-        to[2][x] = static_cast<std::uint8_t>(mapped.b);
-    }
 }
 
 } // namespace TonalStretch

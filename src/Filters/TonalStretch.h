@@ -1,14 +1,12 @@
 #pragma once
 
-#include "Utility/CARGBPlane.h"
 #include "Utility/CUserParams.h"
 
 #include <array>
-#include <cstdint>
 #include <optional>
 
 /// What the automatic contrast and colour filters share: limits read off 256-bin histograms, and the curves
-/// and tables that stretch between them.
+/// that stretch between them.
 namespace TonalStretch {
 
 /// A black and a white limit, channel values 0 to 255.
@@ -19,19 +17,6 @@ struct Limits {
     /// Neither deep shadows nor highlights: white below 215 and black above 40.
     bool isHazy() const { return white < 215 && black > 40; }
 };
-
-/// The result of a function of every channel value.
-template <typename Value>
-using Table = std::array<Value, 256>;
-
-/// A function of the channel value (0 to 255), written down as a table.
-template <typename Value, typename Function>
-Table<Value> tabulate(Function function) {
-    Table<Value> table;
-    for (int value = 0; value < 256; ++value)
-        table[static_cast<std::size_t>(value)] = static_cast<Value>(function(value));
-    return table;
-}
 
 /// First bin with more than `threshold` samples, counting up from 0 to `last`.
 std::optional<int> scanLeft(const Histogram& bins, double threshold, int last);
@@ -63,13 +48,5 @@ float pullShadows(float value, float black);
 /// Soft lift of the highlights, c + (1 - (255 - c) / 255) * (255 - white), not above 255: nothing at 0,
 /// strongest at 255.
 float liftHighlights(float value, float white);
-
-/// Looks up the samples of row y, red, green and blue in a table of their own each.
-void mapRow(const std::array<const Table<std::uint8_t>*, 3>& tables, const CARGBPlane& in, CARGBPlane& out,
-            int y);
-
-/// Looks up the pixels of row y in a table per channel; a pixel with a result above 255 is scaled down as a
-/// whole (PixelMath::keepHue).
-void mapKeepingHue(const std::array<Table<int>, 3>& tables, const CARGBPlane& in, CARGBPlane& out, int y);
 
 } // namespace TonalStretch

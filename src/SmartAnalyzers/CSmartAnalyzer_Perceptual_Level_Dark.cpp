@@ -1,9 +1,8 @@
 #include "SmartAnalyzers/CSmartAnalyzer_Perceptual_Level_Dark.h"
 
 #include "SmartAnalyzers/ToneMass.h"
+#include "Utility/LevelSwitches.h"
 #include "Utility/Logger.h"
-
-#include <algorithm>
 
 using namespace ToneMass;
 
@@ -29,16 +28,6 @@ constexpr TouchChannel kTouchChannels[] = {
     {&CSliderParams::mPerceptual_Touch_Dark_B_Enabled, &CUserParams::pHisto_Blue, &CUserParams::m_L_H_L_F_B},
 };
 
-bool anyPerceptualTouch(const CSliderParams& sliders) {
-    return std::any_of(std::begin(kTouchChannels), std::end(kTouchChannels),
-                       [&](const TouchChannel& channel) { return sliders.*channel.enabled; });
-}
-
-bool anyTouch(const CSliderParams& sliders) {
-    return sliders.mDark_Touch_RGB_Enabled || sliders.mDark_Touch_R_Enabled ||
-           sliders.mDark_Touch_G_Enabled || sliders.mDark_Touch_B_Enabled;
-}
-
 double darkMass(const Histogram& bins, int center) {
     const Curve pulled = tabulate([](int i) { return i - kPull * (1 - i / 255.0); });
     return fallingMass(remap(bins, pulled), center, kSlope);
@@ -52,7 +41,7 @@ void CSmartAnalyzer_Perceptual_Level_Dark::Analyze() {
     if (!mParams->Final_Touch_Mode_Enabled) {
         if (sliders.PerceptualDarkEnabled && !sliders.mAbsolute_Dark_Enabled)
             analyzeMain();
-    } else if (anyPerceptualTouch(sliders) && !anyTouch(sliders)) {
+    } else if (LevelSwitches::touchPerceptualDark(sliders) && !LevelSwitches::touchDark(sliders)) {
         analyzeTouch();
     }
     Log::log(LogLevel::Debug, "CSmartAnalyzer_Perceptual_Level_Dark complete.");

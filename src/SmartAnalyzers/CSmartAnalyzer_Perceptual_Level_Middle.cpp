@@ -1,6 +1,7 @@
 #include "SmartAnalyzers/CSmartAnalyzer_Perceptual_Level_Middle.h"
 
 #include "SmartAnalyzers/ToneMass.h"
+#include "Utility/LevelSwitches.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>
@@ -66,13 +67,11 @@ void logDarkened(const Histogram& bins) {
 void CSmartAnalyzer_Perceptual_Level_Middle::Analyze() {
     Log::log(LogLevel::Debug, "CSmartAnalyzer_Perceptual_Level_Middle is starting.");
     const CSliderParams& sliders = mParams->mSliderParams;
-    const bool perceptual = anyPerceptualLevel(sliders) || sliders.PerceptualGammaEnabled;
-    const bool touched = std::any_of(std::begin(kTouchChannels), std::end(kTouchChannels),
-                                     [&](const TouchChannel& channel) { return sliders.*channel.enabled; });
+    const bool perceptual = LevelSwitches::anyPerceptual(sliders) || sliders.PerceptualGammaEnabled;
     if (!mParams->Final_Touch_Mode_Enabled) {
-        if (perceptual && !sliders.GammaCorrectionEnabled && !anyAbsoluteLevel(sliders))
+        if (perceptual && !sliders.GammaCorrectionEnabled && !LevelSwitches::anyAbsolute(sliders))
             analyzeMain();
-    } else if (touched) {
+    } else if (LevelSwitches::touchPerceptualMiddle(sliders)) {
         analyzeTouch();
     }
     Log::log(LogLevel::Debug, "CSmartAnalyzer_Perceptual_Level_Middle finished..");

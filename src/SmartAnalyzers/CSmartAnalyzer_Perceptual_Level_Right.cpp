@@ -1,6 +1,7 @@
 #include "SmartAnalyzers/CSmartAnalyzer_Perceptual_Level_Right.h"
 
 #include "SmartAnalyzers/ToneMass.h"
+#include "Utility/LevelSwitches.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>
@@ -33,16 +34,6 @@ constexpr TouchChannel kTouchChannels[] = {
      kColorGain},
 };
 
-bool anyPerceptualTouch(const CSliderParams& sliders) {
-    return std::any_of(std::begin(kTouchChannels), std::end(kTouchChannels),
-                       [&](const TouchChannel& channel) { return sliders.*channel.enabled; });
-}
-
-bool anyTouch(const CSliderParams& sliders) {
-    return sliders.mLight_Touch_RGB_Enabled || sliders.mLight_Touch_R_Enabled ||
-           sliders.mLight_Touch_G_Enabled || sliders.mLight_Touch_B_Enabled;
-}
-
 // Share of the tones that the stretch leaves short of the right end.
 double shortShare(const Histogram& bins, int center, int pixels) {
     const Curve stretched = tabulate([](int i) { return std::min(255.0, i + kStretch * i / 255); });
@@ -53,9 +44,9 @@ double shortShare(const Histogram& bins, int center, int pixels) {
 
 void CSmartAnalyzer_Perceptual_Level_Right::Analyze() {
     const CSliderParams& sliders = mParams->mSliderParams;
-    if (anyPerceptualLevel(sliders) && !anyAbsoluteLevel(sliders))
+    if (LevelSwitches::anyPerceptual(sliders) && !LevelSwitches::anyAbsolute(sliders))
         analyzeMain();
-    if (anyPerceptualTouch(sliders) && !anyTouch(sliders))
+    if (LevelSwitches::touchPerceptualLight(sliders) && !LevelSwitches::touchLight(sliders))
         analyzeTouch();
 }
 

@@ -85,13 +85,4 @@ void recount(const CARGBPlane& plane, CUserParams& params) {
     recountHistograms(plane, params, kRecountRowStep, kRecountColumnStep);
 }
 
-bool anyPerceptualLevel(const CSliderParams& sliders) {
-    return sliders.PerceptualDarkEnabled || sliders.PerceptualMiddleEnabled || sliders.PerceptualLightEnabled;
-}
-
-bool anyAbsoluteLevel(const CSliderParams& sliders) {
-    return sliders.mAbsolute_Dark_Enabled || sliders.mAbsolute_Middle_Enabled ||
-           sliders.mAbsolute_Light_Enabled;
-}
-
 } // namespace ToneMass

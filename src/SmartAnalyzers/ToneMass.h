@@ -53,10 +53,4 @@ int rightLimit(const CUserParams& params);
 /// column.
 void recount(const CARGBPlane& plane, CUserParams& params);
 
-/// Whether a perceptual level (dark, middle or light) is switched on.
-bool anyPerceptualLevel(const CSliderParams& sliders);
-
-/// Whether an absolute level (dark, middle or light) is switched on.
-bool anyAbsoluteLevel(const CSliderParams& sliders);
-
 } // namespace ToneMass

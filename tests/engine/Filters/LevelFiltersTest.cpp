@@ -145,9 +145,9 @@ TEST(LevelFilters, TablesEqualThePlainOperations) {
 }
 
 TEST(LevelFilters, OverflowingMidtonesKeepTheHue) {
-    const LevelMath::ChannelMaps maps = LevelMath::factorMaps(300 / 255.0F, {1, 1, 1});
+    const WideTables maps = LevelMath::factorMaps(300 / 255.0F, {1, 1, 1});
     const auto in = testplanes::uniform(1, 1, {255, 255, 200}); // 300, 300, 235
-    LevelMath::mapRow(std::as_const(*in).row(0), in->row(0), 1, maps);
+    mapKeepingHue(maps, std::as_const(*in).row(0), in->row(0), 1);
     EXPECT_EQ(at(*in, 0, 0), (Pixel{254, 254, 198})); // 235 * 254 / 300 = 198.97
 }
 

@@ -35,6 +35,10 @@ inline bool touchPerceptualLight(const CSliderParams& sliders) {
            sliders.mPerceptual_Touch_Light_G_Enabled || sliders.mPerceptual_Touch_Light_B_Enabled;
 }
 
+inline bool anyPerceptual(const CSliderParams& sliders) {
+    return sliders.PerceptualDarkEnabled || sliders.PerceptualMiddleEnabled || sliders.PerceptualLightEnabled;
+}
+
 inline bool anyAbsolute(const CSliderParams& sliders) {
     return sliders.mAbsolute_Dark_Enabled || sliders.mAbsolute_Middle_Enabled ||
            sliders.mAbsolute_Light_Enabled;
