@@ -2,6 +2,9 @@
 
 #include "Core/PipelineTable.h"
 #include "Utility/CUserParams.h"
+#include "support/TestPlanes.h"
+
+#include <gtest/gtest.h>
 
 #include <map>
 #include <stdexcept>
@@ -77,6 +80,19 @@ inline bool run(const std::string& name, CUserParams& params, CARGBPlane& in, CA
             return task.make(&params, &in, &out)->Apply();
     }
     throw std::invalid_argument("no task named " + name);
+}
+
+/// Runs a task on a picture in place.
+inline bool apply(const std::string& name, CUserParams& params, CARGBPlane& plane) {
+    CARGBPlane out(plane, QStringLiteral("out"));
+    return run(name, params, plane, out);
+}
+
+/// The colour that a task makes of a picture of one colour.
+inline testplanes::Pixel colourAfter(const std::string& name, CUserParams& params, testplanes::Pixel colour) {
+    const auto plane = testplanes::uniform(5, 5, colour);
+    EXPECT_TRUE(apply(name, params, *plane)) << name;
+    return testplanes::at(*plane, 4, 4);
 }
 
 /// Leaves in `params` what the pipeline's measurements and analyzers would know of the picture.

@@ -11,17 +11,6 @@ TEST(CAuto_Color, GeneratedPictures) {
     EXPECT_FLOAT_EQ(CAuto_Color::rightLimit(200, 0.75F), 225.02631F);
 }
 
-TEST(CAuto_Color, RunsWhenEnabledAndReportsTheLevelBefore) {
-    U params = with({&P::mAuto_Color_Enabled});
-    EXPECT_FALSE(applies<CAuto_Color>(U(), {}));
-    EXPECT_TRUE(applies<CAuto_Color>(params, QStringLiteral("Filters/CAuto_Color:195")));
-    params.Bicromic = true;
-    params.Shift_Level = 0.6F;
-    const LogCapture log;
-    apply<CAuto_Color>(params, *uniform(1, 1, {1, 2, 3}));
-    EXPECT_TRUE(log.has("(Bicromic==OFF || Shift_Level>0.5f) 1"));
-}
-
 // A bin must exceed 3 * sqrt(100), on the right together with its two neighbours.
 TEST(CAuto_Color, ScansSkipThinBinsAndSinglePeaks) {
     U params = with({&P::mAuto_Color_Enabled});

@@ -13,14 +13,10 @@ TEST(CAuto_Contrast_TEST, StaysAwayFromThePurelyAutomaticSituation) {
     const auto runs = [](const U& params) {
         return applies<CAuto_Contrast_TEST>(params, QStringLiteral("Filters/CAuto_Contrast_TEST:315"));
     };
-    for (bool P::*flag : {&P::AutoContrast_Enabled, &P::PerceptualDarkEnabled, &P::PerceptualLightEnabled,
-                          &P::PerceptualMiddleEnabled, &P::OrvelaLevelEnabled, &P::OrvelaLevel2Enabled,
-                          &P::ClarityFilterEnabled, &P::mAbsolute_Dark_Enabled, &P::mAbsolute_Light_Enabled,
-                          &P::mAbsolute_Middle_Enabled, &P::BrightnessEnabled, &P::ContrastEnabled,
-                          &P::GammaCorrectionEnabled})
+    for (bool P::*flag : {&P::AutoContrast_Enabled, &P::PerceptualLightEnabled, &P::OrvelaLevel2Enabled,
+                          &P::ClarityFilterEnabled, &P::mAbsolute_Middle_Enabled, &P::GammaCorrectionEnabled})
         EXPECT_TRUE(runs(with({flag})) && !runs(with({flag, &P::mAuto_Color_Enabled})));
-    U params = with({&P::BilinearFilteringEnabled, &P::OrvelaLevelEnabled, &P::OrvelaLevel2Enabled,
-                     &P::mFade_Enabled, &P::SaturationEnabled});
+    U params = with(kAutomatic);
     EXPECT_FALSE(runs(params) || runs(U()));
     params.Under_Exposed_Picture = true;
     EXPECT_TRUE(runs(params));

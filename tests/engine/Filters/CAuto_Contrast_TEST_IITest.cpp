@@ -14,11 +14,9 @@ TEST(CAuto_Contrast_TEST_II, RunsInTheAutomaticModes) {
         params.Normal_Picture = normal;
         return applies<CAuto_Contrast_TEST_II>(params, QStringLiteral("Filters/CAuto_Contrast_TEST_II:310"));
     };
-    const U all = with({&P::BilinearFilteringEnabled, &P::OrvelaLevelEnabled, &P::OrvelaLevel2Enabled,
-                        &P::mFade_Enabled, &P::SaturationEnabled});
+    const U all = with(kAutomatic);
     EXPECT_TRUE(runs(all, true) && !runs(all, false) && runs(with({&P::mAuto_Color_Enabled}), false));
-    for (bool P::*flag : {&P::BilinearFilteringEnabled, &P::OrvelaLevelEnabled, &P::OrvelaLevel2Enabled,
-                          &P::mFade_Enabled, &P::SaturationEnabled}) {
+    for (bool P::*flag : kAutomatic) {
         U without = all;
         without.mSliderParams.*flag = false;
         EXPECT_FALSE(runs(without, true));
@@ -30,15 +28,10 @@ TEST(CAuto_Contrast_TEST_II, RunsInTheAutomaticModes) {
 TEST(CAuto_Contrast_TEST_II, LimitsGoHalfWay) {
     U params = with({&P::mAuto_Color_Enabled});
     const auto plane = halves({20, 20, 20}, {100, 100, 100}, {250, 100, 5}, 1);
-    const LogCapture log;
     ASSERT_TRUE(apply<CAuto_Contrast_TEST_II>(params, *plane));
     EXPECT_EQ(at(*plane, 0, 0), (Pixel{254, 95, 4}));
     EXPECT_EQ(at(*plane, 1, 0), (Pixel{15, 15, 15}));
     EXPECT_EQ(params.Shift_Level, 1);
-    for (const char* line :
-         {"pHisto_Red[250]:1.000000", "i=20   Left_Limit_R: 10", "i=20  2Left_Limit_G: 10",
-          "i=100  2Right_Limit_R: 177", "i=100  Right_Limit_B: 177", "threshold\t: 72.000000"})
-        EXPECT_TRUE(log.has(line)) << line;
     // 255 / 187 * 11 is 15; a double quotient falls just short of it.
     EXPECT_EQ(CAuto_Contrast_TEST_II::stretch(11, {20, 187}, 1), 15);
     EXPECT_EQ(CAuto_Contrast_TEST_II::stretch(20, {20, 187}, 1), 0);

@@ -10,11 +10,10 @@ namespace {
 
 // A picture from hexadecimal RGB bytes.
 std::unique_ptr<CARGBPlane> decode(int width, int height, const std::string& hex) {
-    return testplanes::make(width, height, [&hex, i = std::size_t{0}](int, int) mutable {
-        testplanes::Pixel pixel;
-        for (std::uint8_t& sample : pixel)
-            sample = static_cast<std::uint8_t>(std::stoi(hex.substr(2 * i++, 2), nullptr, 16));
-        return pixel;
+    const QByteArray samples = QByteArray::fromHex(QByteArray::fromStdString(hex));
+    return testplanes::make(width, height, [p = samples.begin()](int, int) mutable {
+        const auto sample = [&p] { return static_cast<std::uint8_t>(*p++); };
+        return testplanes::Pixel{sample(), sample(), sample()};
     });
 }
 

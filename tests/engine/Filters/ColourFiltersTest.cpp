@@ -1,4 +1,5 @@
 #include "support/LogCapture.h"
+#include "support/ParamsText.h"
 #include "support/TaskSettings.h"
 #include "support/TestPlanes.h"
 
@@ -6,20 +7,11 @@
 
 namespace {
 
+using tasksettings::apply;
+using tasksettings::colourAfter;
 using tasksettings::paramsFor;
 using testplanes::at;
 using testplanes::Pixel;
-
-bool apply(const char* task, CUserParams& params, CARGBPlane& plane) {
-    CARGBPlane out(plane, QStringLiteral("out"));
-    return tasksettings::run(task, params, plane, out);
-}
-
-Pixel colourAfter(const char* task, CUserParams& params, Pixel colour) {
-    const auto plane = testplanes::uniform(4, 4, colour);
-    EXPECT_TRUE(apply(task, params, *plane));
-    return at(*plane, 2, 1);
-}
 
 CUserParams tint(float intensity, Pixel colour) {
     CUserParams params = paramsFor("CColor", intensity);
@@ -44,46 +36,32 @@ TEST(CColor, TintsAndRestoresTheMeanBrightness) {
 }
 
 TEST(CColor, FinalTouchHasItsOwnColourAndIntensity) {
-    CUserParams params = tint(1000, {255, 0, 0});
-    CSliderParams& sliders = params.mSliderParams;
-    sliders.mColor_Effect_Intensity_Enabled = false;
-    sliders.mColor_Touch_Enabled = true;
-    sliders.mColor_Intensity_Touch_Value = 500;
-    sliders.mColor_Touch_Value_R = sliders.mColor_Touch_Value_G = 0;
-    sliders.mColor_Touch_Value_B = 100;
+    CUserParams params =
+        paramsFrom("mColor_Effect_Intensity_Value=1000 mColor_Value_R=255 mColor_Touch_Enabled "
+                   "mColor_Intensity_Touch_Value=500 mColor_Touch_Value_B=100");
     EXPECT_EQ(colourAfter("CColor", params, {60, 60, 60}), (Pixel{180, 0, 0})) << "either switch starts it";
     params.Final_Touch_Mode_Enabled = true;
     // (30, 30, 80) with mean 46.67, times 60 / 46.67
     EXPECT_EQ(colourAfter("CColor", params, {60, 60, 60}), (Pixel{38, 38, 102}));
 }
 
-TEST(Saturation, SmallPicturesKeepTheirPeak) {
-    CUserParams params = paramsFor("Saturation", 1000); // 0.5 + 1.2 * 0.617 / 2.25 = 0.829
-    EXPECT_EQ(colourAfter("Saturation", params, {200, 100, 100}), (Pixel{200, 34, 34}));
-    params = paramsFor("Saturation", 0);
-    EXPECT_EQ(colourAfter("Saturation", params, {200, 100, 50}), (Pixel{200, 200, 200}));
-}
-
 TEST(Saturation, RestoresTheUnprocessedBrightnessAfterAnIteration) {
-    CUserParams params = paramsFor("Saturation", 500);
-    params.m_OriginalLuma0 = 50;
-    const auto greyAfter = [&params] {
+    const std::string second = "OrvelaLevel2Enabled ";
+    const std::string both = second + "OrvelaLevelEnabled BilinearFilteringEnabled ";
+    const std::pair<std::string, int> cases[] = {
+        {"", 100},
+        {second + "Switch_TOO_SHARP", 100},
+        {second + "Normal_Picture=0", 100},
+        {second + "Under_Exposed_Picture", 100},
+        {both, 50},
+        {both + "mFade_Enabled", 100}}; // the automatic situation keeps the picture's own
+    for (const auto& [settings, grey] : cases) {
+        CUserParams params =
+            paramsFrom("SaturationEnabled SaturationValue=500 m_OriginalLuma0=50 " + settings);
         const auto plane = testplanes::uniform(20, 20, {100, 100, 100});
         EXPECT_TRUE(apply("Saturation", params, *plane));
-        return at(*plane, 19, 19)[0];
-    };
-    EXPECT_EQ(greyAfter(), 100);
-    params.mSliderParams.OrvelaLevel2Enabled = true;
-    for (bool CUserParams::*flag : {&CUserParams::Switch_TOO_SHARP, &CUserParams::Normal_Picture,
-                                    &CUserParams::Under_Exposed_Picture}) {
-        params.*flag = !(params.*flag);
-        EXPECT_EQ(greyAfter(), 100);
-        params.*flag = !(params.*flag);
+        EXPECT_EQ(at(*plane, 19, 19)[0], grey) << settings;
     }
-    params.mSliderParams.OrvelaLevelEnabled = params.mSliderParams.BilinearFilteringEnabled = true;
-    EXPECT_EQ(greyAfter(), 50);
-    params.mSliderParams.mFade_Enabled = true;
-    EXPECT_EQ(greyAfter(), 100) << "the automatic situation keeps the picture's own";
 }
 
 TEST(Saturation, UndefinedRatiosAndSlopesChangeNothing) {

@@ -1,9 +1,8 @@
-#include "Filters/CAverage.h"
 #include "Filters/CBilinear.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
 #include "Utility/CGenericEx.h"
-#include "Utility/RowScheduler.h"
 #include "support/LogCapture.h"
+#include "support/ParamsText.h"
 #include "support/TaskSettings.h"
 #include "support/TestPlanes.h"
 
@@ -11,21 +10,11 @@
 
 namespace {
 
+using tasksettings::apply;
+using tasksettings::colourAfter;
 using tasksettings::paramsFor;
 using testplanes::at;
 using testplanes::Pixel;
-using P = CSliderParams;
-
-bool apply(const char* task, CUserParams& params, CARGBPlane& plane) {
-    CARGBPlane out(plane, QStringLiteral("out"));
-    return tasksettings::run(task, params, plane, out);
-}
-
-Pixel colourAfter(const char* task, CUserParams& params, Pixel colour) {
-    const auto plane = testplanes::uniform(5, 5, colour);
-    EXPECT_TRUE(apply(task, params, *plane));
-    return at(*plane, 4, 4);
-}
 
 double detail(CARGBPlane& plane) {
     CUserParams params;
@@ -49,37 +38,21 @@ TEST(SharpSmart, SumsTheDistancesToTheNeighbours) {
     EXPECT_NEAR(detail(*stripes), (2 + 4 * 138) / 7000.0, 1e-6);
 }
 
-TEST(SharpSmart, SumIsTheSameForEveryNumberOfThreads) {
-    const auto plane = testplanes::noise(300, 200);
-    double expected = 0;
-    for (const int threads : {1, 2, 7, 7, 7}) {
-        const orvela::RowScheduler scheduler(threads);
-        const double sum = detail(*plane);
-        expected = threads == 1 ? sum : expected;
-        EXPECT_EQ(sum, expected) << threads;
-    }
-}
-
 TEST(CBilinear, RunsOnNormalPicturesThatAreNotTooSharp) {
-    const auto runs = [](CUserParams params, int side = 4) {
-        return apply("CBilinear", params, *testplanes::uniform(side, side, {5, 5, 5}));
-    };
-    CUserParams params = paramsFor("CBilinear");
-    params.Switch_TOO_SHARP = true;
-    EXPECT_TRUE(runs(params)) << "decided anew";
-    params.Normal_Picture = false;
-    EXPECT_FALSE(runs(params));
-    params.Normal_Picture = params.Switch_TOO_SHARP_ORV_I = params.Switch_TOO_SHARP_ORV_II = true;
-    EXPECT_TRUE(runs(params));
-    params.mSliderParams.OrvelaLevel3Enabled = true;
-    EXPECT_FALSE(runs(params));
-
-    params = CUserParams();
-    params.mSliderParams.OrvelaLevel2Enabled = true;
-    EXPECT_TRUE(runs(params, 701)) << "by itself after an iteration";
-    EXPECT_FALSE(runs(params, 700));
-    params.Switch_TOO_SHARP = true;
-    EXPECT_FALSE(runs(params, 701));
+    const std::string on = "BilinearFilteringEnabled BilinearFilteringValue=700 ";
+    const std::string sharp = on + "Switch_TOO_SHARP_ORV_I Switch_TOO_SHARP_ORV_II ";
+    const std::tuple<std::string, int, bool> cases[] = {
+        {on + "Switch_TOO_SHARP", 4, true}, // decided anew
+        {on + "Normal_Picture=0", 4, false},
+        {sharp, 4, true},
+        {sharp + "OrvelaLevel3Enabled", 4, false},
+        {"OrvelaLevel2Enabled", 701, true}, // by itself after an iteration
+        {"OrvelaLevel2Enabled", 700, false},
+        {"OrvelaLevel2Enabled Switch_TOO_SHARP", 701, false}};
+    for (const auto& [settings, side, runs] : cases) {
+        CUserParams params = paramsFrom(settings);
+        EXPECT_EQ(apply("CBilinear", params, *testplanes::uniform(side, side, {5, 5, 5})), runs) << settings;
+    }
 }
 
 TEST(CBilinear, LargePicturesTakeSixTenthsOfTheSlider) {
@@ -91,17 +64,6 @@ TEST(CBilinear, LargePicturesTakeSixTenthsOfTheSlider) {
     ASSERT_TRUE(apply("CBilinear", params, *small));
     for (int i = 0; i < 8; ++i)
         EXPECT_EQ(at(*large, i, 4), at(*small, i, 4)) << i;
-}
-
-TEST(CBilinear, FlatAreasKeepEveryLevel) {
-    CUserParams params = paramsFor("CBilinear");
-    const auto patches = testplanes::make(768, 3, [](int x, int) {
-        const auto level = static_cast<std::uint8_t>(x / 3);
-        return Pixel{level, level, level};
-    });
-    ASSERT_TRUE(apply("CBilinear", params, *patches));
-    for (int level = 0; level < 256; ++level)
-        EXPECT_EQ(at(*patches, 3 * level + 1, 1)[1], level);
 }
 
 // Has memory for tables up to a size only.
@@ -171,53 +133,26 @@ TEST(CMoire, PutsTheHostPixelBackOnlyWhereAllChannelsDiffer) {
     }
 }
 
-TEST(CClarity, BrightensAwayFromTheMean) {
-    CUserParams params = paramsFor("CClarity", 0);
-    params.m_OriginalLumaR = params.m_OriginalLumaG = params.m_OriginalLumaB = 100.9F;
-    // T(10) = 10 exp(-10 / 8) = 2.87: 110 + 145 * 2.87 / 511 = 110.8
-    EXPECT_EQ(colourAfter("CClarity", params, {110, 100, 90}), (Pixel{110, 100, 90}));
-    params.mSliderParams.ClarityFilterValue = 1000;
-    // T(10) = 9.98, sloper 100: 110 + 14.5; below the mean 511: 90 + 165 * 9.98 / 511 = 93.2
-    EXPECT_EQ(colourAfter("CClarity", params, {110, 100, 90}), (Pixel{124, 100, 93}));
-}
-
 TEST(DetailFilters, StayAwayWhereOtherCorrectionsWork) {
     const auto plane = testplanes::uniform(3, 3, {9, 9, 9});
     const CARGBPlaneProxyDirect proxy(*plane);
-    const auto staysAway = [&plane](const char* task, const std::vector<bool P::*>& sliders, bool P::*last) {
-        CUserParams params = paramsFor(task);
-        for (bool P::*slider : sliders)
-            params.mSliderParams.*slider = true;
+    const std::array<const char*, 3> cases[] = {
+        {"CMoire", "Moire_Enabled",
+         "OrvelaLevelEnabled OrvelaLevel2Enabled ContrastEnabled BrightnessEnabled Switch_TOO_SHARP "
+         "Under_Exposed_Picture"},
+        {"CMedian_Salt_Pepper", "SaltPepperEnabled", "Switch_TOO_SHARP"},
+        {"CClarity",
+         "ClarityFilterEnabled BilinearFilteringEnabled OrvelaLevelEnabled OrvelaLevel2Enabled mFade_Enabled",
+         "SaturationEnabled"}};
+    for (const auto& [task, settings, others] : cases) {
+        CUserParams params = paramsFrom(settings);
         EXPECT_TRUE(apply(task, params, *plane)) << task;
-        params.mSliderParams.*last = !(params.mSliderParams.*last);
-        EXPECT_FALSE(apply(task, params, *plane)) << task;
-    };
-    for (bool P::*slider :
-         {&P::OrvelaLevelEnabled, &P::OrvelaLevel2Enabled, &P::ContrastEnabled, &P::BrightnessEnabled})
-        staysAway("CMoire", {}, slider);
-    staysAway(
-        "CClarity",
-        {&P::BilinearFilteringEnabled, &P::OrvelaLevelEnabled, &P::OrvelaLevel2Enabled, &P::mFade_Enabled},
-        &P::SaturationEnabled);
-    for (const auto& [task, flag] : {std::pair{"CMoire", &CUserParams::Switch_TOO_SHARP},
-                                     {"CMoire", &CUserParams::Under_Exposed_Picture},
-                                     {"CMedian_Salt_Pepper", &CUserParams::Switch_TOO_SHARP}}) {
-        CUserParams params = paramsFor(task);
-        params.*flag = true;
-        EXPECT_FALSE(apply(task, params, *plane)) << task;
+        for (const QString& other : QString(others).split(' ')) {
+            params = paramsFrom(settings);
+            setField(params, other, 1);
+            EXPECT_FALSE(apply(task, params, *plane)) << task << ' ' << other.toStdString();
+        }
     }
-    for (const char* task :
-         {"CColor", "CTemperature", "Saturation", "CClarity", "CBilinear", "CMoire", "CMedian_Salt_Pepper"}) {
-        CUserParams off;
-        EXPECT_FALSE(apply(task, off, *plane)) << task;
-    }
-}
-
-TEST(CAverage, LeavesThePicture) {
-    CUserParams params;
-    EXPECT_EQ(colourAfter("CAverage", params, {1, 2, 3}), (Pixel{1, 2, 3}));
-    const auto plane = testplanes::noise(6, 5);
-    EXPECT_FALSE(CAverage(&params, plane.get(), plane.get()).ApplyEmpty());
 }
 
 } // namespace

@@ -1,16 +1,12 @@
 #include "Filters/COrv_II_Iter.h"
 #include "Filters/COrv_I_Iter.h"
-#include "Filters/IlluminationKernel.h"
-#include "Filters/SmoothingKernel.h"
 #include "Filters/Super_ORV.h"
 #include "Filters/Super_ORV_II.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
-#include "support/LogCapture.h"
+#include "support/ParamsText.h"
 #include "support/TestPlanes.h"
 
 #include <gtest/gtest.h>
-
-#include <cmath>
 
 namespace {
 
@@ -24,18 +20,9 @@ bool apply(CUserParams& params, CARGBPlane& plane) {
     return Filter(&params, &plane, &out).Apply();
 }
 
-CUserParams firstIteration(float value) {
-    CUserParams params;
-    params.mSliderParams.OrvelaLevelEnabled = true;
-    params.mSliderParams.OrvelaLevelValue = value;
-    return params;
-}
-
-CUserParams secondIteration(float value) {
-    CUserParams params;
-    params.mSliderParams.OrvelaLevel2Enabled = true;
-    params.mSliderParams.OrvelaLevel2Value = value;
-    return params;
+// Only an iteration, by the name of its slider, is on.
+CUserParams level(const std::string& name, float value) {
+    return paramsFrom(name + "Enabled " + name + "Value=" + std::to_string(value));
 }
 
 // floor(100 * (1 + tanh(100 * k / 380 - 2)) / 1.44), worked out by a few lines of another language.
@@ -48,7 +35,8 @@ TEST(IlluminationIteration, FlatAreasFollowTheSlider) {
     // Grey 100: window sum trunc(379.2134) = 379, k = 3.792134 * 255 / epsilon.
     for (const Case& expected : {Case{0, 130, 137}, Case{500, 85, 116}, Case{750, 61, 95}}) {
         for (const bool first : {true, false}) {
-            CUserParams params = first ? firstIteration(expected.slider) : secondIteration(expected.slider);
+            CUserParams params =
+                first ? level("OrvelaLevel", expected.slider) : level("OrvelaLevel2", expected.slider);
             const auto plane = testplanes::uniform(6, 6, {100, 100, 100});
             ASSERT_TRUE(first ? apply<COrv_I_Iter>(params, *plane) : apply<COrv_II_Iter>(params, *plane));
             EXPECT_EQ(at(*plane, 3, 3)[0], first ? expected.first : expected.second) << expected.slider;
@@ -57,17 +45,17 @@ TEST(IlluminationIteration, FlatAreasFollowTheSlider) {
 }
 
 TEST(IlluminationIteration, CoefficientsAreTruncatedAsDefined) {
-    CUserParams params = firstIteration(1000); // 61 * 0.85 = 51.85
+    CUserParams params = level("OrvelaLevel", 1000); // 61 * 0.85 = 51.85
     apply<COrv_I_Iter>(params, *testplanes::uniform(2, 2, {1, 1, 1}));
     EXPECT_EQ(params.OrvelaLight1, 51);
     EXPECT_TRUE(params.Soft_Orvela) << "51 / 0.85 = 60 is not above 70";
-    params = secondIteration(500); // 45.5, 45 / 1.275 = 35.29
+    params = level("OrvelaLevel2", 500); // 45.5, 45 / 1.275 = 35.29
     apply<COrv_II_Iter>(params, *testplanes::uniform(2, 2, {1, 1, 1}));
     EXPECT_EQ(params.OrvelaLight2, 35);
 }
 
 TEST(IlluminationIteration, BrightResultsAreClampedAndEmptyWindowsDarken) {
-    CUserParams params = firstIteration(0);
+    CUserParams params = level("OrvelaLevel", 0);
     auto plane = testplanes::uniform(4, 4, {200, 200, 200});
     apply<COrv_I_Iter>(params, *plane);
     EXPECT_EQ(at(*plane, 2, 2), (Pixel{255, 255, 255})) << "200 * 1.886 / 1.44 = 261.9";
@@ -80,7 +68,7 @@ TEST(IlluminationIteration, BrightResultsAreClampedAndEmptyWindowsDarken) {
 // The last column's window holds only its left neighbours: a bright last column there is not its own
 // surround.
 TEST(IlluminationIteration, LastColumnAndRowAreNotTheirOwnSurround) {
-    CUserParams params = firstIteration(500);
+    CUserParams params = level("OrvelaLevel", 500);
     const auto plane = testplanes::make(5, 5, [](int x, int) {
         return x == 4 ? Pixel{90, 90, 90} : Pixel{30, 30, 30};
     });
@@ -91,64 +79,38 @@ TEST(IlluminationIteration, LastColumnAndRowAreNotTheirOwnSurround) {
 }
 
 TEST(IlluminationIteration, ColourDetailGuardsAreStrict) {
-    CUserParams params = firstIteration(500);
-    params.mSliderParams.OrvelaLevel3Enabled = true;
-    params.mSliderParams.mAuto_Color_Enabled = true;
-    const auto runs = [&params](double sum) {
-        params.mSum_Color = sum;
-        params.Switch_TOO_SHARP_ORV_I = true;
-        const bool ran = apply<COrv_I_Iter>(params, *testplanes::uniform(3, 3, {9, 9, 9}));
-        EXPECT_EQ(ran, !params.Switch_TOO_SHARP_ORV_I);
-        return ran;
-    };
-    EXPECT_TRUE(runs(2.18));
-    EXPECT_FALSE(runs(2.19));
-    EXPECT_TRUE(runs(0.25));
-    EXPECT_FALSE(runs(0.24));
-    params.mSliderParams.mAuto_Color_Enabled = false;
-    EXPECT_TRUE(runs(9));
-    params.mSliderParams.PerceptualDarkEnabled = params.mSliderParams.PerceptualMiddleEnabled = true;
-    EXPECT_TRUE(runs(9));
-    params.mSliderParams.PerceptualLightEnabled = true;
-    EXPECT_FALSE(runs(9));
-    params.mSliderParams.OrvelaLevel3Enabled = false;
-    EXPECT_TRUE(runs(9));
-    params.Under_Exposed_Picture = true;
-    params.mSum_Color = 1;
-    EXPECT_FALSE(apply<COrv_I_Iter>(params, *testplanes::uniform(3, 3, {9, 9, 9})));
-
-    CUserParams second = secondIteration(500);
-    second.mSliderParams.OrvelaLevel3Enabled = second.mSliderParams.AutoContrast_Enabled = true;
-    second.mSum_Color = 0.7;
-    EXPECT_TRUE(apply<COrv_II_Iter>(second, *testplanes::uniform(3, 3, {9, 9, 9})));
-    second.mSum_Color = 0.69;
-    EXPECT_FALSE(apply<COrv_II_Iter>(second, *testplanes::uniform(3, 3, {9, 9, 9})));
-    EXPECT_TRUE(second.Switch_TOO_SHARP_ORV_II);
-}
-
-TEST(IlluminationKernel, TableAndPlainFormGiveTheSameBytes) {
-    const auto in = testplanes::noise(301, 40);
-    for (const float epsilon : {75.0F, 90.0F, 114.0F, 153.0F}) {
-        const IlluminationKernel tabled(epsilon, 100'000'000);
-        auto fast = testplanes::uniform(301, 40, {0, 0, 0});
-        auto plain = testplanes::uniform(301, 40, {0, 0, 0});
-        for (int y = 0; y < 40; ++y) {
-            tabled.applyRow(*in, *fast, y);
-            tabled.applyRowPlain(*in, *plain, y);
-        }
-        EXPECT_EQ(bytes(*fast), bytes(*plain)) << epsilon;
+    const std::string first = "OrvelaLevelEnabled OrvelaLevelValue=500 ";
+    const std::string detailed = first + "OrvelaLevel3Enabled ";
+    const std::string automatic = detailed + "mAuto_Color_Enabled ";
+    const std::string perceptual = "PerceptualDarkEnabled PerceptualMiddleEnabled mSum_Color=9 ";
+    const std::string second = "OrvelaLevel2Enabled OrvelaLevel3Enabled AutoContrast_Enabled ";
+    const std::vector<std::pair<std::string, bool>> cases = {
+        {automatic + "mSum_Color=2.18", true},
+        {automatic + "mSum_Color=2.19", false},
+        {automatic + "mSum_Color=0.25", true},
+        {automatic + "mSum_Color=0.24", false},
+        {detailed + "mSum_Color=9", true},
+        {detailed + perceptual, true},
+        {detailed + perceptual + "PerceptualLightEnabled", false},
+        {first + perceptual + "PerceptualLightEnabled", true},
+        {second + "mSum_Color=0.7", true},
+        {second + "mSum_Color=0.69", false}};
+    const auto plane = testplanes::uniform(3, 3, {9, 9, 9});
+    for (const auto& [settings, runs] : cases) {
+        const bool one = settings.starts_with(first);
+        CUserParams params = paramsFrom(settings);
+        bool& sharp = one ? params.Switch_TOO_SHARP_ORV_I : params.Switch_TOO_SHARP_ORV_II;
+        sharp = runs; // decided anew
+        EXPECT_EQ(one ? apply<COrv_I_Iter>(params, *plane) : apply<COrv_II_Iter>(params, *plane), runs)
+            << settings;
+        EXPECT_EQ(sharp, !runs) << settings;
     }
-}
-
-CUserParams smoothing(float value) {
-    CUserParams params;
-    params.mSliderParams.OrvelaLevel3Enabled = true;
-    params.mSliderParams.OrvelaLevel3Value = value;
-    return params;
+    CUserParams params = paramsFrom(first + "Under_Exposed_Picture mSum_Color=1");
+    EXPECT_FALSE(apply<COrv_I_Iter>(params, *plane));
 }
 
 TEST(Super_ORV, SmoothsFlatAreasInsideTheBorderOnly) {
-    CUserParams params = smoothing(100);
+    CUserParams params = level("OrvelaLevel3", 100);
     const auto plane = testplanes::uniform(9, 8, {200, 100, 10});
     EXPECT_TRUE(apply<Super_ORV>(params, *plane));
     // 19.624 / 20 of the value: 196.2, 98.1, 9.8.
@@ -159,6 +121,7 @@ TEST(Super_ORV, SmoothsFlatAreasInsideTheBorderOnly) {
                 << x << ',' << y;
         }
     }
+    EXPECT_FALSE(apply<Super_ORV>(params, *testplanes::noise(4, 100)));
 }
 
 TEST(Super_ORV, ThresholdIsStrictAndBlackIsLeftAlone) {
@@ -172,7 +135,7 @@ TEST(Super_ORV, ThresholdIsStrictAndBlackIsLeftAlone) {
         });
     };
     const auto smoothed = [&](float slider, int dx) {
-        CUserParams params = smoothing(slider);
+        CUserParams params = level("OrvelaLevel3", slider);
         const auto plane = spot(dx);
         apply<Super_ORV>(params, *plane);
         return at(*plane, 3, 3)[1] == 98;
@@ -180,7 +143,7 @@ TEST(Super_ORV, ThresholdIsStrictAndBlackIsLeftAlone) {
     EXPECT_TRUE(smoothed(0, 40));
     EXPECT_FALSE(smoothed(0, 150));
     EXPECT_TRUE(smoothed(34, 150)) << "0.05 + 0.0102 = 0.0602";
-    CUserParams params = smoothing(1000);
+    CUserParams params = level("OrvelaLevel3", 1000);
     const auto black = testplanes::uniform(7, 7, {0, 0, 0});
     apply<Super_ORV>(params, *black);
     EXPECT_EQ(at(*black, 3, 3), (Pixel{0, 0, 0}));
@@ -194,7 +157,7 @@ TEST(Super_ORV, WeighsEveryClassOfDistance) {
         for (int dx = -2; dx <= 2; ++dx) {
             if (dx == 0 && dy == 0)
                 continue;
-            CUserParams params = smoothing(1000);
+            CUserParams params = level("OrvelaLevel3", 1000);
             const auto plane = testplanes::make(7, 7, [dx, dy](int x, int y) {
                 return x == 3 + dx && y == 3 + dy ? Pixel{200, 100, 100} : Pixel{100, 100, 100};
             });
@@ -203,38 +166,6 @@ TEST(Super_ORV, WeighsEveryClassOfDistance) {
             EXPECT_EQ(at(*plane, 3, 3)[0], static_cast<int>(expected)) << dx << ',' << dy;
         }
     }
-}
-
-TEST(SmoothingKernel, TilesAndPlainFormGiveTheSameBytes) {
-    // Noise of little and of full contrast, with black in it, over more than one tile.
-    const auto full = testplanes::noise(561, 24);
-    const auto in = testplanes::make(561, 24, [&full](int x, int y) {
-        Pixel pixel = at(*full, x, y);
-        for (std::uint8_t& sample : pixel)
-            sample = static_cast<std::uint8_t>(x < 200 ? sample / 64 + 60 + y
-                                                       : (x < 300 ? 0 : sample / (1 + x % 7)));
-        return pixel;
-    });
-    for (const double threshold : {0.05, 0.08, 0.35}) {
-        const SmoothingKernel kernel(threshold);
-        CARGBPlane tiled(*in, QStringLiteral("tiled"));
-        CARGBPlane plain(*in, QStringLiteral("plain"));
-        for (int y = 2; y < 22; ++y) {
-            kernel.applyRow(*in, tiled, y, 2, 559);
-            kernel.applyRowPlain(*in, plain, y, 2, 559);
-        }
-        EXPECT_EQ(bytes(tiled), bytes(plain)) << threshold;
-        EXPECT_NE(bytes(tiled), bytes(*in));
-    }
-}
-
-TEST(Super_ORV, SmallPicturesAreSkippedOrUntouched) {
-    CUserParams params = smoothing(1000);
-    EXPECT_FALSE(apply<Super_ORV>(params, *testplanes::noise(4, 100)));
-    const auto plane = testplanes::noise(5, 5);
-    const auto before = bytes(*plane);
-    EXPECT_TRUE(apply<Super_ORV>(params, *plane));
-    EXPECT_EQ(bytes(*plane), before);
 }
 
 TEST(Super_ORV_II, PutsTheHostPixelBackWhereAnyChannelBrightenedTooMuch) {
@@ -247,7 +178,7 @@ TEST(Super_ORV_II, PutsTheHostPixelBackWhereAnyChannelBrightenedTooMuch) {
         const Pixel pixels[] = {{200, 50, 50}, {100, 100, 50}, {100, 50, 50}, {0, 0, 200}};
         return pixels[x];
     });
-    CUserParams params = firstIteration(0);
+    CUserParams params = level("OrvelaLevel", 0);
     EXPECT_TRUE(apply<Super_ORV_II>(params, *plane));
     EXPECT_EQ(at(*plane, 0, 0), (Pixel{100, 50, 50})) << "0.5";
     EXPECT_EQ(at(*plane, 1, 0), (Pixel{100, 100, 50})) << "0.63 is not below";

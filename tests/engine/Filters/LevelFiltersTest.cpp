@@ -1,7 +1,7 @@
-#include "Filters/CLevel_Middle_Perceptual.h"
 #include "Filters/LevelMath.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
 #include "support/LogCapture.h"
+#include "support/ParamsText.h"
 #include "support/TaskSettings.h"
 #include "support/TestPlanes.h"
 
@@ -33,38 +33,6 @@ const std::vector<Case> kCases = {
 #include "engine/data/LevelCases.inc"
 };
 
-bool set(CUserParams& params, const std::string& name, float value) {
-    if (name == "Final_Touch_Mode_Enabled") {
-        params.Final_Touch_Mode_Enabled = value != 0;
-        return true;
-    }
-#define ORVELA_STATISTIC_FIELD(type, field, initial, listed)                                                 \
-    if (name == #field) {                                                                                    \
-        params.field = static_cast<type>(value);                                                             \
-        return true;                                                                                         \
-    }
-#define ORVELA_KEPT_FIELD(type, field, listed) ORVELA_STATISTIC_FIELD(type, field, 0, listed)
-#include "Utility/StatisticFields.inc"
-    for (const SliderField& field : sliderFields()) {
-        if (name != field.name)
-            continue;
-        if (field.value)
-            params.mSliderParams.*field.value = value;
-        else
-            params.mSliderParams.*field.flag = value != 0;
-        return true;
-    }
-    return false;
-}
-
-CUserParams settingsOf(const std::string& text) {
-    CUserParams params;
-    std::istringstream words(text);
-    for (std::string name, value; std::getline(words >> std::ws, name, '=') && words >> value;)
-        EXPECT_TRUE(set(params, name, std::stof(value))) << name;
-    return params;
-}
-
 std::string row(const CARGBPlane& plane, int y) {
     std::ostringstream text;
     for (int x = 0; x < plane.width(); ++x) {
@@ -93,7 +61,7 @@ TEST(LevelFilters, MapPixelsAsWorkedOutIndependently) {
         const auto in = input();
         const std::string before = row(*in, 0);
         CARGBPlane out(*in, QStringLiteral("out"));
-        CUserParams params = settingsOf(each.settings);
+        CUserParams params = paramsFrom(each.settings);
         const bool applies = *each.expected != '\0';
         EXPECT_EQ(tasksettings::run(each.filter, params, *in, out), applies);
         const std::string after = applies ? each.expected : before;
@@ -101,28 +69,6 @@ TEST(LevelFilters, MapPixelsAsWorkedOutIndependently) {
         EXPECT_EQ(row(out, 0), after);
         EXPECT_EQ(row(out, 1), leavesLastRow ? before : after);
     }
-}
-
-// Every pixel of a noise picture in place of the few above.
-std::vector<std::uint8_t> noiseAfter(const std::string& filter, const std::string& settings) {
-    const auto in = testplanes::noise(40, 30);
-    CARGBPlane out(*in, QStringLiteral("out"));
-    CUserParams params = settingsOf(settings);
-    EXPECT_TRUE(tasksettings::run(filter, params, *in, out)) << filter;
-    return bytes(*in);
-}
-
-TEST(LevelFilters, NeutralSettingsAreTheIdentity) {
-    const std::vector<std::pair<const char*, const char*>> neutral = {
-        {"CLevel_Dark_Left", "m_OriginalLuma=120 mAbsolute_Dark_Enabled=1"},
-        {"CLevel_Middle", "m_OriginalLuma=120.7 mAbsolute_Middle_Enabled=1 mAbsolute_Middle_Value=500"},
-        {"CLevel_Dark_Left_Perceptual", "m_OriginalLuma=120 PerceptualDarkEnabled=1 m_L_H_L_F=80"},
-        {"CLevel_Middle_Perceptual",
-         "m_OriginalLuma=120 PerceptualMiddleEnabled=1 PerceptualMiddle=500 m_M_H_H_F=0.7"},
-        {"CLevel_Light_Right_Perceptual", "m_OriginalLuma=120 PerceptualLightEnabled=1 m_R_L_L_F=300"}};
-    const auto before = bytes(*testplanes::noise(40, 30));
-    for (const auto& [filter, settings] : neutral)
-        EXPECT_EQ(noiseAfter(filter, settings), before) << filter;
 }
 
 TEST(LevelFilters, TablesEqualThePlainOperations) {
@@ -153,67 +99,42 @@ TEST(LevelFilters, OverflowingMidtonesKeepTheHue) {
 
 TEST(LevelFilters, PerceptualMidtonesDecreaseTheHighCoefficientForGood) {
     CUserParams params =
-        settingsOf("PerceptualMiddleEnabled=1 PerceptualMiddle=500 m_M_H_H_F=2.5 m_M_H_H_F_B=3");
+        paramsFrom("PerceptualMiddleEnabled=1 PerceptualMiddle=500 m_M_H_H_F=2.5 m_M_H_H_F_B=3");
     const auto prepare = [&params] {
-        const auto in = input();
-        CARGBPlane out(*in, QStringLiteral("out"));
-        EXPECT_TRUE(CLevel_Middle_Perceptual(&params, in.get(), &out).Apply());
+        EXPECT_TRUE(tasksettings::run("CLevel_Middle_Perceptual", params, *input(), *input()));
     };
     for (const float expected : {1.5F, 0.5F, 0.5F}) {
         prepare();
         EXPECT_EQ(params.m_M_H_H_F, expected);
     }
     params.Final_Touch_Mode_Enabled = params.mSliderParams.mPerceptual_Touch_Middle_B_Enabled = true;
-    params.mSliderParams.mPerceptual_Touch_Middle_Value_B = 500;
-    prepare();
-    EXPECT_EQ(params.m_M_H_H_F_B, 2);
-    params.mSliderParams.mPerceptual_Touch_Middle_Value_B = 499;
-    prepare();
-    EXPECT_EQ(params.m_M_H_H_F_B, 2);
+    for (const float position : {500.0F, 499.0F}) {
+        params.mSliderParams.mPerceptual_Touch_Middle_Value_B = position;
+        prepare();
+        EXPECT_EQ(params.m_M_H_H_F_B, 2);
+    }
 }
 
-std::vector<std::string> logOf(const std::string& filter, const std::string& settings) {
-    const LogCapture log;
-    noiseAfter(filter, settings);
-    return log.lines();
-}
-
-TEST(LevelFilters, LogTheirBranchAndFactors) {
-    const auto expectLines = [](const char* filter, const char* settings, std::vector<std::string> expected) {
-        std::string all = "\n";
-        for (const std::string& line : logOf(filter, settings))
-            all += line.substr(std::min(line.find_first_not_of('\t'), line.size())) + "\n";
-        for (const std::string& line : expected)
-            EXPECT_NE(all.find("\n" + line + "\n"), std::string::npos) << line << " not in" << all;
-    };
-    expectLines("CLevel_Dark_Left", "mAbsolute_Dark_Enabled=1",
-                {"!Final_Touch_Mode_Enabled  1.", "CLevel_Dark_Left Condition matched.",
-                 "CLevel_Dark_Left Filter complete."});
-    expectLines("CLevel_Middle", "mAbsolute_Middle_Enabled=1 mAbsolute_Middle_Value=250",
-                {"Middle_Level_Value  250.000000", "CLevel_Middle Condition matched."});
-    expectLines("CLevel_Dark_Left_Perceptual", "PerceptualDarkEnabled=1",
-                {"!Final_Touch_Mode_Enabled 000 1.", "CLevel_Dark_Left_Perceptual 1st Condition matched.",
-                 "Perceptual_Touch_Tone_Dark_Enabled  0", " Normal_Picture1", " !Touch_Tone_Dark_Enabled 1",
-                 "CLevel_Dark_Left_Perceptual Filter complete."});
-    expectLines("CLevel_Middle_Perceptual",
-                "Final_Touch_Mode_Enabled=1 mPerceptual_Touch_Middle_G_Enabled=1 m_OriginalLumaG=51 "
-                "mPerceptual_Touch_Middle_Value_G=1000 m_M_H_H_F_G=1.5 m_M_H_L_F_G=0.25",
-                {"CLevel_Middle_Perceptual FINAL TOUCH 1st Condition matched.",
-                 "Perceptual_Touch_Middle_Value_G 1000. m_M_H_H_F_G 1.500000 ; m_M_H_L_F_G 0.250000",
-                 "CLevel_Middle_Perceptual TOUCH 2nd Condition matched.", "Shadow_Radio_RGB 1.000000.",
-                 "Shadow_Radio_G 2.094828."}); // 255 * 0.2^(1 / 1.85) / 51
-    const std::string red =
-        "Final_Touch_Mode_Enabled=1 mPerceptual_Touch_Middle_R_Enabled=1 m_M_H_L_F_R=0.1 ";
-    const auto expectRed = [&](const std::string& settings, const std::string& ratio) {
-        expectLines("CLevel_Middle_Perceptual", (red + settings).c_str(), {"Shadow_Radio_R " + ratio});
-    };
-    // At most the imbalance 2, times 1.5 above 100: then 255 * (101 / 255)^(1 / 7) / 101.
-    const std::string high = "mPerceptual_Touch_Middle_Value_R=1000 m_M_H_H_F_R=5 ";
-    expectRed(high + "m_OriginalLumaR=100 m_OriginalLumaG=200 m_OriginalLumaB=200", "2.000000.");
-    expectRed(high + "m_OriginalLumaR=101 m_OriginalLumaG=202 m_OriginalLumaB=202", "2.211867.");
-    // At least 1.3 over the imbalance, times 1.1 above 80.
-    expectRed("m_OriginalLumaR=80 m_OriginalLumaG=160 m_OriginalLumaB=160", "0.650000.");
-    expectRed("m_OriginalLumaR=81 m_OriginalLumaG=162 m_OriginalLumaB=162", "0.715000.");
+// The branches of the touched midtones show in their logged ratios.
+TEST(LevelFilters, TouchedMidtonesAreBounded) {
+    const std::string green = "mPerceptual_Touch_Middle_G_Enabled mPerceptual_Touch_Middle_Value_G=1000 "
+                              "m_M_H_H_F_G=1.5 m_M_H_L_F_G=0.25 ";
+    const std::string red = "mPerceptual_Touch_Middle_R_Enabled m_M_H_L_F_R=0.1 ";
+    const std::string high = red + "mPerceptual_Touch_Middle_Value_R=1000 m_M_H_H_F_R=5 ";
+    const std::vector<std::array<std::string, 2>> cases = {
+        {green + "m_OriginalLumaG=51", "G 2.094828."}, // 255 * 0.2^(1 / 1.85) / 51
+        // At most the imbalance 2, times 1.5 above 100: then 255 * (101 / 255)^(1 / 7) / 101.
+        {high + "m_OriginalLumaR=100 m_OriginalLumaG=200 m_OriginalLumaB=200", "R 2.000000."},
+        {high + "m_OriginalLumaR=101 m_OriginalLumaG=202 m_OriginalLumaB=202", "R 2.211867."},
+        // At least 1.3 over the imbalance, times 1.1 above 80.
+        {red + "m_OriginalLumaR=80 m_OriginalLumaG=160 m_OriginalLumaB=160", "R 0.650000."},
+        {red + "m_OriginalLumaR=81 m_OriginalLumaG=162 m_OriginalLumaB=162", "R 0.715000."}};
+    for (const auto& [settings, ratio] : cases) {
+        const LogCapture log;
+        CUserParams params = paramsFrom("Final_Touch_Mode_Enabled " + settings);
+        EXPECT_TRUE(tasksettings::run("CLevel_Middle_Perceptual", params, *input(), *input()));
+        EXPECT_TRUE(log.has("Shadow_Radio_" + ratio)) << settings;
+    }
 }
 
 } // namespace

@@ -18,6 +18,11 @@ using testplanes::uniform;
 using P = CSliderParams;
 using U = CUserParams;
 
+/// The switches of the purely automatic situation.
+constexpr std::initializer_list<bool P::*> kAutomatic = {&P::BilinearFilteringEnabled, &P::OrvelaLevelEnabled,
+                                                         &P::OrvelaLevel2Enabled, &P::mFade_Enabled,
+                                                         &P::SaturationEnabled};
+
 inline U with(std::initializer_list<bool P::*> flags) {
     U params;
     for (bool P::*flag : flags)

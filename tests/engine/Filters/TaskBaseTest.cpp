@@ -88,9 +88,6 @@ TEST_F(TaskTest, PhasesRunInOrderAndTheOutputBecomesTheInput) {
     EXPECT_EQ(testplanes::at(*in, 3, 6), (testplanes::Pixel{200, 200, 200}));
     ASSERT_EQ(log.lines().size(), 8U);
     EXPECT_EQ(log.lines()[0], "-> PreApply");
-    EXPECT_EQ(log.lines()[1].find("<- Done in "), 0U);
-    EXPECT_EQ(log.lines()[2], "-> Pre DoApplyParallel");
-    EXPECT_EQ(log.lines()[4], "-> Pre PostApply");
     EXPECT_EQ(log.lines()[6], "onSuccess copying from out to in");
 }
 
@@ -174,9 +171,7 @@ TEST_F(TaskTest, DumpsAreNumberedInTheirOrder) {
     QSettings().remove("2000/GUI/dumpImageAfterFile");
     qunsetenv("TEMP");
     const QStringList files = QDir(folder.path()).entryList(QDir::Files, QDir::Name);
-    ASSERT_EQ(files.size(), 2);
-    EXPECT_EQ(files[0], "image_after_Scripted_0_4x7.raw");
-    EXPECT_EQ(files[1], "image_after_Scripted_1_4x7.raw");
+    EXPECT_EQ(files, QStringList({"image_after_Scripted_0_4x7.raw", "image_after_Scripted_1_4x7.raw"}));
 }
 
 TEST_F(TaskTest, MissingObjectsAreReportedByTheConstructor) {

@@ -57,11 +57,6 @@ TEST(CHistogram0, SharesTheLumaAmongBands) {
     EXPECT_EQ(params.m_Dark_Acu, 2 / 20.0);
     EXPECT_EQ(params.m_Middle_Acu, 2 / 20.0);
     EXPECT_EQ(params.m_Light_Acu, 2 / 20.0);
-    const CUserParams bright = measure(greys(std::vector<std::uint8_t>(99, 240)));
-    EXPECT_EQ(bright.WhiteCount, 99);
-    EXPECT_EQ(bright.m_Light_Acu, 99 / 200.0);
-    EXPECT_EQ(bright.m_Dark_Acu, 0);
-    EXPECT_EQ(bright.m_Histo_Light_Exception, 0);
 }
 
 TEST(CHistogram0, MeansAreWholeNumbers) {

@@ -1,6 +1,5 @@
 #include "Histograms/IHistogram.h"
 
-#include "Utility/RowScheduler.h"
 #include "support/StatisticMap.h"
 #include "support/TaskSettings.h"
 #include "support/TestPlanes.h"
@@ -53,30 +52,6 @@ TEST(Histograms, SampleAGridThatDependsOnTheSize) {
             EXPECT_EQ(params.m_OriginalLumaR, first ? 0 : std::trunc(200 * count / plane->pixelCount()))
                 << name;
         }
-    }
-}
-
-TEST(Histograms, AnEmptyPictureMeasuresAsNothing) {
-    CARGBPlane empty(0, 0, QString());
-    for (const std::string& name : kSampled) {
-        CUserParams params = allSwitchedOn();
-        EXPECT_TRUE(apply(name, params, empty));
-        EXPECT_EQ(params.m_Dark_Acu + params.m_Middle_Acu + params.m_Light_Acu, 0) << name;
-        EXPECT_EQ(params.m_OriginalLuma + params.m_OriginalLumaG, 0) << name;
-    }
-}
-
-TEST(Histograms, CountTheSameForAnyNumberOfThreads) {
-    const auto plane = testplanes::noise(301, 257);
-    const auto measure = [&plane](const std::string& name, int threads) {
-        const orvela::RowScheduler scheduler(threads);
-        CUserParams params = allSwitchedOn();
-        apply(name, params, *plane);
-        return std::pair(statistics(params), params.pHisto_Blue);
-    };
-    for (const std::string& name : kSampled) {
-        EXPECT_EQ(measure(name, 1), measure(name, 2)) << name;
-        EXPECT_EQ(measure(name, 1), measure(name, 7)) << name;
     }
 }
 

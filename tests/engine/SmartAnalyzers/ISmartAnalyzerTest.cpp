@@ -1,8 +1,6 @@
-#include "SmartAnalyzers/ISmartAnalyzer.h"
-
 #include "Histograms/HistogramRecount.h"
 #include "SmartAnalyzers/ToneMass.h"
-#include "Utility/CGenericEx.h"
+#include "support/ParamsText.h"
 #include "support/StatisticMap.h"
 #include "support/TaskSettings.h"
 #include "support/TestPlanes.h"
@@ -11,7 +9,6 @@
 
 #include <cmath>
 #include <fstream>
-#include <new>
 #include <string>
 
 namespace {
@@ -27,18 +24,6 @@ CUserParams patternedParams() {
         params.pHisto_Blue[i] = static_cast<double>((i * 37 + 33) % 101);
     }
     return params;
-}
-
-void set(CUserParams& params, const std::string& name, float value) {
-    params.Final_Touch_Mode_Enabled |= name == "Final_Touch_Mode_Enabled";
-    if (name == "m_OriginalLuma")
-        params.m_OriginalLuma = value;
-    for (const SliderField& slider : sliderFields()) {
-        if (name == slider.name && slider.flag)
-            params.mSliderParams.*slider.flag = true;
-        else if (name == slider.name)
-            params.mSliderParams.*slider.value = value;
-    }
 }
 
 // Reads the formula of a plane, which the script explains, and makes it.
@@ -69,7 +54,7 @@ void runCase(std::istream& file) {
         if (verb == "bin")
             params.pHisto_Luma[std::stoul(name)] = value;
         else if (verb == "set")
-            set(params, name, static_cast<float>(value));
+            setField(params, QString::fromStdString(name), value);
         else
             expected[name] = value;
     }
@@ -83,13 +68,6 @@ void runCase(std::istream& file) {
     EXPECT_EQ(params.pHisto_Luma, counted.pHisto_Luma);
 }
 
-class FailingAnalyzer final : public ISmartAnalyzer {
-public:
-    using ISmartAnalyzer::ISmartAnalyzer;
-    void Prepare() override {}
-    void Analyze() override { throw std::bad_alloc(); }
-};
-
 } // namespace
 
 TEST(SmartAnalyzers, GiveTheIndependentResults) {
@@ -100,20 +78,6 @@ TEST(SmartAnalyzers, GiveTheIndependentResults) {
         runCase(file);
     }
     EXPECT_EQ(cases, 80);
-}
-
-TEST(SmartAnalyzers, FailureReachesTheCallerAsOneError) {
-    CUserParams params;
-    const auto plane = testplanes::uniform(2, 2, {1, 2, 3});
-    try {
-        FailingAnalyzer(&params, plane.get()).Apply();
-        FAIL();
-    } catch (const CGenericEx& failure) {
-        EXPECT_EQ(failure.message(),
-                  QStringLiteral("An error occured while running a SmartAnalyzer object."));
-    }
-    EXPECT_THROW(FailingAnalyzer(nullptr, plane.get()).Apply(), CBadPtrEx);
-    EXPECT_THROW(FailingAnalyzer(&params, nullptr).Apply(), CBadPtrEx);
 }
 
 // The outermost bins that can hold a limit, and one step beyond them.

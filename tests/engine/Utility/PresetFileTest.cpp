@@ -1,7 +1,5 @@
 #include "Utility/PresetFile.h"
 
-#include "Utility/SettingFields.h"
-
 #include <QDir>
 #include <QFile>
 #include <QTemporaryDir>
@@ -99,34 +97,6 @@ TEST_F(PresetFileTest, AFailedWriteLeavesTheOldFile) {
     EXPECT_THROW(PresetFile().write(taken), PresetError);
     EXPECT_TRUE(QFileInfo(taken).isDir());
     EXPECT_EQ(QDir(mFolder.path()).entryList(QDir::Files).size(), 0);
-}
-
-TEST(SettingFields, SwitchesAndRangesBelongToTheirSliders) {
-    using P = CSliderParams;
-    const auto switchOf = [](const char* name) {
-        return SettingFields::switchOf(*SettingFields::find(name));
-    };
-    EXPECT_EQ(switchOf("SaturationValue"), &P::SaturationEnabled);
-    EXPECT_EQ(switchOf("mContrast_Touch_Value"), &P::mContrast_Touch_Enabled);
-    EXPECT_EQ(switchOf("mColor_Value_G"), nullptr);
-    EXPECT_EQ(switchOf("mFade_Enabled"), nullptr);
-    EXPECT_EQ(SettingFields::highest(*SettingFields::find("mColor_Touch_Value_B")), 255.0F);
-    EXPECT_EQ(SettingFields::find("mFade"), nullptr);
-}
-
-TEST(SettingFields, FinalTouchIsSplitFromTheRest) {
-    CSliderParams all;
-    all.SaturationValue = 3;
-    all.mColor_Touch_Value_R = 9;
-    all.mColor_Touch_Enabled = true;
-    const CSliderParams main = SettingFields::onlyFinalTouch(all, false);
-    const CSliderParams touch = SettingFields::onlyFinalTouch(all, true);
-    EXPECT_EQ(main.SaturationValue, 3.0F);
-    EXPECT_EQ(main.mColor_Touch_Value_R, 0.0F);
-    EXPECT_FALSE(SettingFields::anyFinalTouchOn(main));
-    EXPECT_EQ(touch.SaturationValue, 0.0F);
-    EXPECT_EQ(touch.mColor_Touch_Value_R, 9.0F);
-    EXPECT_TRUE(SettingFields::anyFinalTouchOn(touch));
 }
 
 } // namespace
