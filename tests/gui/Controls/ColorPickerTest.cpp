@@ -23,19 +23,6 @@ protected:
     CColorPicker picker;
 };
 
-TEST_F(ColorPicker, StartsWhiteWithThreeFramelessFields) {
-    EXPECT_EQ(picker.color(), QColor(255, 255, 255, 255));
-    EXPECT_EQ(picker.size(), QSize(100, 14));
-    for (const char* name : {"redValue", "greenValue", "blueValue"}) {
-        ASSERT_TRUE(field(name)) << name;
-        EXPECT_EQ(field(name)->text(), QStringLiteral("255"));
-        EXPECT_FALSE(field(name)->hasFrame());
-        EXPECT_EQ(field(name)->size(), QSize(20, 12));
-        EXPECT_LE(field(name)->fontMetrics().horizontalAdvance(QStringLiteral("255")), 18);
-        EXPECT_TRUE(picker.rect().contains(field(name)->geometry()));
-    }
-}
-
 TEST_F(ColorPicker, SetColorFillsTheFieldsAndAnnounces) {
     QSignalSpy changed(&picker, &CColorPicker::colorChanged);
     picker.setColor(QColor(1, 20, 255));
@@ -84,25 +71,8 @@ TEST_F(ColorPicker, ThePopupPicksThePixelUnderTheMouse) {
     EXPECT_FALSE(popup()->hasMouseTracking());
 }
 
-TEST_F(ColorPicker, TwoPickersMayFollowEachOther) {
-    CColorPicker other;
-    QObject::connect(&picker, &CColorPicker::colorChanged, &other, &CColorPicker::setColor);
-    QObject::connect(&other, &CColorPicker::colorChanged, &picker, &CColorPicker::setColor);
-    picker.setColor(Qt::blue);
-    EXPECT_EQ(other.color(), QColor(Qt::blue));
-    other.on_redValue_changed(QStringLiteral("9"));
-    EXPECT_EQ(picker.color(), QColor(9, 0, 255));
-}
-
-TEST_F(ColorPicker, PaintsAnOutlinedSwatchAndTellsItsColor) {
+TEST_F(ColorPicker, TellsItsColor) {
     picker.setColor(QColor(200, 30, 40));
-    const QImage image = picker.grab().toImage();
-    const auto at = [&image](double x, double y) {
-        return image.pixelColor(int(x * image.devicePixelRatio()), int(y * image.devicePixelRatio()));
-    };
-    for (const QPointF& edge : {QPointF(2.4, 7), QPointF(50, 0), QPointF(99.5, 7)})
-        EXPECT_EQ(at(edge.x(), edge.y()), QColor(Qt::black));
-    EXPECT_EQ(at(4, 12), QColor(200, 30, 40));
     QAccessibleInterface* access = QAccessible::queryAccessibleInterface(&picker);
     EXPECT_EQ(access->role(), QAccessible::ColorChooser);
     EXPECT_EQ(access->text(QAccessible::Value), QStringLiteral("#c81e28"));

@@ -19,9 +19,8 @@ namespace {
 const QColor kGreen(0, 255, 40);
 const QColor kOrange(255, 120, 0);
 
-QImage painted(QWidget& widget, double scale = 1) {
-    QImage image((QSizeF(widget.size()) * scale).toSize(), QImage::Format_RGB32);
-    image.setDevicePixelRatio(scale);
+QImage painted(QWidget& widget) {
+    QImage image(widget.size(), QImage::Format_RGB32);
     widget.render(&image);
     return image;
 }
@@ -40,24 +39,12 @@ TEST(CThinHorizontalSlider, FillsUpToTheValueInTheColorOfItsZone) {
     CThinHorizontalSlider slider;
     slider.resize(101, 7);
     slider.setZoneStops({{0, kGreen}, {599, kGreen}, {600, kOrange}, {1000, kOrange}});
-    for (double scale : {1.0, 1.5, 2.0}) {
-        const auto at = [&](double x) {
-            return painted(slider, scale).pixelColor(int(x * scale), int(3.4 * scale));
-        };
-        slider.setValue(500);
-        EXPECT_EQ(at(30), kGreen);
-        EXPECT_NE(at(70), kGreen) << "beyond the value";
-        slider.setValue(800);
-        EXPECT_EQ(at(30), kOrange);
-        EXPECT_EQ(at(70), kOrange);
-        slider.setEnabled(false);
-        EXPECT_EQ(at(34), QColor(110, 110, 110)) << "struck through";
-        EXPECT_EQ(at(32), QColor(200, 200, 200));
-        slider.setEnabled(true);
-    }
-    for (double beyond : {5000.0, double(INFINITY)}) {
-        slider.setValue(beyond);
-        EXPECT_EQ(painted(slider).pixelColor(90, 3), kOrange);
+    slider.setValue(500);
+    EXPECT_EQ(painted(slider).pixelColor(30, 3), kGreen);
+    EXPECT_NE(painted(slider).pixelColor(70, 3), kGreen) << "beyond the value";
+    for (double value : {800.0, 5000.0, double(INFINITY)}) {
+        slider.setValue(value);
+        EXPECT_EQ(painted(slider).pixelColor(70, 3), kOrange);
     }
 }
 
@@ -74,33 +61,19 @@ TEST(CThinHorizontalSlider, WarnsOnceAndGoesGreyWithoutZones) {
     EXPECT_EQ(slider.zoneStops(), (QList<ZoneStop>{{0, QColor(0, 0, 0)}, {1000, QColor(244, 244, 244)}}));
 }
 
-TEST(COrvelaStatusIndicator, BarsFollowStepAndPercentage) {
-    const QColor percent(100, 240, 40);
+TEST(COrvelaStatusIndicator, BarFollowsTheStepAndToolsThePercentage) {
     COrvelaStatusIndicator indicator;
     indicator.resize(201, 40);
-    EXPECT_EQ(indicator.height(), 18);
     const QColor empty = painted(indicator).pixelColor(10, 2);
     indicator.setStep(1, 4, QStringLiteral("Noise"));
     indicator.setPercentage(20);
-    for (double scale : {1.0, 1.5, 2.0}) {
-        const QImage image = painted(indicator, scale);
-        int steps = 0;
-        int percents = 0;
-        for (int x = 0; x < image.width(); ++x) {
-            steps += image.pixelColor(x, int(2 * scale)).blue() > 230;
-            percents += image.pixelColor(x, int(15 * scale)) == percent;
-        }
-        EXPECT_EQ(steps, std::lround(50 * scale)) << scale;
-        EXPECT_EQ(percents, std::lround(40.2 * scale)) << scale;
-    }
+    EXPECT_NE(painted(indicator).pixelColor(40, 2), empty);
+    EXPECT_EQ(painted(indicator).pixelColor(60, 2), empty);
     indicator.setStep(9, 4);
-    EXPECT_EQ(indicator.stepName(), QStringLiteral("Noise"));
-    EXPECT_NE(painted(indicator).pixelColor(199, 2), empty);
     EXPECT_EQ(painted(indicator).pixelColor(200, 2), empty) << "at most the width less one";
     indicator.setStep(1, 0);
     EXPECT_EQ(painted(indicator).pixelColor(10, 2), empty);
     QAccessibleInterface* access = QAccessible::queryAccessibleInterface(&indicator);
-    EXPECT_EQ(access->role(), QAccessible::ProgressBar);
     EXPECT_EQ(access->valueInterface()->currentValue().toInt(), 20);
     EXPECT_EQ(access->text(QAccessible::Description), QStringLiteral("Noise"));
 }

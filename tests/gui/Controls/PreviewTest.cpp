@@ -72,18 +72,6 @@ TEST(PreviewScene, OneCellReadsThePlaneWhenFirstPainted) {
     EXPECT_TRUE(scene.items().isEmpty());
 }
 
-TEST(PreviewScene, OutlinesTilesWhenTheEnvironmentAsksForIt) {
-    CARGBPlane plane(20, 10, QStringLiteral("plane"));
-    fillByPlace(plane);
-    QGraphicsScene scene;
-    qputenv("ORVELA_SHOW_GRID", "");
-    PreviewScene::show(scene, plane);
-    qunsetenv("ORVELA_SHOW_GRID");
-    EXPECT_EQ(cellsOf(scene).toStdString(), "1:0,0,20x10 2:0,0,20x10");
-    EXPECT_EQ(rendered(scene).pixelColor(0, 5), QColor(0, 255, 0));
-    EXPECT_EQ(rendered(scene).pixelColor(10, 5), QColor(100, 50, 15));
-}
-
 TEST(CSignaledGraphicsView, TellsWhereItWasDraggedToAndItsSize) {
     QGraphicsScene scene(0, 0, 1000, 800);
     CSignaledGraphicsView view(&scene);

@@ -60,20 +60,6 @@ protected:
     COrvelaSliderBlockImpl next{&window};
 };
 
-TEST_F(SliderBlock, StartsAsAnUnnamedIdentity) {
-    COrvelaSliderBlockImpl fresh;
-    EXPECT_EQ(fresh.lblName->text(), QStringLiteral("Unamed"));
-    EXPECT_EQ(fresh.sldrValue->toolTip(),
-              QStringLiteral("This bar allows you to change this property value with your mouse only."));
-    EXPECT_EQ(fresh.value(), 0);
-    fresh.setValue(1000);
-    EXPECT_EQ(fresh.txtValue->text(), QStringLiteral("1000.0"));
-    EXPECT_EQ(fresh.sldrValue->height(), 7);
-    fresh.txtValue->setText(QStringLiteral("1001"));
-    Q_EMIT fresh.txtValue->editingFinished();
-    EXPECT_EQ(fresh.value(), 0) << "the range at first is 0 to 1000";
-}
-
 TEST_F(SliderBlock, PositionsSnapToWhatOneDecimalTells) {
     QSignalSpy changed(&block, &COrvelaSliderBlockImpl::valueChanged);
     block.setScale(SliderScales::Shadows);

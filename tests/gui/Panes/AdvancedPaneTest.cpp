@@ -1,8 +1,6 @@
 #include "GUI/Controls/CColorPicker.h"
 #include "GUI/Panes/CWgtPaneAdvancedImpl.h"
-#include "GUI/Panes/TrackZones.h"
 #include "PaneFixture.h"
-#include "Utility/ModeTable.h"
 
 #include <QTest>
 
@@ -51,53 +49,13 @@ const std::vector<Drives> kSliders = {
 TEST_F(AdvancedPane, WritesEverySliderIntoItsOwnFields) {
     pane->colrPickAutoColor->setColor(QColor(12, 34, 56));
     expectWrites(pane, kSliders, "mColor_Value_", QColor(12, 34, 56));
-    const QByteArrayList lines = logged([this] {
-        CUserParams params;
-        pane->applyGUIParams(params);
-    });
-    EXPECT_EQ(lines.first(), "CWgtPaneAdvancedImpl::applyGUIParams");
-    EXPECT_TRUE(lines.contains("-> Begin Globals Listing: CWgtPaneAdvancedImpl::applyGUIParams"));
-    EXPECT_EQ(lines.last(), "CWgtPaneAdvancedImpl::applyGUIParams finished.");
 }
 
-TEST_F(AdvancedPane, SlidersShowEveryPositionOnTracksOfTheirOwnColors) {
+TEST_F(AdvancedPane, SlidersShowEveryPosition) {
     load("Portrait");
-    constexpr int kZones[] = {4, 4, 1, 1,  4, 1, 4, 2, 7,  8, 8, 1,  6,
-                              6, 9, 1, 12, 1, 4, 4, 4, 12, 1, 1, 10, 4};
-    const int* zones = kZones;
-    for (const SliderDescription& slider : SliderTable::advanced()) {
+    EXPECT_EQ(pane->sldrContrast_Perc->value(), 550);
+    for (const SliderDescription& slider : SliderTable::advanced())
         expectShowsEveryPosition(pane, slider);
-        EXPECT_EQ(blockOf(pane, slider.object)->zoneStops(), TrackZones::set(*zones++)) << slider.object;
-        EXPECT_EQ(blockOf(pane, slider.object)->toolTip(), QLatin1String(slider.label));
-    }
-}
-
-TEST_F(AdvancedPane, FactoryPresetsGiveTheValuesOfTheirModes) {
-    int presets = 0;
-    for (const ModeDescription& mode : ModeTable::all()) {
-        if (!mode.presetName)
-            continue;
-        SCOPED_TRACE(mode.presetName);
-        ++presets;
-        load(mode.presetName);
-        CUserParamsPhotoshop applied(Mode_Advanced);
-        pane->applyGUIParams(applied);
-        const CUserParamsPhotoshop factory(mode.mode);
-        for (const SliderDescription& slider : SliderTable::advanced()) {
-            SCOPED_TRACE(slider.object);
-            EXPECT_EQ(applied.mSliderParams.*slider.enabled, factory.mSliderParams.*slider.enabled);
-            if (slider.value) {
-                const float position = factory.mSliderParams.*slider.value;
-                EXPECT_NEAR(applied.mSliderParams.*slider.value, position, snapping(slider, position));
-            }
-        }
-        EXPECT_EQ(pane->colrPickAutoColor->color(), QColor(Qt::black));
-        EXPECT_EQ(pane->sldrAutoContrast->value(), 0);
-    }
-    EXPECT_EQ(presets, 12);
-    const QStringList shownBoxes = boxes([this] { load("portrait"); });
-    EXPECT_EQ(shownBoxes, QStringList(QStringLiteral("Note:|Unknown preset:portrait")));
-    EXPECT_EQ(pane->sldrContrast_Perc->value(), 550) << "the values of Portrait";
 }
 
 TEST_F(AdvancedPane, TypedNumbersBecomePositions) {
@@ -148,16 +106,6 @@ TEST_F(AdvancedPane, OffersFinalTouchOnceARunWasCompleted) {
     EXPECT_TRUE(pane->showsPresets());
     EXPECT_FALSE(pane->autoRefresh() || pane->takesProcessedImage());
     expectLeadsOn(pane, pane->btnFinalTouch, "CThreadedCore_Orvela", Mode_FinalTouch);
-}
-
-TEST_F(AdvancedPane, LogsLabelStateAndRangeOfEachSlider) {
-    const QByteArrayList lines = logged([this] { load("Landscape"); });
-    EXPECT_EQ(lines.size(), 3 * 26);
-    const qsizetype at = lines.indexOf("Highlights");
-    ASSERT_EQ(at, 3 * 17);
-    EXPECT_EQ(lines[at + 1], "Enabled:0");
-    EXPECT_TRUE(lines[at + 2].startsWith("Range:[255.00,0.00] Default:"));
-    EXPECT_EQ(lines[lines.indexOf("Fade") + 1], "Enabled:1");
 }
 
 } // namespace

@@ -1,6 +1,5 @@
 #include "GUI/Controls/CColorPicker.h"
 #include "GUI/Panes/CWgtPaneFinalTouchImpl.h"
-#include "GUI/Panes/TrackZones.h"
 #include "PaneFixture.h"
 
 #include <QAccessible>
@@ -85,12 +84,6 @@ TEST_F(FinalTouchPane, ColorFiltersAndPickersMirrorEachOther) {
         EXPECT_FALSE(sliders[to]->isEnabled() || pickers[from]->isVisible());
         pane->setSliders(QString());
     }
-    CUserParams params;
-    const QByteArrayList lines = logged([&] {
-        pane->sldrPercColorFilter->setEnabled(true);
-        pane->applyGUIParams(params);
-    });
-    EXPECT_EQ(lines.last(), "TMP: params.mSliderParams.mColor_Touch_Enabled 1.");
 }
 
 TEST_F(FinalTouchPane, GoesOnFromTheProcessedImageAndLeadsBack) {
@@ -105,46 +98,6 @@ TEST_F(FinalTouchPane, GoesOnFromTheProcessedImageAndLeadsBack) {
                   ->child(3)
                   ->text(QAccessible::Name),
               QStringLiteral("All channels"));
-}
-
-// The bands of a set, each as its last position and the letter of its colour: "599g 899o 1000r ".
-std::string described(const QList<ZoneStop>& stops) {
-    const std::map<QRgb, char> letters = {{0xff00ff28, 'g'}, {0xffff7800, 'o'}, {0xffff2800, 'r'},
-                                          {0xff0000ff, 'b'}, {0xff0028ff, 'l'}, {0xffffaa17, 'p'}};
-    std::string text;
-    for (int i = 0; i + 1 < stops.size(); i += 2) {
-        EXPECT_EQ(stops[i].position, i == 0 ? 0 : stops[i - 1].position + 1);
-        EXPECT_EQ(stops[i].color, stops[i + 1].color);
-        text += std::to_string(int(stops[i + 1].position)) + letters.at(stops[i].color.rgb()) + ' ';
-    }
-    return text;
-}
-
-TEST(TrackZones, SetsHoldTheirBandsAndSlidersTheirSets) {
-    const char* const sets[] = {"599g 899o 1000r ",
-                                "199r 399o 887g 943o 1000r ",
-                                "1000l ",
-                                "1000b ",
-                                "199r 399o 687g 943o 1000r ",
-                                "694g 864o 1000r ",
-                                "749g 1000o ",
-                                "699g 1000o ",
-                                "299g 499o 1000r ",
-                                "349r 499o 1000g ",
-                                "1000b ",
-                                "199r 399o 587g 643o 1000r ",
-                                "199r 399p 687g 943p 1000r "};
-    for (int number = 1; number <= 13; ++number)
-        EXPECT_EQ(described(TrackZones::set(number)), sets[number - 1]) << number;
-    EXPECT_TRUE(TrackZones::set(0).isEmpty() && TrackZones::set(14).isEmpty());
-    Shown<CWgtPaneFinalTouchImpl> shown(Mode_FinalTouch);
-    const std::pair<const char*, int> expected[] = {
-        {"sldrPercMiddleRGB", 13}, {"sldrPercMiddleB", 5},      {"sldrPercBrightness", 5},
-        {"sldrPercContrast", 1},   {"sldrPercShadowsRGB", 1},   {"sldrPercColorFilter", 3},
-        {"sldrAbsShadowsR", 3},    {"sldrAbsHighlightsRGB", 3}, {"sldrAbsHighlightsG", 4},
-        {"sldrAbsContrast", 4},    {"sldrAbsBrightness", 4},    {"sldrAbsColorFilter", 4}};
-    for (const auto& [object, number] : expected)
-        EXPECT_EQ(blockOf(shown.pane, object)->zoneStops(), TrackZones::set(number)) << object;
 }
 
 } // namespace

@@ -3,7 +3,6 @@
 #include "Core/CThreadedCore.h"
 #include "Utility/CARGBPlane.h"
 #include "Utility/DebugBoxes.h"
-#include "Utility/Logger.h"
 #include "Utility/SettingFields.h"
 
 #include <QSignalSpy>
@@ -14,12 +13,7 @@
 
 namespace {
 
-QByteArrayList gLines;
 QStringList gBoxes;
-
-class Recorder : public ILogger {
-    void write(const QByteArray& line) override { gLines.append(line.trimmed()); }
-};
 
 int record(void*, const QString& title, const QString& text, int, int) {
     gBoxes.append(title + QLatin1Char('|') + text);
@@ -110,16 +104,6 @@ void expectLeadsOn(IWgtPane* pane, QAbstractButton* button, const char* coreClas
     button->click();
     ASSERT_EQ(changed.count(), 1);
     EXPECT_EQ(changed[0][0].value<EGUIMode>(), mode);
-}
-
-QByteArrayList logged(const std::function<void()>& action) {
-    gLines.clear();
-    Log::setThreshold(LogLevel::Debug);
-    Log::install(std::make_unique<Recorder>());
-    action();
-    Log::install(nullptr);
-    Log::setThreshold(LogLevel::Info);
-    return gLines;
 }
 
 QStringList boxes(const std::function<void()>& action) {

@@ -59,8 +59,5 @@ double snapping(const SliderDescription& slider, double position);
 /// completed.
 void expectLeadsOn(IWgtPane* pane, QAbstractButton* button, const char* coreClass, EGUIMode mode);
 
-/// The lines logged at any level while `action` runs, without their indentation.
-QByteArrayList logged(const std::function<void()>& action);
-
 /// "title|text" of every box shown while `action` runs.
 QStringList boxes(const std::function<void()>& action);

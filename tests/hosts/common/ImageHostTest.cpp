@@ -6,7 +6,6 @@
 #include <gtest/gtest.h>
 
 #include <cstdlib>
-#include <cstring>
 
 namespace {
 
@@ -101,25 +100,6 @@ TEST(ImageHost, FailsOnDemandAndAnswersForTheYoungest) {
         EXPECT_EQ(host.record().abortProc(), 1);
     }
     EXPECT_EQ(host.record().abortProc(), 0);
-}
-
-// Planes that are never written keep every bit: 16-bit K and transparency as well as the other channels.
-TEST(ImageHost, TouchesOnlyWhatIsWritten) {
-    for (const ColorModel model : {ColorModel::Cmyk, ColorModel::RgbAlpha, ColorModel::GreyAlpha}) {
-        const Photograph before = counting(model, 16, 5, 4);
-        ImageHost host(before);
-        host::FilterRecord& record = host.record();
-        record.outRect = record.filterRect;
-        record.outLoPlane = record.outHiPlane = 0;
-        ASSERT_EQ(record.advanceState(), 0);
-        for (int y = 0; y < 4; ++y)
-            std::memset(static_cast<std::uint8_t*>(record.outData) + y * record.outRowBytes, 0, 10);
-        record.outRect = {};
-        ASSERT_EQ(record.advanceState(), 0);
-        const auto channel = static_cast<std::size_t>(2 * samplesPerPixel(model));
-        for (std::size_t i = 0; i < before.samples.size(); ++i)
-            ASSERT_EQ(host.photograph().samples[i], i % channel < 2 ? 0 : before.samples[i]) << i;
-    }
 }
 
 } // namespace
