@@ -15,9 +15,11 @@ TEST(SliderTable, MiddlePositionShowsTheDocumentedNumbers) {
         {"sldrOrvela1", 50.5},     {"sldrOrvela3", 0.5},    {"sldrShadows_Perc", 127.5},
         {"sldrMiddle_Perc", 1},    {"sldrMoire", 5.05},     {"sldrFade", 50}};
     ASSERT_EQ(SliderTable::advanced().size(), 26U);
-    for (const SliderDescription& slider : SliderTable::advanced())
-        if (const auto found = expected.find(slider.object); found != expected.end())
+    for (const SliderDescription& slider : SliderTable::advanced()) {
+        if (const auto found = expected.find(slider.object); found != expected.end()) {
             EXPECT_NEAR(slider.scale->toShown(500), found->second, 1e-9) << slider.object;
+        }
+    }
 }
 
 void expectConsistent(const SliderDescription& slider) {
