@@ -12,6 +12,8 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <thread>
+
 namespace {
 
 using testing::ElementsAre;
@@ -89,16 +91,15 @@ TEST(CThreadedCore, StopFromAnotherThreadReleasesAWaitingRun) {
     CThreadedCore_Orvela core(in.get(), &out);
     core.setParams(CUserParamsPhotoshop(Mode_Advanced));
     std::atomic<bool> done = false;
-    std::unique_ptr<QThread> helper(QThread::create([&] {
+    std::thread helper([&] {
         while (!done) {
             core.stop();
             QThread::msleep(1);
         }
-    }));
-    helper->start();
+    });
     core.run(); // nobody handles its steps
     done = true;
-    helper->wait();
+    helper.join();
     EXPECT_TRUE(core.lastProcessingDone());
 }
 
