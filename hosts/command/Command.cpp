@@ -1,6 +1,6 @@
 #include "command/Command.h"
 
-#include "Utility/PresetFile.h"
+#include "Settings/PresetFile.h"
 #include "command/EnhanceCommand.h"
 #include "command/ModesCommand.h"
 #include "command/PresetsCommand.h"

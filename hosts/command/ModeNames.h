@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Utility/ModeTable.h"
+#include "Settings/ModeTable.h"
 
 #include <string>
 #include <string_view>

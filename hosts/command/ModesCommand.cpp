@@ -1,6 +1,6 @@
 #include "command/ModesCommand.h"
 
-#include "Utility/SliderTable.h"
+#include "Settings/SliderTable.h"
 #include "command/ModeNames.h"
 #include "command/TextValues.h"
 

@@ -1,8 +1,8 @@
 #include "command/PresetsCommand.h"
 
-#include "Presets/PresetConversion.h"
+#include "Settings/PresetConversion.h"
 #include "Utility/CGenericEx.h"
-#include "Utility/PresetFile.h"
+#include "Settings/PresetFile.h"
 #include "command/ModeNames.h"
 
 #include <QFileInfo>

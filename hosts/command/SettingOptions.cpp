@@ -1,7 +1,7 @@
 #include "command/SettingOptions.h"
 
-#include "Utility/SettingFields.h"
-#include "Utility/SliderTable.h"
+#include "Settings/SettingFields.h"
+#include "Settings/SliderTable.h"
 #include "command/ExitStatus.h"
 #include "command/ModeNames.h"
 #include "command/TextValues.h"

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Utility/PresetFile.h"
+#include "Settings/PresetFile.h"
 
 #include <map>
 #include <optional>

@@ -34,7 +34,7 @@ nlohmann::ordered_json statisticsOf(const CUserParams& params) {
     nlohmann::ordered_json statistics;
 #define ORVELA_STATISTIC_FIELD(type, name, value, listed) statistics[#name] = params.name;
 #define ORVELA_KEPT_FIELD(type, name, listed) statistics[#name] = params.name;
-#include "Utility/StatisticFields.inc"
+#include "Settings/StatisticFields.inc"
     return statistics;
 }
 

@@ -2,7 +2,7 @@
 
 #include "Core/PipelineTable.h"
 #include "Utility/CARGBPlane.h"
-#include "Utility/CUserParams.h"
+#include "Settings/CUserParams.h"
 
 #include <QElapsedTimer>
 #include <QObject>

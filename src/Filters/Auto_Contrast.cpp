@@ -1,6 +1,6 @@
 #include "Filters/Auto_Contrast.h"
 
-#include "Filters/PixelMath.h"
+#include "Filters/Kernels/PixelMath.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>

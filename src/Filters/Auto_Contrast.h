@@ -1,8 +1,8 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/RowMapping.h"
-#include "Filters/TonalStretch.h"
+#include "Filters/Kernels/RowMapping.h"
+#include "Filters/Curves/TonalStretch.h"
 
 /// The contrast step of the automatic-contrast mode: one black limit L and one white limit R, combined from
 /// the channel histograms, stretch all three channels. A hazy picture (R < 215 and L > 40) is stretched hard,

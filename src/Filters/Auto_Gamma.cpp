@@ -1,8 +1,8 @@
 #include "Filters/Auto_Gamma.h"
 
-#include "Filters/GammaCurve.h"
-#include "Filters/PictureConditions.h"
-#include "Filters/PixelMath.h"
+#include "Filters/Curves/GammaCurve.h"
+#include "Settings/Conditions.h"
+#include "Filters/Kernels/PixelMath.h"
 #include "Utility/Logger.h"
 
 #include <cmath>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/RowMapping.h"
+#include "Filters/Kernels/RowMapping.h"
 
 /// Gamma from the mean luma m of the picture (see GammaCurve): dark pictures are brightened a little, those
 /// of medium brightness pulled to the middle, bright ones left alone.

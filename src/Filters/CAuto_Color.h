@@ -1,8 +1,8 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/RowMapping.h"
-#include "Filters/TonalStretch.h"
+#include "Filters/Kernels/RowMapping.h"
+#include "Filters/Curves/TonalStretch.h"
 
 /// Automatic colour correction: each channel is stretched softly between limits of its own, which it reads
 /// off its histogram. mAuto_Color_Value / 1000 = S, 0 to 1, sets how far the limits follow the histogram and

@@ -1,6 +1,6 @@
 #include "Filters/CAuto_Contrast_I.h"
 
-#include "Filters/PixelMath.h"
+#include "Filters/Kernels/PixelMath.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>

@@ -1,8 +1,8 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/RowMapping.h"
-#include "Filters/TonalStretch.h"
+#include "Filters/Kernels/RowMapping.h"
+#include "Filters/Curves/TonalStretch.h"
 
 /// Brings the channel means back to what they were before the illumination iterations, keeping the hue where
 /// a channel saturates, and fades the result toward the unprocessed picture:

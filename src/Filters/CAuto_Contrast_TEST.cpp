@@ -1,9 +1,8 @@
 #include "Filters/CAuto_Contrast_TEST.h"
 
-#include "Filters/PictureConditions.h"
-#include "Filters/PixelMath.h"
-#include "Histograms/HistogramRecount.h"
-#include "Utility/LevelSwitches.h"
+#include "Settings/Conditions.h"
+#include "Filters/Kernels/PixelMath.h"
+#include "Filters/Kernels/HistogramRecount.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>

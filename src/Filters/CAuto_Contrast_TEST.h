@@ -1,8 +1,8 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/RowMapping.h"
-#include "Filters/TonalStretch.h"
+#include "Filters/Kernels/RowMapping.h"
+#include "Filters/Curves/TonalStretch.h"
 
 /// Stretches the picture between a common black limit L and white limit R; runs when the purely automatic
 /// situation does not hold and automatic colour is off. Measures its input anew, on every third row and

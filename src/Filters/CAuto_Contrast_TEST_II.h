@@ -1,8 +1,8 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/RowMapping.h"
-#include "Filters/TonalStretch.h"
+#include "Filters/Kernels/RowMapping.h"
+#include "Filters/Curves/TonalStretch.h"
 
 /// The stretch of the automatic modes, by limits that go only half way: from 0 to the first and from 255 to
 /// the last bin of each channel that counts. Measures its input anew, on every pixel.

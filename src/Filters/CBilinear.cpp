@@ -1,7 +1,7 @@
 #include "Filters/CBilinear.h"
 
-#include "Filters/BilateralKernel.h"
-#include "Filters/PixelMath.h"
+#include "Filters/Kernels/BilateralKernel.h"
+#include "Filters/Kernels/PixelMath.h"
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
 #include "Utility/RowScheduler.h"

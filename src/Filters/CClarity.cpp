@@ -1,6 +1,6 @@
 #include "Filters/CClarity.h"
 
-#include "Filters/PictureConditions.h"
+#include "Settings/Conditions.h"
 #include "Utility/Logger.h"
 
 #include <cmath>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/RowMapping.h"
+#include "Filters/Kernels/RowMapping.h"
 
 /// Clarity: brightens each channel by its distance d from the picture's channel mean, most at a moderate
 /// distance, least near white.

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/RowMapping.h"
+#include "Filters/Kernels/RowMapping.h"
 
 /// Colour filter: tints every pixel toward a chosen colour T, then restores the pixel's mean brightness.
 ///

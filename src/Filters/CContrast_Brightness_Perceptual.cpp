@@ -1,7 +1,7 @@
 #include "Filters/CContrast_Brightness_Perceptual.h"
 
-#include "Filters/PivotCurve.h"
-#include "Filters/PixelMath.h"
+#include "Filters/Curves/PivotCurve.h"
+#include "Filters/Kernels/PixelMath.h"
 #include "Utility/Logger.h"
 
 #include <cmath>

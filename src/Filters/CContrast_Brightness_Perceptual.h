@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/SumValueTable.h"
+#include "Filters/Kernels/SumValueTable.h"
 
 /// What CContrast_Brightness_Perceptual does to a pixel: adds the brightness, then moves each value away from
 /// the mean of the picture (see PivotCurve), by the less the further the pixel's own mean lies from it:

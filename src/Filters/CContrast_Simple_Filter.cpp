@@ -1,6 +1,6 @@
 #include "Filters/CContrast_Simple_Filter.h"
 
-#include "Filters/PivotCurve.h"
+#include "Filters/Curves/PivotCurve.h"
 #include "Utility/Logger.h"
 
 #include <cmath>

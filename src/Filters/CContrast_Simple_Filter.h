@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/RowMapping.h"
+#include "Filters/Kernels/RowMapping.h"
 
 /// Contrast and brightness by slider: the brightness -255 to 255 is added, then the value moves away from 127
 /// by contrast -100 to 100 (see PivotCurve). Position 500 of either slider is neutral.

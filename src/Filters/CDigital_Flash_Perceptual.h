@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/SumValueTable.h"
+#include "Filters/Kernels/SumValueTable.h"
 
 /// The light of CDigital_Flash_Perceptual: each value moves away from the mean of the picture (see
 /// PivotCurve), by a share that falls with the distance d = mean - (R + G + B) / 3:

@@ -1,6 +1,6 @@
 #include "Filters/CGamma_Perceptual.h"
 
-#include "Filters/GammaCurve.h"
+#include "Filters/Curves/GammaCurve.h"
 #include "Utility/Logger.h"
 
 #include <utility>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/RowMapping.h"
+#include "Filters/Kernels/RowMapping.h"
 
 /// Gamma within the range that the analysis of the midtones found fit for the picture (see GammaCurve).
 ///

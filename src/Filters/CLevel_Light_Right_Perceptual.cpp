@@ -1,6 +1,6 @@
 #include "Filters/CLevel_Light_Right_Perceptual.h"
 
-#include "Utility/LevelSwitches.h"
+#include "Settings/Conditions.h"
 #include "Utility/Logger.h"
 
 #include <utility>

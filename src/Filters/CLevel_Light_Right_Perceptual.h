@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/LevelMath.h"
+#include "Filters/Curves/LevelMath.h"
 
 #include <optional>
 

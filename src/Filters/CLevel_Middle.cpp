@@ -1,7 +1,7 @@
 #include "Filters/CLevel_Middle.h"
 
-#include "Filters/GammaCurve.h"
-#include "Utility/LevelSwitches.h"
+#include "Filters/Curves/GammaCurve.h"
+#include "Settings/Conditions.h"
 #include "Utility/Logger.h"
 
 #include <utility>

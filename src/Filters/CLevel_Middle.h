@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/LevelMath.h"
+#include "Filters/Curves/LevelMath.h"
 
 /// Absolute midtones: multiplies by the ratio by which a gamma would move the mean luma.
 ///

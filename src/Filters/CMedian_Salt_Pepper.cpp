@@ -1,7 +1,7 @@
 #include "Filters/CMedian_Salt_Pepper.h"
 
-#include "Filters/PixelMath.h"
-#include "Filters/ScaledTile.h"
+#include "Filters/Kernels/PixelMath.h"
+#include "Filters/Kernels/ScaledTile.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/MoireKernel.h"
+#include "Filters/Kernels/MoireKernel.h"
 
 #include <optional>
 

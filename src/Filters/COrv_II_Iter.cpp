@@ -1,7 +1,7 @@
 #include "Filters/COrv_II_Iter.h"
 
-#include "Filters/IterationGuard.h"
-#include "Filters/PixelMath.h"
+#include "Settings/Conditions.h"
+#include "Filters/Kernels/PixelMath.h"
 #include "Utility/Logger.h"
 
 COrv_II_Iter::COrv_II_Iter(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)

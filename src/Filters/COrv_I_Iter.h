@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/IlluminationKernel.h"
+#include "Filters/Kernels/IlluminationKernel.h"
 
 #include <optional>
 

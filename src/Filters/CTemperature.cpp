@@ -1,6 +1,6 @@
 #include "Filters/CTemperature.h"
 
-#include "Filters/RowMapping.h"
+#include "Filters/Kernels/RowMapping.h"
 #include "Utility/Logger.h"
 
 #include <utility>

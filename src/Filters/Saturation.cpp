@@ -1,7 +1,7 @@
 #include "Filters/Saturation.h"
 
-#include "Filters/PictureConditions.h"
-#include "Filters/ScaledTile.h"
+#include "Settings/Conditions.h"
+#include "Filters/Kernels/ScaledTile.h"
 #include "Utility/Logger.h"
 #include "Utility/RowScheduler.h"
 

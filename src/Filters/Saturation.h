@@ -1,8 +1,8 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/RowMapping.h"
-#include "Filters/SaturationKernel.h"
+#include "Filters/Kernels/RowMapping.h"
+#include "Filters/Kernels/SaturationKernel.h"
 
 #include <optional>
 

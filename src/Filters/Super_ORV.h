@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/IFilter.h"
-#include "Filters/SmoothingKernel.h"
+#include "Filters/Kernels/SmoothingKernel.h"
 
 #include <optional>
 

@@ -30,7 +30,7 @@ void CHistogram0::ApplyRow(std::uint32_t row) {
 void CHistogram0::countGreys(std::uint32_t row, RowCounts& counts) const {
     const ConstRow in = std::as_const(*mInPlane).row(static_cast<int>(row));
     for (int x = 0; x < mInPlane->width() - mHistoStep; x += mHistoStep) {
-        const std::uint32_t luma = lumaOf(in[0][x], in[1][x], in[2][x]);
+        const std::uint32_t luma = PixelMath::lumaOf(in[0][x], in[1][x], in[2][x]);
         if (greySpread(in[0][x], in[1][x], in[2][x]) >= 30)
             continue;
         counts.white += luma > 230;

@@ -16,7 +16,7 @@ void CHistogram_Luma_Final::ApplyRow(std::uint32_t row) {
     RowCounts counts;
     const ConstRow in = std::as_const(*mInPlane).row(static_cast<int>(row));
     for (int x = 0; x < mInPlane->width(); ++x)
-        counts.add(in[0][x], in[1][x], in[2][x], lumaOf(in[0][x], in[1][x], in[2][x]));
+        counts.add(in[0][x], in[1][x], in[2][x], PixelMath::lumaOf(in[0][x], in[1][x], in[2][x]));
     merge(counts);
 }
 

@@ -78,7 +78,7 @@ IHistogram::RowCounts IHistogram::countSampledRow(std::uint32_t row) const {
     RowCounts counts;
     const ConstRow in = std::as_const(*mInPlane).row(static_cast<int>(row));
     for (int x = 0; x < mInPlane->width() - mHistoStep; x += mHistoStep)
-        counts.add(in[0][x], in[1][x], in[2][x], lumaOf(in[0][x], in[1][x], in[2][x]));
+        counts.add(in[0][x], in[1][x], in[2][x], PixelMath::lumaOf(in[0][x], in[1][x], in[2][x]));
     return counts;
 }
 

@@ -81,11 +81,6 @@ private:
     std::mutex mMergeMutex;
 };
 
-/// Mean of the three channels, truncated: the brightness that all measurements use.
-inline std::uint32_t lumaOf(std::uint32_t r, std::uint32_t g, std::uint32_t b) {
-    return (r + g + b) / 3;
-}
-
 /// The sum of the bins first to last, both included.
 double sumOf(const Histogram& bins, std::size_t first, std::size_t last);
 

@@ -1,7 +1,7 @@
 #include "SmartAnalyzers/CSmartAnalyzer_Perceptual_Level_Middle.h"
 
 #include "SmartAnalyzers/ToneMass.h"
-#include "Utility/LevelSwitches.h"
+#include "Settings/Conditions.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>

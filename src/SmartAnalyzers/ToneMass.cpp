@@ -1,6 +1,6 @@
 #include "SmartAnalyzers/ToneMass.h"
 
-#include "Histograms/HistogramRecount.h"
+#include "Filters/Kernels/HistogramRecount.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Utility/CARGBPlane.h"
-#include "Utility/CUserParams.h"
+#include "Settings/CUserParams.h"
 
 #include <array>
 

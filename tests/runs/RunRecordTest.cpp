@@ -4,7 +4,7 @@
 #include "Core/CThreadedCore_Orvela.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
 #include "PluginEntry/CARGBPlanePhotoshop.h"
-#include "Utility/ModeTable.h"
+#include "Settings/ModeTable.h"
 #include "common/ImageHost.h"
 #include "common/PhotographReader.h"
 #include "support/TestPlanes.h"

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Utility/CUserParams.h"
+#include "Settings/CUserParams.h"
 
 #include <QStringList>
 
@@ -20,10 +20,10 @@ inline void setField(CUserParams& params, const QString& name, double value) {
     };
     take("Final_Touch_Mode_Enabled", params.Final_Touch_Mode_Enabled);
 #define ORVELA_SLIDER_FIELD(type, field, listed) take(#field, params.mSliderParams.field);
-#include "Utility/SliderFields.inc"
+#include "Settings/SliderFields.inc"
 #define ORVELA_STATISTIC_FIELD(type, field, start, listed) take(#field, params.field);
 #define ORVELA_KEPT_FIELD(type, field, listed) take(#field, params.field);
-#include "Utility/StatisticFields.inc"
+#include "Settings/StatisticFields.inc"
     if (!known)
         throw std::invalid_argument(name.toStdString());
 }

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Utility/CUserParams.h"
+#include "Settings/CUserParams.h"
 
 #include <map>
 #include <string>
@@ -10,7 +10,7 @@ inline std::map<std::string, double> statistics(const CUserParams& params) {
     std::map<std::string, double> fields;
 #define ORVELA_STATISTIC_FIELD(type, name, value, listed) fields[#name] = static_cast<double>(params.name);
 #define ORVELA_KEPT_FIELD(type, name, listed) fields[#name] = static_cast<double>(params.name);
-#include "Utility/StatisticFields.inc"
+#include "Settings/StatisticFields.inc"
     return fields;
 }
 
@@ -18,5 +18,5 @@ inline std::map<std::string, double> statistics(const CUserParams& params) {
 inline void markStatistics(CUserParams& params) {
 #define ORVELA_STATISTIC_FIELD(type, name, value, listed) params.name = static_cast<type>(-7);
 #define ORVELA_KEPT_FIELD(type, name, listed) params.name = static_cast<type>(-7);
-#include "Utility/StatisticFields.inc"
+#include "Settings/StatisticFields.inc"
 }

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Core/PipelineTable.h"
-#include "Utility/CUserParams.h"
+#include "Settings/CUserParams.h"
 #include "support/TestPlanes.h"
 
 #include <gtest/gtest.h>

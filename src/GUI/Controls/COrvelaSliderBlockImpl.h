@@ -1,7 +1,7 @@
 #pragma once
 
 #include "GUI/Controls/ZoneStop.h"
-#include "Utility/SliderScale.h"
+#include "Settings/SliderScale.h"
 #include "ui_COrvelaSliderBlock.h"
 
 #include <QWidget>

@@ -1,7 +1,7 @@
 #include "GUI/Panes/CWgtPaneAdvancedImpl.h"
 
 #include "Core/CThreadedCore_Orvela.h"
-#include "GUI/Presets/FactoryPresets.h"
+#include "Settings/FactoryPresets.h"
 #include "Utility/Logger.h"
 
 CWgtPaneAdvancedImpl::CWgtPaneAdvancedImpl(QWidget* owner, EGUIMode mode) : IWgtPane(owner, mode) {

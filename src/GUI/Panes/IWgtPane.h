@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Utility/SliderTable.h"
+#include "Settings/SliderTable.h"
 
 #include <QWidget>
 

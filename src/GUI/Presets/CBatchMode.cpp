@@ -1,7 +1,7 @@
 #include "GUI/Presets/CBatchMode.h"
 
 #include "Platform/Keyboard.h"
-#include "Presets/PresetTree.h"
+#include "Settings/PresetTree.h"
 #include "Utility/DebugBoxes.h"
 #include "Utility/Logger.h"
 

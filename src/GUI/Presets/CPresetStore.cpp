@@ -3,7 +3,7 @@
 #include "GUI/Controls/CColorPicker.h"
 #include "GUI/Controls/COrvelaSliderBlockImpl.h"
 #include "GUI/Panes/CWgtPaneAdvancedImpl.h"
-#include "Presets/PresetTree.h"
+#include "Settings/PresetTree.h"
 #include "Utility/DebugBoxes.h"
 #include "Utility/Logger.h"
 

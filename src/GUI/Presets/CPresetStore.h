@@ -1,6 +1,6 @@
 #pragma once
 
-#include "GUI/Presets/FactoryPresets.h"
+#include "Settings/FactoryPresets.h"
 
 class QWidget;
 

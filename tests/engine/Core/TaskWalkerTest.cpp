@@ -4,7 +4,7 @@
 #include "Core/CThreadedCore_Orvela.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
 #include "Utility/CGenericEx.h"
-#include "Utility/ModeTable.h"
+#include "Settings/ModeTable.h"
 #include "Utility/RowScheduler.h"
 #include "support/StatisticMap.h"
 #include "support/TaskSettings.h"

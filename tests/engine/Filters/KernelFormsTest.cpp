@@ -1,10 +1,10 @@
 // The fast form of every kernel gives the bytes of its plain form.
 
-#include "Filters/BilateralKernel.h"
-#include "Filters/IlluminationKernel.h"
-#include "Filters/MoireKernel.h"
-#include "Filters/SaturationKernel.h"
-#include "Filters/SmoothingKernel.h"
+#include "Filters/Kernels/BilateralKernel.h"
+#include "Filters/Kernels/IlluminationKernel.h"
+#include "Filters/Kernels/MoireKernel.h"
+#include "Filters/Kernels/SaturationKernel.h"
+#include "Filters/Kernels/SmoothingKernel.h"
 #include "support/TestPlanes.h"
 
 #include <gtest/gtest.h>

@@ -1,4 +1,4 @@
-#include "Filters/LevelMath.h"
+#include "Filters/Curves/LevelMath.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
 #include "support/LogCapture.h"
 #include "support/ParamsText.h"

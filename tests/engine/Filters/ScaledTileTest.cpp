@@ -1,6 +1,6 @@
-#include "Filters/ScaledTile.h"
+#include "Filters/Kernels/ScaledTile.h"
 
-#include "Filters/PixelMath.h"
+#include "Filters/Kernels/PixelMath.h"
 #include "support/TestPlanes.h"
 
 #include <gtest/gtest.h>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Histograms/HistogramRecount.h"
+#include "Filters/Kernels/HistogramRecount.h"
 #include "Utility/CGenericEx.h"
 #include "support/LogCapture.h"
 #include "support/TestPlanes.h"

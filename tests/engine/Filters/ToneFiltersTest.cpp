@@ -1,6 +1,6 @@
 #include "Filters/CContrast_Brightness_Perceptual.h"
 #include "Filters/CDigital_Flash_Perceptual.h"
-#include "Filters/GammaCurve.h"
+#include "Filters/Curves/GammaCurve.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
 #include "Utility/CGenericEx.h"
 #include "support/LogCapture.h"

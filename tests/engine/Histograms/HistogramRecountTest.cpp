@@ -1,4 +1,4 @@
-#include "Histograms/HistogramRecount.h"
+#include "Filters/Kernels/HistogramRecount.h"
 
 #include "Histograms/IHistogram.h"
 #include "support/StatisticMap.h"

@@ -1,6 +1,6 @@
-#include "Presets/PresetConversion.h"
+#include "Settings/PresetConversion.h"
 #include "Utility/CGenericEx.h"
-#include "Utility/ModeTable.h"
+#include "Settings/ModeTable.h"
 
 #include <QElapsedTimer>
 #include <QPoint>

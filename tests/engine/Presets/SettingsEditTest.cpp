@@ -1,4 +1,4 @@
-#include "Presets/SettingsEdit.h"
+#include "Settings/SettingsEdit.h"
 
 #include "Utility/CGenericEx.h"
 

@@ -1,4 +1,4 @@
-#include "Histograms/HistogramRecount.h"
+#include "Filters/Kernels/HistogramRecount.h"
 #include "SmartAnalyzers/ToneMass.h"
 #include "support/ParamsText.h"
 #include "support/StatisticMap.h"

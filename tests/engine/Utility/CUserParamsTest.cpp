@@ -1,7 +1,7 @@
-#include "Utility/CUserParams.h"
+#include "Settings/CUserParams.h"
 
 #include "Utility/DebugBoxes.h"
-#include "Utility/ModeTable.h"
+#include "Settings/ModeTable.h"
 #include "support/LogCapture.h"
 #include "support/ParamsText.h"
 

@@ -1,4 +1,4 @@
-#include "Utility/PresetFile.h"
+#include "Settings/PresetFile.h"
 
 #include <QDir>
 #include <QFile>

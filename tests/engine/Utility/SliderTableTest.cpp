@@ -1,4 +1,4 @@
-#include "Utility/SliderTable.h"
+#include "Settings/SliderTable.h"
 
 #include <gtest/gtest.h>
 

@@ -3,7 +3,7 @@
 #include "Core/CThreadedCore.h"
 #include "Utility/CARGBPlane.h"
 #include "Utility/DebugBoxes.h"
-#include "Utility/SettingFields.h"
+#include "Settings/SettingFields.h"
 
 #include <QSignalSpy>
 

@@ -4,9 +4,9 @@
 #include "GUI/Presets/CBatchMode.h"
 #include "GUI/Presets/CPresetStore.h"
 #include "Platform/Keyboard.h"
-#include "Presets/PresetConversion.h"
+#include "Settings/PresetConversion.h"
 #include "Utility/CGenericEx.h"
-#include "Utility/ModeTable.h"
+#include "Settings/ModeTable.h"
 #include "support/LogCapture.h"
 
 #include <QApplication>

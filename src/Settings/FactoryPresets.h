@@ -1,0 +1,26 @@
+#pragma once
+
+#include "Settings/EGUIMode.h"
+
+#include <QStringList>
+
+/// The presets that come with the program: one for each automatic mode, under the mode's identifier.
+namespace FactoryPresets {
+
+/// True for the automatic modes, 0 to 11.
+bool isFactoryMode(EGUIMode mode);
+
+/// The names in the order in which the presets are written.
+QStringList names();
+
+/// True for exactly one of the twelve names.
+bool isFactoryPresetName(const QString& name);
+
+/// The mode of the factory preset of exactly that name. Any other name gives a message box and Portrait.
+EGUIMode factoryPresetMode(const QString& name);
+
+/// The name of the factory preset of an automatic mode. Any other mode gives a message box and a text that is
+/// no preset's name.
+QString factoryPresetName(EGUIMode mode);
+
+} // namespace FactoryPresets

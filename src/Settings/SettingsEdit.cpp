@@ -1,0 +1,116 @@
+#include "Settings/SettingsEdit.h"
+
+#include "Utility/CGenericEx.h"
+#include "Utility/Logger.h"
+
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+#include <QSettings>
+#include <QTemporaryFile>
+
+#include <algorithm>
+
+namespace {
+
+using Changes = std::vector<SettingsEdit::Change>;
+
+const QString kUnwritten = QStringLiteral("The settings could not be written to %1.");
+
+[[noreturn]] void fail(const QString& text, const QString& store, int line) {
+    throw CGenericEx(text.arg(store), "SettingsEdit.cpp", line);
+}
+
+// Whether the store's parser would keep every line. It drops what it does not understand.
+bool isSettingsText(const QByteArray& text) {
+    if (text.contains('\0'))
+        return false;
+    bool continued = false;
+    for (const QByteArray& each : text.split('\n')) {
+        const QByteArray line = each.trimmed();
+        const bool isSection = line.startsWith('[') && line.endsWith(']');
+        if (!continued && !line.isEmpty() && !isSection && line.indexOf('=') < 1)
+            return false;
+        continued = line.endsWith('\\');
+    }
+    return true;
+}
+
+void keepForeignFile(const QString& path) {
+    QFile file(path);
+    if (!QFileInfo(path).isFile() || !file.open(QIODevice::ReadOnly) || isSettingsText(file.readAll()))
+        return;
+    const QString first = path + QStringLiteral(".kept");
+    QString copy = first;
+    for (int number = 2; QFileInfo::exists(copy); ++number)
+        copy = first + QString::number(number);
+    if (!QFile::copy(path, copy))
+        fail(QStringLiteral("The settings file %1 holds something else, and no copy of it could be made."),
+             path, __LINE__);
+    Log::log(LogLevel::Warning, "The settings file held something else; it is kept as %s.",
+             copy.toUtf8().constData());
+}
+
+// At least the bytes that the changes add to the file, every character escaped.
+qint64 sizeOf(const Changes& changes) {
+    qint64 size = 0;
+    for (const auto& [key, value] : changes)
+        size += 4 * (key.toUtf8().size() + value.value_or(QVariant()).toByteArray().size()) + 64;
+    return size;
+}
+
+// The store takes a short write for a whole one and would put a cut file in the place of the old one: make
+// sure beforehand that there is room for both.
+void checkRoom(const QString& path, const Changes& changes) {
+    if (path.startsWith(QLatin1String("\\HKEY_")))
+        return; // a registry
+    constexpr qint64 kLockFile = 4096;
+    const QFileInfo file(path);
+    const QByteArray bytes(file.size() + sizeOf(changes) + kLockFile, '\0');
+    QTemporaryFile probe(file.path() + QStringLiteral("/.room-XXXXXX"));
+    if (!QDir().mkpath(file.path()) || !probe.open() || probe.write(bytes) != bytes.size() ||
+        !probe.flush() || QFileInfo(probe.fileName()).size() != bytes.size())
+        fail(kUnwritten, path, __LINE__);
+}
+
+// What undoes the changes.
+Changes valuesBefore(const QSettings& settings, const Changes& changes) {
+    const QStringList keys = settings.allKeys();
+    Changes before;
+    for (const auto& [key, value] : changes) {
+        if (value) {
+            before.push_back(
+                {key, settings.contains(key) ? std::optional(settings.value(key)) : std::nullopt});
+            continue;
+        }
+        const QString below = key + QLatin1Char('/');
+        for (const QString& each : keys)
+            if (each == key || each.startsWith(below))
+                before.push_back({each, settings.value(each)});
+    }
+    return before;
+}
+
+void apply(QSettings& settings, const Changes& changes) {
+    for (const auto& [key, value] : changes)
+        value ? settings.setValue(key, *value) : settings.remove(key);
+}
+
+} // namespace
+
+void SettingsEdit::commit() const {
+    // Reading everything once has every complaint about the file made to this object, so that the status of
+    // the other tells of the writing alone.
+    const QSettings reader;
+    keepForeignFile(reader.fileName());
+    checkRoom(reader.fileName(), mChanges);
+    const Changes before = valuesBefore(reader, mChanges);
+    QSettings writer;
+    apply(writer, mChanges);
+    writer.sync();
+    if (writer.status() == QSettings::NoError)
+        return;
+    // The process remembers unwritten values and would show them, and write them at the next occasion.
+    apply(writer, before);
+    fail(kUnwritten, reader.fileName(), __LINE__);
+}
