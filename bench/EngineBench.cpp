@@ -15,6 +15,8 @@
 #include <cmath>
 #include <cstring>
 
+using namespace orvela;
+
 namespace {
 
 struct Size {

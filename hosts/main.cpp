@@ -1,5 +1,5 @@
 #include "command/Command.h"
 
 int main(int argc, char** argv) {
-    return runCommand(argc, argv);
+    return orvela::runCommand(argc, argv);
 }

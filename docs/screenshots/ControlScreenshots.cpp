@@ -13,6 +13,8 @@
 #include <QLabel>
 #include <QToolButton>
 
+using namespace orvela;
+
 namespace {
 
 using Widget = std::unique_ptr<QWidget>;

@@ -5,6 +5,8 @@
 #include "GUI/Panes/CWgtPaneGenericImpl.h"
 #include "Shots.h"
 
+using namespace orvela;
+
 namespace {
 
 // The window of a pane, as far as the pane sees it.

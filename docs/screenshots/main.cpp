@@ -10,6 +10,8 @@
 
 #include <cstdio>
 
+using namespace orvela;
+
 namespace {
 
 QPalette darkPalette() {

@@ -10,6 +10,8 @@
 #include <CLI/CLI.hpp>
 #include <iostream>
 
+namespace orvela {
+
 namespace {
 
 // A subcommand parses into an object of its own and leaves here what it is to do.
@@ -76,3 +78,5 @@ int runCommand(int argc, char** argv) {
     const ExitStatus status = perform(action);
     return signals.received() ? kSignalBase + signals.received() : static_cast<int>(status);
 }
+
+} // namespace orvela

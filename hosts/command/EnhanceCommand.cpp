@@ -13,6 +13,8 @@
 #include <iostream>
 #include <new>
 
+namespace orvela {
+
 namespace fs = std::filesystem;
 
 namespace {
@@ -182,3 +184,5 @@ ExitStatus enhancePhotographs(const EnhanceOptions& options, StopSignals& signal
     // A photograph that failed says more than an argument that matched nothing.
     return worst == ExitStatus::Done ? unmatched : worst;
 }
+
+} // namespace orvela

@@ -14,6 +14,8 @@ namespace CLI {
 class App;
 }
 
+namespace orvela {
+
 /// The arguments of `orvela enhance`.
 struct EnhanceOptions {
     std::vector<std::string> photographs; ///< files, folders and patterns
@@ -33,3 +35,5 @@ struct EnhanceOptions {
 /// Enhances the photographs one after the other; a failed one does not keep the others from being done.
 /// @throws UsageError and PresetError before any work has started
 ExitStatus enhancePhotographs(const EnhanceOptions& options, StopSignals& signals);
+
+} // namespace orvela

@@ -3,6 +3,8 @@
 
 #include <CLI/CLI.hpp>
 
+namespace orvela {
+
 namespace {
 
 constexpr char kSettings[] = "Settings";
@@ -89,3 +91,5 @@ void EnhanceOptions::declare(CLI::App& app) {
         "Exit status: 0 done, 1 a photograph failed, 2 wrong usage, 3 nothing matched, 4 a target that\n"
         "cannot be written or no memory, 128+n ended by signal n.");
 }
+
+} // namespace orvela

@@ -11,6 +11,8 @@
 #include <algorithm>
 #include <exception>
 
+namespace orvela {
+
 namespace {
 
 // The planes of one photograph and what watches the runs over them.
@@ -113,3 +115,5 @@ std::optional<Photograph> enhance(Photograph photograph, const RunSettings& sett
         throw EngineFailure(failure.message().toStdString());
     }
 }
+
+} // namespace orvela

@@ -8,6 +8,8 @@
 #include <filesystem>
 #include <optional>
 
+namespace orvela {
+
 /// The engine has given up a photograph, for want of memory.
 class EngineFailure : public std::runtime_error {
 public:
@@ -26,3 +28,5 @@ struct TraceOptions {
 std::optional<Photograph> enhance(Photograph photograph, const RunSettings& settings,
                                   const std::optional<TraceOptions>& trace, StopSignals& signals,
                                   ProgressLine& progress);
+
+} // namespace orvela

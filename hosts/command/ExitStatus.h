@@ -2,6 +2,8 @@
 
 #include <stdexcept>
 
+namespace orvela {
+
 /// What the program tells its caller.
 enum class ExitStatus : int {
     Done = 0,
@@ -19,3 +21,5 @@ class UsageError : public std::runtime_error {
 public:
     using std::runtime_error::runtime_error;
 };
+
+} // namespace orvela

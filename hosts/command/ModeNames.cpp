@@ -4,6 +4,8 @@
 #include <cctype>
 #include <numeric>
 
+namespace orvela {
+
 namespace {
 
 // Fewest insertions, deletions and replacements that turn one text into the other.
@@ -77,3 +79,5 @@ std::vector<std::string> nearest(std::string_view name) {
 }
 
 } // namespace ModeNames
+
+} // namespace orvela

@@ -6,6 +6,8 @@
 #include <string_view>
 #include <vector>
 
+namespace orvela {
+
 /// The modes as the command line names them.
 namespace ModeNames {
 
@@ -26,3 +28,5 @@ std::vector<std::string> nearest(std::string_view name);
 std::string plain(std::string_view name);
 
 } // namespace ModeNames
+
+} // namespace orvela

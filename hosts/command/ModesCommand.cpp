@@ -9,6 +9,8 @@
 #include <iostream>
 #include <nlohmann/json.hpp>
 
+namespace orvela {
+
 namespace {
 
 // How a slider is set on the command line.
@@ -89,3 +91,5 @@ ExitStatus listModes(bool asJson) {
     std::cout.flush();
     return ExitStatus::Done;
 }
+
+} // namespace orvela

@@ -1,8 +1,8 @@
 #include "command/PresetsCommand.h"
 
 #include "Settings/PresetConversion.h"
-#include "Utility/CGenericEx.h"
 #include "Settings/PresetFile.h"
+#include "Utility/CGenericEx.h"
 #include "command/ModeNames.h"
 
 #include <QFileInfo>
@@ -10,6 +10,8 @@
 #include <CLI/CLI.hpp>
 #include <algorithm>
 #include <iostream>
+
+namespace orvela {
 
 namespace {
 
@@ -156,3 +158,5 @@ ExitStatus removePreset(const PresetsOptions& options) {
     PresetTree::remove(edit, mode, name);
     return commit(edit);
 }
+
+} // namespace orvela

@@ -9,6 +9,8 @@ namespace CLI {
 class App;
 }
 
+namespace orvela {
+
 /// The arguments of `orvela presets`: the presets that the windows keep in the settings store, as files.
 struct PresetsOptions {
     std::string mode = "Advanced";
@@ -35,3 +37,5 @@ ExitStatus importPreset(const PresetsOptions& options);
 /// Removes a stored preset that did not come with the program.
 /// @throws UsageError
 ExitStatus removePreset(const PresetsOptions& options);
+
+} // namespace orvela

@@ -6,6 +6,8 @@
 #include <algorithm>
 #include <cstdio>
 
+namespace orvela {
+
 namespace {
 
 constexpr qint64 kShowMilliseconds = 50;    // a faster line only flickers
@@ -79,3 +81,5 @@ void ProgressLine::show() {
     mShown = true;
     mSinceShown.start();
 }
+
+} // namespace orvela

@@ -3,6 +3,8 @@
 #include <QElapsedTimer>
 #include <QString>
 
+namespace orvela {
+
 /// The line on a terminal that tells what is being done: photograph n of m, its name, the step, the
 /// percentage of the photograph and the time left for all. Writes nothing when standard error is no terminal.
 class ProgressLine {
@@ -41,3 +43,5 @@ private:
     QElapsedTimer mSinceStart;
     QElapsedTimer mSinceShown;
 };
+
+} // namespace orvela

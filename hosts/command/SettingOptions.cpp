@@ -9,6 +9,8 @@
 #include <algorithm>
 #include <cstring>
 
+namespace orvela {
+
 namespace {
 
 using TextValues::joined;
@@ -173,3 +175,5 @@ RunSettings settle(const SettingOptions& options) {
     run.finalTouchParams.mSliderParams = SettingFields::onlyFinalTouch(sliders, true);
     return run;
 }
+
+} // namespace orvela

@@ -1,11 +1,14 @@
 #pragma once
 
+#include "Settings/CUserParams.h"
 #include "Settings/PresetFile.h"
 
 #include <map>
 #include <optional>
 #include <string>
 #include <vector>
+
+namespace orvela {
 
 /// The settings of a run as they were given on the command line. Numbers for sliders are shown numbers except
 /// where positions are named.
@@ -36,3 +39,5 @@ std::vector<std::string> labelsOfThreeSliders();
 /// @throws UsageError for an unknown name or a value out of range, with what is allowed
 /// @throws PresetError
 RunSettings settle(const SettingOptions& options);
+
+} // namespace orvela

@@ -8,6 +8,8 @@
 #include <algorithm>
 #include <set>
 
+namespace orvela {
+
 namespace fs = std::filesystem;
 
 namespace {
@@ -57,3 +59,5 @@ Sources findSources(const std::vector<std::string>& arguments) {
     }
     return sources;
 }
+
+} // namespace orvela

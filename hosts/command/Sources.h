@@ -4,6 +4,8 @@
 #include <string>
 #include <vector>
 
+namespace orvela {
+
 /// The photographs that the arguments of a command stand for.
 struct Sources {
     std::vector<std::filesystem::path> photographs; ///< each file once, in the order of the arguments
@@ -13,3 +15,5 @@ struct Sources {
 /// An argument is a file (existing or not), a folder (the photographs in it, by name; results of earlier
 /// runs left out) or a shell pattern that no file matches literally.
 Sources findSources(const std::vector<std::string>& arguments);
+
+} // namespace orvela

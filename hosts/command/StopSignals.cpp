@@ -6,6 +6,8 @@
 
 #include <cstdlib>
 
+namespace orvela {
+
 namespace {
 
 constexpr int kStopSignals[] = {SIGINT, SIGTERM};
@@ -65,3 +67,5 @@ void StopSignals::take(int signal) {
     if (mStop)
         mStop();
 }
+
+} // namespace orvela

@@ -6,6 +6,8 @@
 #include <mutex>
 #include <thread>
 
+namespace orvela {
+
 /// Turns the signals that ask a program to end into a flag and a call, on a thread of its own, so that the
 /// work can stop in good order. Made first in the program: threads started before it would still die of the
 /// signals. SIGINT and SIGTERM always count, SIGHUP unless it was ignored when the program started.
@@ -57,3 +59,5 @@ public:
 private:
     StopSignals& mSignals;
 };
+
+} // namespace orvela

@@ -7,6 +7,8 @@
 #include <fstream>
 #include <map>
 
+namespace orvela {
+
 namespace fs = std::filesystem;
 
 namespace {
@@ -77,3 +79,5 @@ bool isSameFile(const fs::path& a, const fs::path& b) {
     std::error_code error;
     return fs::equivalent(a, b, error) || realPath(a) == realPath(b);
 }
+
+} // namespace orvela

@@ -4,6 +4,8 @@
 #include <optional>
 #include <vector>
 
+namespace orvela {
+
 /// Where the results go.
 struct TargetOptions {
     std::optional<std::filesystem::path> file;   ///< of the one result
@@ -26,3 +28,5 @@ bool isEarlierResult(const std::filesystem::path& file);
 
 /// True when both name the same existing file, or would.
 bool isSameFile(const std::filesystem::path& a, const std::filesystem::path& b);
+
+} // namespace orvela

@@ -5,6 +5,8 @@
 #include <charconv>
 #include <sstream>
 
+namespace orvela {
+
 namespace TextValues {
 
 namespace {
@@ -71,3 +73,5 @@ std::string shortest(double value) {
 }
 
 } // namespace TextValues
+
+} // namespace orvela

@@ -4,6 +4,8 @@
 #include <utility>
 #include <vector>
 
+namespace orvela {
+
 /// Reads the parts of option values. `what` names the option in the error.
 namespace TextValues {
 
@@ -26,3 +28,5 @@ std::string joined(const std::vector<std::string>& parts, const std::string& sep
 std::string shortest(double value);
 
 } // namespace TextValues
+
+} // namespace orvela

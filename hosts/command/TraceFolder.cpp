@@ -6,6 +6,8 @@
 #include <fstream>
 #include <nlohmann/json.hpp>
 
+namespace orvela {
+
 namespace fs = std::filesystem;
 
 namespace {
@@ -77,3 +79,5 @@ void TraceFolder::taskDone(const TaskReport& report, const CARGBPlane& picture, 
                                               {"blue", params.pHisto_Blue}}}};
     writeText(mFolder / (std::string(name) + ".json"), content.dump(1));
 }
+
+} // namespace orvela

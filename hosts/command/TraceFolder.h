@@ -5,6 +5,8 @@
 #include <filesystem>
 #include <memory>
 
+namespace orvela {
+
 /// Shows what each step of a run did: after every filter that changed the picture a numbered PNG, and beside
 /// it the statistics and histograms that hold from there on, as JSON.
 class TraceFolder {
@@ -24,3 +26,5 @@ private:
     int mNumber = 0;
     CARGBPlane mLast;
 };
+
+} // namespace orvela

@@ -5,6 +5,8 @@
 #include <cstdlib>
 #include <string_view>
 
+namespace orvela {
+
 namespace {
 
 // The luminance table of the JPEG standard (table K.1) in zigzag order.
@@ -168,3 +170,5 @@ bool webpIsLossless(ByteView file) {
     };
     return at(lossless) < at(lossy);
 }
+
+} // namespace orvela

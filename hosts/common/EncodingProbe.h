@@ -2,6 +2,8 @@
 
 #include "common/FileFormat.h"
 
+namespace orvela {
+
 /// What the bytes of a file tell about its encoding beyond what the decoder reports.
 
 /// Quality, chroma sampling and progression of a JPEG. The quality is the one whose scaled standard luminance
@@ -20,3 +22,5 @@ std::string probeTiffCompression(ByteView file);
 
 /// Whether the (first) picture of a WebP is encoded without loss.
 bool webpIsLossless(ByteView file);
+
+} // namespace orvela

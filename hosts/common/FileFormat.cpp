@@ -5,6 +5,8 @@
 #include <cctype>
 #include <string_view>
 
+namespace orvela {
+
 namespace {
 
 struct Extension {
@@ -133,3 +135,5 @@ std::filesystem::path defaultTarget(const std::filesystem::path& source, FileFor
     name += extension;
     return source.parent_path() / name;
 }
+
+} // namespace orvela

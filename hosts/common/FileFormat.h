@@ -6,6 +6,8 @@
 #include <span>
 #include <string>
 
+namespace orvela {
+
 /// Bytes of a file in memory.
 using Bytes = std::vector<std::uint8_t>;
 using ByteView = std::span<const std::uint8_t>;
@@ -29,3 +31,5 @@ std::string formatObstacle(FileFormat format, const Photograph& photograph);
 /// Where the result of `source` goes when nothing else is said: NAME-enhanced.EXT beside it, with the
 /// source's extension if that fits its format, and .tif for a PSD, which is read but not written.
 std::filesystem::path defaultTarget(const std::filesystem::path& source, FileFormat format);
+
+} // namespace orvela

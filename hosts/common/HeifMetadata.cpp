@@ -7,6 +7,8 @@
 #include <string>
 #include <string_view>
 
+namespace orvela {
+
 namespace {
 
 Bytes blob(VipsImage* image, const char* field) {
@@ -58,3 +60,5 @@ MetadataBlocks heifMetadata(ByteView file) {
     vips_heifload_buffer(const_cast<std::uint8_t*>(file.data()), file.size(), &image, nullptr);
     return blocksOf(image);
 }
+
+} // namespace orvela

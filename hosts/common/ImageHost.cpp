@@ -6,6 +6,8 @@
 #include <new>
 #include <utility>
 
+namespace orvela {
+
 namespace {
 
 constexpr host::Fixed kFixedOne = 0x10000;
@@ -205,3 +207,5 @@ void ImageHost::store() {
             std::memcpy(mResult.samples.data() + at, &value, sizeof value);
         });
 }
+
+} // namespace orvela

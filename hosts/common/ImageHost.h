@@ -10,6 +10,8 @@
 #include <memory>
 #include <vector>
 
+namespace orvela {
+
 /// A 16-bit file sample (0 to 65535) in the host's range (0 to 32768); full scale maps to full scale.
 constexpr std::uint16_t toHostSample(std::uint16_t file) {
     return static_cast<std::uint16_t>((file * 32768U + 32767U) / 65535U);
@@ -88,3 +90,5 @@ private:
     Buffer mIn;
     Buffer mOut;
 };
+
+} // namespace orvela

@@ -11,6 +11,8 @@
 #include <regex>
 #include <set>
 
+namespace orvela {
+
 namespace {
 
 /// What is carried over.
@@ -304,3 +306,5 @@ std::vector<std::string> copyMetadata(const Photograph& photograph, FileFormat t
         warning.insert(0, photograph.source.string() + ": ");
     return warnings;
 }
+
+} // namespace orvela

@@ -5,6 +5,8 @@
 #include <string>
 #include <vector>
 
+namespace orvela {
+
 /// Exif, from its byte order mark on, and XMP as they stand in a file.
 struct MetadataBlocks {
     Bytes exif;
@@ -23,3 +25,5 @@ MetadataBlocks metadataBlocks(const Photograph& photograph);
 /// @param encoded  changed in place; left as it is when nothing can be added
 /// @return one warning for each kind of metadata that is damaged or did not arrive
 std::vector<std::string> copyMetadata(const Photograph& photograph, FileFormat target, Bytes& encoded);
+
+} // namespace orvela

@@ -6,6 +6,8 @@
 #include <string>
 #include <vector>
 
+namespace orvela {
+
 /// A photograph that cannot be read or written: the text names the file, the cause and what to do.
 class PhotographError : public std::runtime_error {
 public:
@@ -70,3 +72,5 @@ struct Photograph {
     Encoding encoding;
     std::filesystem::path source; ///< the file it was read from; its metadata is copied from there on writing
 };
+
+} // namespace orvela

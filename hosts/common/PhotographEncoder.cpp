@@ -3,6 +3,8 @@
 #include "common/Metadata.h"
 #include "common/Vips.h"
 
+namespace orvela {
+
 namespace {
 
 namespace fs = std::filesystem;
@@ -166,3 +168,5 @@ Bytes encodePhotograph(const Photograph& photograph, FileFormat format, const fs
         clearDensity(encoded);
     return encoded;
 }
+
+} // namespace orvela

@@ -2,6 +2,8 @@
 
 #include "common/PhotographWriter.h"
 
+namespace orvela {
+
 /// The picture as the bytes of a file of that format, with its ICC profile and resolution. Only HEIF, to
 /// which nothing can be added afterwards, carries the source's Exif and XMP already.
 /// @param target  for messages; .avif asks for AV1 compression
@@ -9,3 +11,5 @@
 /// @throws StoppedError when `options.stop` was set
 Bytes encodePhotograph(const Photograph& photograph, FileFormat format, const std::filesystem::path& target,
                        const WriteOptions& options);
+
+} // namespace orvela

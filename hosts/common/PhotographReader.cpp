@@ -12,6 +12,8 @@
 #include <cstring>
 #include <system_error>
 
+namespace orvela {
+
 namespace {
 
 namespace fs = std::filesystem;
@@ -241,3 +243,5 @@ Photograph readPhotograph(const fs::path& path) {
     takeSamples(photograph, path, image.get());
     return photograph;
 }
+
+} // namespace orvela

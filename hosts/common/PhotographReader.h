@@ -2,6 +2,8 @@
 
 #include "common/Photograph.h"
 
+namespace orvela {
+
 /// Reads a JPEG, PNG, TIFF, WebP, PSD or HEIF file, recognised by its content: 8 or 16 bits; grey, grey with
 /// transparency, RGB, RGB with transparency, CMYK. Palettes become RGB, bitmaps 8-bit grey, HEIF of 10 and 12
 /// bits 16 bits. The orientation tag is not applied to the pixels, except by HEIF decoding, which always
@@ -14,3 +16,5 @@ Photograph readPhotograph(const std::filesystem::path& path);
 
 /// Number of threads that decoding and encoding may use; 1 at the start.
 void setPhotographThreads(int threads);
+
+} // namespace orvela

@@ -4,6 +4,8 @@
 #include "common/PhotographEncoder.h"
 #include "common/TargetFile.h"
 
+namespace orvela {
+
 namespace {
 
 namespace fs = std::filesystem;
@@ -37,3 +39,5 @@ std::vector<std::string> writePhotograph(const Photograph& photograph, const fs:
     file.commit(options.overwrite);
     return warnings;
 }
+
+} // namespace orvela

@@ -7,6 +7,8 @@
 #include <string>
 #include <vector>
 
+namespace orvela {
+
 /// How to write; whatever is not given follows the source where it has the target's format, otherwise JPEG
 /// quality 92, WebP and HEIF 90, full chroma resolution, LZW.
 struct WriteOptions {
@@ -37,3 +39,5 @@ void checkTarget(const Photograph& photograph, const std::filesystem::path& targ
 /// @throws StoppedError when `stop` was set
 std::vector<std::string> writePhotograph(const Photograph& photograph, const std::filesystem::path& target,
                                          const WriteOptions& options = {});
+
+} // namespace orvela

@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <limits>
 
+namespace orvela {
+
 namespace {
 
 namespace fs = std::filesystem;
@@ -211,3 +213,5 @@ Photograph readPsd(ByteView file, const fs::path& path) {
         interleave(planes, header, photograph);
     return photograph;
 }
+
+} // namespace orvela

@@ -2,6 +2,8 @@
 
 #include "common/FileFormat.h"
 
+namespace orvela {
+
 /// Reads the merged picture of a PSD file: bitmap, grey, palette, RGB and CMYK, 8 or 16 bits, with at most
 /// one transparency channel beside grey or RGB, stored plainly or packed by runs. Inks, which the file
 /// inverts, are turned back.
@@ -12,3 +14,5 @@ Photograph readPsd(ByteView file, const std::filesystem::path& path);
 /// Refuses pictures without pixels and pictures whose edges the filter record cannot express.
 /// @throws PhotographError
 void checkEdges(std::int64_t width, std::int64_t height, const std::filesystem::path& path);
+
+} // namespace orvela

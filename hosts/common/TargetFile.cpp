@@ -12,6 +12,8 @@
 #include <random>
 #include <string>
 
+namespace orvela {
+
 namespace {
 
 namespace fs = std::filesystem;
@@ -147,3 +149,5 @@ void TargetFile::rename(bool overwrite) {
         refuseExisting(mTarget);
     refuseSystem(mTarget, errno);
 }
+
+} // namespace orvela

@@ -4,6 +4,8 @@
 
 #include <atomic>
 
+namespace orvela {
+
 /// Refuses a target that cannot be written: the source itself under any name (also through links), a folder,
 /// an existing file unless it may be overwritten, a name in a folder that is missing or not writable.
 /// @throws TargetError
@@ -37,3 +39,5 @@ private:
     std::filesystem::path mTemporary;
     int mHandle = -1;
 };
+
+} // namespace orvela

@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <map>
 
+namespace orvela {
+
 namespace {
 
 constexpr std::size_t kEntrySize = 12;
@@ -61,3 +63,5 @@ void addTiffEntries(Bytes& file, const std::vector<TiffEntry>& entries) {
         file.insert(file.end(), bytes.begin(), bytes.end());
     append(file, next, 4);
 }
+
+} // namespace orvela

@@ -5,6 +5,8 @@
 
 #include <algorithm>
 
+namespace orvela {
+
 namespace {
 
 void ignoreMessage(const gchar*, GLogLevelFlags, const gchar*, gpointer) {}
@@ -41,3 +43,5 @@ void setPhotographThreads(int threads) {
     startVips();
     vips_concurrency_set(threads);
 }
+
+} // namespace orvela

@@ -5,6 +5,8 @@
 #include <memory>
 #include <string>
 
+namespace orvela {
+
 struct VipsRelease {
     void operator()(VipsImage* image) const { g_object_unref(image); }
 };
@@ -18,3 +20,5 @@ void startVips();
 
 /// The pending error text as one line; clears it.
 std::string takeVipsError();
+
+} // namespace orvela

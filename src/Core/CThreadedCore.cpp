@@ -6,6 +6,8 @@
 #include <QCoreApplication>
 #include <QThread>
 
+using namespace orvela;
+
 namespace {
 
 // Events and percentages are served at most this often while rows are worked on: often enough for a stop to

@@ -1,8 +1,8 @@
 #pragma once
 
 #include "Core/PipelineTable.h"
-#include "Utility/CARGBPlane.h"
 #include "Settings/CUserParams.h"
+#include "Utility/CARGBPlane.h"
 
 #include <QElapsedTimer>
 #include <QObject>
@@ -13,6 +13,8 @@
 
 class QThread;
 
+namespace orvela {
+
 /// What one task of a run did.
 struct TaskReport {
     const char* name; ///< class name of the task
@@ -20,6 +22,8 @@ struct TaskReport {
     bool applied; ///< false when it did not apply, failed or was cancelled
     double milliseconds;
 };
+
+} // namespace orvela
 
 /// Runs one enhancement of a whole image: a fixed sequence of tasks, announced step by step.
 ///
@@ -49,7 +53,7 @@ public:
     void stepHandled();
 
     /// Calls `observer` after every task, on the thread of the run, before the next one starts.
-    void setObserver(std::function<void(const TaskReport&)> observer);
+    void setObserver(std::function<void(const orvela::TaskReport&)> observer);
 
 Q_SIGNALS:
     /// Step number, number of steps, name of the step that starts now. The receiver answers with
@@ -74,7 +78,7 @@ protected:
     void announce(int step, int total, const char* name);
 
     /// Makes, applies and destroys one task.
-    void runTask(const PipelineTask& task);
+    void runTask(const orvela::PipelineTask& task);
 
     CARGBPlane* mInPlane;
     CARGBPlane* mOutPlane;
@@ -92,5 +96,5 @@ private:
     std::atomic<int> mReportedPercent = 0; ///< latest percentage of any row
     QThread* mRunThread = nullptr;
     QElapsedTimer mSinceService;
-    std::function<void(const TaskReport&)> mObserver;
+    std::function<void(const orvela::TaskReport&)> mObserver;
 };

@@ -4,6 +4,8 @@
 
 #include <QThread>
 
+using namespace orvela;
+
 namespace {
 
 // Fixed; up to 36 steps are announced, so the last step numbers exceed it.

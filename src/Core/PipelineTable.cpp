@@ -48,6 +48,8 @@
 #include <algorithm>
 #include <cstring>
 
+namespace orvela {
+
 namespace {
 
 template <typename Filter>
@@ -199,3 +201,5 @@ std::vector<PipelineTask> allTasks() {
 }
 
 } // namespace PipelineTable
+
+} // namespace orvela

@@ -6,6 +6,8 @@
 #include <span>
 #include <vector>
 
+namespace orvela {
+
 enum class TaskKind { Filter, Histogram, Analyzer };
 
 /// One task of a pipeline: how to make it, and what surrounds its run.
@@ -38,3 +40,5 @@ std::span<const PipelineTask> finalTouchTasks();
 std::vector<PipelineTask> allTasks();
 
 } // namespace PipelineTable
+
+} // namespace orvela

@@ -7,6 +7,8 @@
 #include <cmath>
 #include <utility>
 
+using namespace orvela;
+
 namespace {
 
 // One channel mean, doubled, is below both others.

@@ -1,8 +1,8 @@
 #pragma once
 
+#include "Filters/Curves/TonalStretch.h"
 #include "Filters/IFilter.h"
 #include "Filters/Kernels/RowMapping.h"
-#include "Filters/Curves/TonalStretch.h"
 
 /// The contrast step of the automatic-contrast mode: one black limit L and one white limit R, combined from
 /// the channel histograms, stretch all three channels. A hazy picture (R < 215 and L > 40) is stretched hard,
@@ -18,9 +18,9 @@ public:
     Auto_Contrast(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
 
     /// New value of a channel value (0 to 255) in a hazy picture; with equal limits 255.
-    static std::uint8_t hazyCurve(int value, TonalStretch::Limits limits);
+    static std::uint8_t hazyCurve(int value, orvela::TonalStretch::Limits limits);
     /// New value of a channel value (0 to 255) in any other picture.
-    static std::uint8_t normalCurve(int value, TonalStretch::Limits limits);
+    static std::uint8_t normalCurve(int value, orvela::TonalStretch::Limits limits);
 
 protected:
     bool PreApply() override;
@@ -32,8 +32,8 @@ private:
     void scanChannels(double threshold);
     int chooseThreshold();
 
-    std::array<TonalStretch::Limits, 3> mChannels; ///< red, green, blue
-    TonalStretch::Limits mLimits;                  ///< combined
-    std::int32_t mThreshold = 0;                   ///< of the second scans, in samples
-    ChannelTable mCurve = {};
+    std::array<orvela::TonalStretch::Limits, 3> mChannels; ///< red, green, blue
+    orvela::TonalStretch::Limits mLimits;                  ///< combined
+    std::int32_t mThreshold = 0;                           ///< of the second scans, in samples
+    orvela::ChannelTable mCurve = {};
 };

@@ -1,12 +1,14 @@
 #include "Filters/Auto_Gamma.h"
 
 #include "Filters/Curves/GammaCurve.h"
-#include "Settings/Conditions.h"
 #include "Filters/Kernels/PixelMath.h"
+#include "Settings/Conditions.h"
 #include "Utility/Logger.h"
 
 #include <cmath>
 #include <utility>
+
+using namespace orvela;
 
 Auto_Gamma::Auto_Gamma(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
     : IFilter(params, inPlane, outPlane) {

@@ -24,5 +24,5 @@ private:
     float gammaFor(float mean) const;
 
     static constexpr float mBaseFactor = 0.8F;
-    ChannelTable mTable = {};
+    orvela::ChannelTable mTable = {};
 };

@@ -6,6 +6,8 @@
 #include <cmath>
 #include <utility>
 
+using namespace orvela;
+
 namespace {
 
 constexpr std::array kNames = {"Red", "Green", "Blue"};

@@ -1,8 +1,8 @@
 #pragma once
 
+#include "Filters/Curves/TonalStretch.h"
 #include "Filters/IFilter.h"
 #include "Filters/Kernels/RowMapping.h"
-#include "Filters/Curves/TonalStretch.h"
 
 /// Automatic colour correction: each channel is stretched softly between limits of its own, which it reads
 /// off its histogram. mAuto_Color_Value / 1000 = S, 0 to 1, sets how far the limits follow the histogram and
@@ -33,5 +33,5 @@ private:
         float white = 255;
     };
     std::array<FloatLimits, 3> mLimits; ///< red, green, blue
-    std::array<ChannelTable, 3> mCurves = {};
+    std::array<orvela::ChannelTable, 3> mCurves = {};
 };

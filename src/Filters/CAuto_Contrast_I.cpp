@@ -7,6 +7,8 @@
 #include <cmath>
 #include <utility>
 
+using namespace orvela;
+
 namespace {
 
 // 3 * 255: normalised ratios, which sum to 1, bring the mean luma to 127.5.

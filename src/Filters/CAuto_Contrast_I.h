@@ -1,8 +1,8 @@
 #pragma once
 
+#include "Filters/Curves/TonalStretch.h"
 #include "Filters/IFilter.h"
 #include "Filters/Kernels/RowMapping.h"
-#include "Filters/Curves/TonalStretch.h"
 
 /// Brings the channel means back to what they were before the illumination iterations, keeping the hue where
 /// a channel saturates, and fades the result toward the unprocessed picture:
@@ -31,12 +31,12 @@ private:
     void logRatios() const;
     void prepareFade();
     int fade(int processed, int host) const;
-    void logOverflows(const ConstRow& processed, const ConstRow& host) const;
+    void logOverflows(const orvela::ConstRow& processed, const orvela::ConstRow& host) const;
 
     float RatioR = 1.0F;
     float RatioG = 1.0F;
     float RatioB = 1.0F;
     float Fade_Inverse = 1.0F;      ///< share of the balanced pixel
     float Fade_Value_factor = 0.0F; ///< share of the host's pixel
-    WideTables mGains = {};
+    orvela::WideTables mGains = {};
 };

@@ -1,13 +1,15 @@
 #include "Filters/CAuto_Contrast_TEST.h"
 
-#include "Settings/Conditions.h"
-#include "Filters/Kernels/PixelMath.h"
 #include "Filters/Kernels/HistogramRecount.h"
+#include "Filters/Kernels/PixelMath.h"
+#include "Settings/Conditions.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>
 #include <cmath>
 #include <utility>
+
+using namespace orvela;
 
 CAuto_Contrast_TEST::CAuto_Contrast_TEST(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
     : IFilter(params, inPlane, outPlane) {

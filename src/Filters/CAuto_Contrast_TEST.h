@@ -1,8 +1,8 @@
 #pragma once
 
+#include "Filters/Curves/TonalStretch.h"
 #include "Filters/IFilter.h"
 #include "Filters/Kernels/RowMapping.h"
-#include "Filters/Curves/TonalStretch.h"
 
 /// Stretches the picture between a common black limit L and white limit R; runs when the purely automatic
 /// situation does not hold and automatic colour is off. Measures its input anew, on every third row and
@@ -28,11 +28,11 @@ private:
     bool applies() const;
     void readChannelLimits();
 
-    std::int32_t C_Left_limit = 0;          ///< by luma
-    std::int32_t C_Right_limit = 255;       ///< by luma
-    TonalStretch::Limits mLimits{999, 999}; ///< combined from the channels; unset in a hazy picture
-    float mFactor = 1.0F;                   ///< 255 / (R - L), or 1
-    std::int32_t mThreshold = 0;            ///< in samples
-    ChannelTable mHazyCurve = {};
-    WideTable mCurve = {};
+    std::int32_t C_Left_limit = 0;                  ///< by luma
+    std::int32_t C_Right_limit = 255;               ///< by luma
+    orvela::TonalStretch::Limits mLimits{999, 999}; ///< combined from the channels; unset in a hazy picture
+    float mFactor = 1.0F;                           ///< 255 / (R - L), or 1
+    std::int32_t mThreshold = 0;                    ///< in samples
+    orvela::ChannelTable mHazyCurve = {};
+    orvela::WideTable mCurve = {};
 };

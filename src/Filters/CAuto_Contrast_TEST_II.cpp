@@ -1,12 +1,14 @@
 #include "Filters/CAuto_Contrast_TEST_II.h"
 
-#include "Settings/Conditions.h"
-#include "Filters/Kernels/PixelMath.h"
 #include "Filters/Kernels/HistogramRecount.h"
+#include "Filters/Kernels/PixelMath.h"
+#include "Settings/Conditions.h"
 #include "Utility/Logger.h"
 
 #include <cmath>
 #include <utility>
+
+using namespace orvela;
 
 CAuto_Contrast_TEST_II::CAuto_Contrast_TEST_II(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
     : IFilter(params, inPlane, outPlane) {

@@ -1,8 +1,8 @@
 #pragma once
 
+#include "Filters/Curves/TonalStretch.h"
 #include "Filters/IFilter.h"
 #include "Filters/Kernels/RowMapping.h"
-#include "Filters/Curves/TonalStretch.h"
 
 /// The stretch of the automatic modes, by limits that go only half way: from 0 to the first and from 255 to
 /// the last bin of each channel that counts. Measures its input anew, on every pixel.
@@ -16,7 +16,7 @@ public:
 
     /// New value of a channel value (0 to 255) between the channel's limits; exceeds 255 above the white one.
     /// @param factor  255 / (white - black), or 1
-    static int stretch(int value, TonalStretch::Limits limits, float factor);
+    static int stretch(int value, orvela::TonalStretch::Limits limits, float factor);
 
 protected:
     bool PreApply() override;
@@ -40,6 +40,6 @@ private:
     float HighLight_Radio_G = 1.0F;
     float HighLight_Radio_B = 1.0F;
     float mThreshold = 0; ///< in samples
-    ChannelTable mHazyCurve = {};
-    WideTables mCurves = {};
+    orvela::ChannelTable mHazyCurve = {};
+    orvela::WideTables mCurves = {};
 };

@@ -2,6 +2,8 @@
 
 #include "Utility/Logger.h"
 
+using namespace orvela;
+
 bool CAverage::ApplyEmpty() {
     Log::log(LogLevel::Debug, "Applying empty CAverage filter from plane at 0x%x to plane at 0x%x...",
              logAddress(mInPlane), logAddress(mOutPlane));

@@ -9,6 +9,8 @@
 #include <cmath>
 #include <new>
 
+using namespace orvela;
+
 namespace {
 
 constexpr char kSource[] = "Filters/CBilinear";

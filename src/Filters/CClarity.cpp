@@ -6,6 +6,8 @@
 #include <cmath>
 #include <utility>
 
+using namespace orvela;
+
 namespace {
 
 WideTable curveAround(int mean, float variance, float sloper) {

@@ -20,5 +20,5 @@ protected:
     bool PostApply() override;
 
 private:
-    WideTables mCurves = {};
+    orvela::WideTables mCurves = {};
 };

@@ -4,6 +4,8 @@
 
 #include <utility>
 
+using namespace orvela;
+
 namespace {
 
 WideTable mix(float colour, float v, float keep) {

@@ -24,7 +24,7 @@ private:
 
         float v = 0;    ///< weight of the colour
         float keep = 1; ///< weight of the pixel
-        WideTables curves = {};
+        orvela::WideTables curves = {};
     };
 
     Tint mNormal;

@@ -7,6 +7,8 @@
 #include <cmath>
 #include <utility>
 
+using namespace orvela;
+
 namespace {
 
 bool isWanted(const CSliderParams& s) {

@@ -3,6 +3,8 @@
 #include "Filters/IFilter.h"
 #include "Filters/Kernels/SumValueTable.h"
 
+namespace orvela {
+
 /// What CContrast_Brightness_Perceptual does to a pixel: adds the brightness, then moves each value away from
 /// the mean of the picture (see PivotCurve), by the less the further the pixel's own mean lies from it:
 ///
@@ -19,6 +21,8 @@ struct PerceptualContrast {
     /// @param weight  of its pixel
     int apply(int c, float weight) const;
 };
+
+} // namespace orvela
 
 /// Contrast and brightness by the factors that the analysis found fit for the picture. Contrast position 0 is
 /// neutral (1000 is the full factor), brightness position 500.
@@ -41,7 +45,7 @@ private:
     void takeBrightness(float position);
     void logTouch() const;
 
-    PerceptualContrast mContrast;
-    SumValueTable mTable;
+    orvela::PerceptualContrast mContrast;
+    orvela::SumValueTable mTable;
     bool mActive = false; ///< otherwise the row pass changes nothing
 };

@@ -6,6 +6,8 @@
 #include <cmath>
 #include <utility>
 
+using namespace orvela;
+
 bool CContrast_Simple_Filter::PreApply() {
     const CSliderParams& s = mParams->mSliderParams;
     const bool touch = s.mContrast_Touch_Enabled || s.mBrightness_Touch_Enabled;

@@ -22,5 +22,5 @@ private:
     static constexpr float mPivot = 127;
     float mContrast = 0;
     float mBrightness = 0;
-    ChannelTable mTable = {};
+    orvela::ChannelTable mTable = {};
 };

@@ -7,6 +7,8 @@
 #include <cmath>
 #include <utility>
 
+using namespace orvela;
+
 namespace {
 
 // At position 1000 the factors, 70 at most, count in full: well below the curve's bound of 101.

@@ -3,6 +3,8 @@
 #include "Filters/IFilter.h"
 #include "Filters/Kernels/SumValueTable.h"
 
+namespace orvela {
+
 /// The light of CDigital_Flash_Perceptual: each value moves away from the mean of the picture (see
 /// PivotCurve), by a share that falls with the distance d = mean - (R + G + B) / 3:
 ///
@@ -22,6 +24,8 @@ struct FlashContrast {
     int apply(int c, float weight) const;
 };
 
+} // namespace orvela
+
 /// Lights up the picture by mDigital_Flash_Value (0 is neutral) times the factors of the analysis, then fades
 /// it toward the unprocessed picture by mFade_Value, the more so the stronger the flash. No light where the
 /// highlights have a cast.
@@ -39,10 +43,10 @@ protected:
 
 private:
     void prepareFade();
-    void fadeRow(ConstRow host, Row out) const;
+    void fadeRow(orvela::ConstRow host, orvela::Row out) const;
 
-    FlashContrast mContrast;
-    SumValueTable mTable;
+    orvela::FlashContrast mContrast;
+    orvela::SumValueTable mTable;
     float mFade = 0; ///< share of the unprocessed picture, 0 to 1
     float mKeep = 1; ///< share of the lit picture
 };

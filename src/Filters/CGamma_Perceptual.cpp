@@ -5,6 +5,8 @@
 
 #include <utility>
 
+using namespace orvela;
+
 CGamma_Perceptual::CGamma_Perceptual(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
     : IFilter(params, inPlane, outPlane) {
     mName = "CGamma_Perceptual";

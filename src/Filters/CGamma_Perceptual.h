@@ -23,5 +23,5 @@ protected:
 private:
     float perceptualGamma() const;
 
-    ChannelTable mTable = {};
+    orvela::ChannelTable mTable = {};
 };

@@ -5,6 +5,8 @@
 
 #include <utility>
 
+using namespace orvela;
+
 namespace {
 
 float gammaAt(float position) {

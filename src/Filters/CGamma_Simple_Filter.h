@@ -18,5 +18,5 @@ protected:
     bool PostApply() override;
 
 private:
-    ChannelTable mTable = {};
+    orvela::ChannelTable mTable = {};
 };

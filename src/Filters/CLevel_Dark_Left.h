@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Filters/IFilter.h"
 #include "Filters/Curves/LevelMath.h"
+#include "Filters/IFilter.h"
 
 #include <optional>
 
@@ -22,8 +22,8 @@ protected:
     bool PostApply() override;
 
 private:
-    LevelMath::Levels mainLevels() const;
-    LevelMath::Levels touchLevels() const;
+    orvela::LevelMath::Levels mainLevels() const;
+    orvela::LevelMath::Levels touchLevels() const;
 
-    std::optional<LevelMath::MoveTables> mTables;
+    std::optional<orvela::LevelMath::MoveTables> mTables;
 };

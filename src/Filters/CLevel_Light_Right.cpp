@@ -5,6 +5,8 @@
 
 #include <utility>
 
+using namespace orvela;
+
 bool CLevel_Light_Right::PreApply() {
     const CSliderParams& sliders = mParams->mSliderParams;
     const bool touched = LevelSwitches::touchLight(sliders);

@@ -5,6 +5,8 @@
 
 #include <utility>
 
+using namespace orvela;
+
 bool CLevel_Light_Right_Perceptual::PreApply() {
     const CSliderParams& sliders = mParams->mSliderParams;
     const bool touched = LevelSwitches::touchPerceptualLight(sliders);

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Filters/IFilter.h"
 #include "Filters/Curves/LevelMath.h"
+#include "Filters/IFilter.h"
 
 #include <optional>
 
@@ -22,10 +22,10 @@ protected:
     void ApplyRow(std::uint32_t row) override;
 
 private:
-    LevelMath::Levels mainLevels() const;
-    LevelMath::Levels touchLevels() const;
+    orvela::LevelMath::Levels mainLevels() const;
+    orvela::LevelMath::Levels touchLevels() const;
     float weight(double luma) const;
 
-    std::optional<LevelMath::MoveTables> mTables;
+    std::optional<orvela::LevelMath::MoveTables> mTables;
     bool mTouch = false;
 };

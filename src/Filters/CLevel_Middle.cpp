@@ -6,6 +6,8 @@
 
 #include <utility>
 
+using namespace orvela;
+
 bool CLevel_Middle::PreApply() {
     const CSliderParams& sliders = mParams->mSliderParams;
     const bool touched = LevelSwitches::touchMiddle(sliders);

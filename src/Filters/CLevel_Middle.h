@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Filters/IFilter.h"
 #include "Filters/Curves/LevelMath.h"
+#include "Filters/IFilter.h"
 
 /// Absolute midtones: multiplies by the ratio by which a gamma would move the mean luma.
 ///
@@ -21,5 +21,5 @@ private:
     void prepareMain();
     void prepareTouch();
 
-    WideTables mMaps = {};
+    orvela::WideTables mMaps = {};
 };

@@ -6,6 +6,8 @@
 #include <limits>
 #include <utility>
 
+using namespace orvela;
+
 namespace {
 
 // One of the four midtone sliders of the final-touch pane with its coefficients.

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Filters/IFilter.h"
 #include "Filters/Curves/LevelMath.h"
+#include "Filters/IFilter.h"
 
 /// Perceptual midtones: a gamma between the measured coefficients m_M_H_L_F (low) and m_M_H_H_F (high).
 ///
@@ -23,5 +23,5 @@ private:
     float mainGamma();
     void prepareTouch();
 
-    WideTables mMaps = {};
+    orvela::WideTables mMaps = {};
 };

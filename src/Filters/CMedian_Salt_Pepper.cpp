@@ -7,6 +7,8 @@
 #include <algorithm>
 #include <utility>
 
+using namespace orvela;
+
 namespace {
 
 constexpr int kDarkestSpot = 101;

@@ -2,6 +2,8 @@
 
 #include "Utility/Logger.h"
 
+using namespace orvela;
+
 bool CMoire::PreApply() {
     Log::log(LogLevel::Debug, "Applying CMoire filter from plane at 0x%x to plane at 0x%x...",
              logAddress(mInPlane), logAddress(mOutPlane));

@@ -18,5 +18,5 @@ protected:
     bool PostApply() override;
 
 private:
-    std::optional<MoireKernel> mKernel; ///< between PreApply and PostApply
+    std::optional<orvela::MoireKernel> mKernel; ///< between PreApply and PostApply
 };

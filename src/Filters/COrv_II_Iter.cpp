@@ -1,8 +1,10 @@
 #include "Filters/COrv_II_Iter.h"
 
-#include "Settings/Conditions.h"
 #include "Filters/Kernels/PixelMath.h"
+#include "Settings/Conditions.h"
 #include "Utility/Logger.h"
+
+using namespace orvela;
 
 COrv_II_Iter::COrv_II_Iter(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
     : IFilter(params, inPlane, outPlane) {

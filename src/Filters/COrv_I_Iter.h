@@ -18,5 +18,5 @@ protected:
     bool PostApply() override;
 
 private:
-    std::optional<IlluminationKernel> mKernel;
+    std::optional<orvela::IlluminationKernel> mKernel;
 };

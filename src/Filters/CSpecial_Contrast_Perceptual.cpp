@@ -4,6 +4,8 @@
 
 #include <utility>
 
+using namespace orvela;
+
 namespace {
 
 /// Mass of one channel's highlights and shadows.

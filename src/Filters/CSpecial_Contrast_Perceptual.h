@@ -28,5 +28,5 @@ private:
 
     std::array<float, 3> mTarget = {}; ///< colour to tint toward, each 0 or 255
     float mTint = 0;                   ///< v
-    std::array<ChannelTable, 3> mTables = {};
+    std::array<orvela::ChannelTable, 3> mTables = {};
 };

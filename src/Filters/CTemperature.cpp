@@ -5,6 +5,8 @@
 
 #include <utility>
 
+using namespace orvela;
+
 namespace {
 
 constexpr std::array<float, 17> kKelvin = {2000, 2105, 2222, 2353, 2500, 2677, 2857, 3077, 3333,

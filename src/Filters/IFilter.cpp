@@ -9,6 +9,8 @@
 
 #include <atomic>
 
+using namespace orvela;
+
 namespace {
 
 constexpr char kSource[] = "Filters/IFilter";

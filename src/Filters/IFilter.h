@@ -22,7 +22,7 @@ protected:
     /// The unprocessed host pixel at column x, row y. Needs a direct plane proxy.
     static void GetRGBFromHost(int x, int y, std::uint32_t& r, std::uint32_t& g, std::uint32_t& b);
     /// The same for a whole row.
-    static ConstRow hostRow(int y);
+    static orvela::ConstRow hostRow(int y);
 
     /// The row prelude (see beginRow) of this filter.
     void beginRow(std::uint32_t row, const char* source, int line) {

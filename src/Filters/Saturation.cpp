@@ -1,13 +1,15 @@
 #include "Filters/Saturation.h"
 
-#include "Settings/Conditions.h"
 #include "Filters/Kernels/ScaledTile.h"
+#include "Settings/Conditions.h"
 #include "Utility/Logger.h"
 #include "Utility/RowScheduler.h"
 
 #include <algorithm>
 #include <cmath>
 #include <utility>
+
+using namespace orvela;
 
 namespace {
 

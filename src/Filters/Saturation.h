@@ -43,11 +43,11 @@ private:
     void prepareDominant(const Means& means);
 
     float mAlfa = 1; ///< saturation factor
-    SaturationKernel::Change mChange = SaturationKernel::Change::Raise;
-    bool mDominant = false;               ///< dominant-colour mode
-    float mStrength = 0;                  ///< k
-    float mMeanIn = 0;                    ///< brightness to restore
-    std::int32_t mStep = 5;               ///< distance of the samples in rows and columns
-    WideTables mCurves = {};              ///< dominant-colour mode
-    std::optional<SaturationKernel> mHsv; ///< otherwise
+    orvela::SaturationKernel::Change mChange = orvela::SaturationKernel::Change::Raise;
+    bool mDominant = false;                       ///< dominant-colour mode
+    float mStrength = 0;                          ///< k
+    float mMeanIn = 0;                            ///< brightness to restore
+    std::int32_t mStep = 5;                       ///< distance of the samples in rows and columns
+    orvela::WideTables mCurves = {};              ///< dominant-colour mode
+    std::optional<orvela::SaturationKernel> mHsv; ///< otherwise
 };

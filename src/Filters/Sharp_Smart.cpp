@@ -7,6 +7,8 @@
 #include <cmath>
 #include <utility>
 
+using namespace orvela;
+
 namespace {
 
 // Distances of the pixel to its neighbours inside the picture, each as a share of the picture.

@@ -2,6 +2,8 @@
 
 #include "Utility/Logger.h"
 
+using namespace orvela;
+
 Super_ORV::Super_ORV(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
     : IFilter(params, inPlane, outPlane) {
     mName = "Super_ORV";

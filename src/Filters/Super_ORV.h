@@ -18,6 +18,6 @@ protected:
     bool PostApply() override;
 
 private:
-    static constexpr std::int32_t mRadius = SmoothingKernel::kRadius;
-    std::optional<SmoothingKernel> mKernel;
+    static constexpr std::int32_t mRadius = orvela::SmoothingKernel::kRadius;
+    std::optional<orvela::SmoothingKernel> mKernel;
 };

@@ -4,6 +4,8 @@
 
 #include <utility>
 
+using namespace orvela;
+
 Super_ORV_II::Super_ORV_II(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
     : IFilter(params, inPlane, outPlane) {
     mName = "Super_ORV_II";

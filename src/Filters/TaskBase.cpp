@@ -6,6 +6,8 @@
 
 #include <QElapsedTimer>
 
+using namespace orvela;
+
 namespace {
 
 // Times one phase between a scope entry and the matching exit of the log.

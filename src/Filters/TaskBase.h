@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Utility/CARGBPlane.h"
 #include "Settings/CUserParams.h"
+#include "Utility/CARGBPlane.h"
 
 #include <QByteArray>
 

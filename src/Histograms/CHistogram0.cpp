@@ -1,7 +1,11 @@
 #include "Histograms/CHistogram0.h"
 
+#include "Filters/Kernels/PixelMath.h"
+
 #include <cstdlib>
 #include <utility>
+
+using namespace orvela;
 
 namespace {
 

@@ -2,6 +2,8 @@
 
 #include "Utility/Logger.h"
 
+using namespace orvela;
+
 bool CHistogram_III::PreApply() {
     Log::log(LogLevel::Debug, "CHistogram_III is starting.");
     mParams->Dark_Ave = 0;

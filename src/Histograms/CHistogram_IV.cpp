@@ -2,6 +2,8 @@
 
 #include "Utility/Logger.h"
 
+using namespace orvela;
+
 bool CHistogram_IV::PreApply() {
     if (!mParams->mSliderParams.mAuto_Color_Enabled)
         return false;

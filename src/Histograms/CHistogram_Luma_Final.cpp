@@ -1,8 +1,11 @@
 #include "Histograms/CHistogram_Luma_Final.h"
 
+#include "Filters/Kernels/PixelMath.h"
 #include "Utility/Logger.h"
 
 #include <utility>
+
+using namespace orvela;
 
 bool CHistogram_Luma_Final::PreApply() {
     Log::log(LogLevel::Debug, "CHistogram_Luma_Final is starting.");

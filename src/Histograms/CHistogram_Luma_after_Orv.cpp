@@ -2,6 +2,8 @@
 
 #include "Utility/Logger.h"
 
+using namespace orvela;
+
 bool CHistogram_Luma_after_Orv::PreApply() {
     const CSliderParams& sliders = mParams->mSliderParams;
     const bool iterated = sliders.OrvelaLevelEnabled || sliders.OrvelaLevel2Enabled;

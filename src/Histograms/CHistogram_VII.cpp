@@ -2,6 +2,8 @@
 
 #include "Utility/Logger.h"
 
+using namespace orvela;
+
 bool CHistogram_VII::PreApply() {
     Log::log(LogLevel::Debug, "CHistogram_VII is starting.");
     prepareSampling();

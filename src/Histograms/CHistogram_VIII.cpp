@@ -2,6 +2,8 @@
 
 #include "Utility/Logger.h"
 
+using namespace orvela;
+
 bool CHistogram_VIII::PreApply() {
     if (!mParams->mSliderParams.DigitalFlashEnabled)
         return false;

@@ -1,9 +1,12 @@
 #include "Histograms/IHistogram.h"
 
+#include "Filters/Kernels/PixelMath.h"
 #include "Utility/Logger.h"
 
 #include <cmath>
 #include <utility>
+
+using namespace orvela;
 
 namespace {
 
@@ -137,9 +140,13 @@ void IHistogram::testCast(float factor) const {
         mParams->Bicromic = true;
 }
 
+namespace orvela {
+
 double sumOf(const Histogram& bins, std::size_t first, std::size_t last) {
     double sum = 0;
     for (std::size_t i = first; i <= last; ++i)
         sum += bins[i];
     return sum;
 }
+
+} // namespace orvela

@@ -65,10 +65,10 @@ protected:
     CARGBPlane* mInPlane;
     float mHistoFactor = 1.0F;   ///< weight of one sample
     std::int32_t mHistoStep = 1; ///< distance of the samples in rows and columns
-    Histogram mLuma = {};
-    Histogram mRed = {};
-    Histogram mBlue = {};
-    Histogram mGreen = {};
+    orvela::Histogram mLuma = {};
+    orvela::Histogram mRed = {};
+    orvela::Histogram mBlue = {};
+    orvela::Histogram mGreen = {};
     std::uint32_t mWhite = 0;
     std::uint32_t mBlack = 0;
     std::uint32_t mSumLuma = 0;
@@ -80,6 +80,8 @@ protected:
 private:
     std::mutex mMergeMutex;
 };
+
+namespace orvela {
 
 /// The sum of the bins first to last, both included.
 double sumOf(const Histogram& bins, std::size_t first, std::size_t last);
@@ -118,6 +120,8 @@ struct HighlightShares {
         return (2 * b < g && 2 * b < r) || (2 * g < r && 2 * g < b) || (2 * r < b && 2 * r < g) ? 1.0F : 0.0F;
     }
 };
+
+} // namespace orvela
 
 /// Base of the histograms of intermediate planes.
 class CLocalHistogram : public IHistogram {

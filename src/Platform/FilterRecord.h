@@ -3,6 +3,8 @@
 #include <cstddef>
 #include <cstdint>
 
+namespace orvela {
+
 /// Our own model of the filter record that a host of the publicly documented filter interface hands the
 /// module, with the types around it. Packed to 4, as on 32-bit and 64-bit hosts alike: never bind a reference
 /// to a pointer member.
@@ -338,3 +340,5 @@ static_assert(sizeof(Point) == 4 && sizeof(Rect) == 8 && sizeof(PlugInMonitor) =
 static_assert(sizeof(AboutRecord) == (sizeof(void*) == 4 ? 256 : 272));
 
 } // namespace host
+
+} // namespace orvela

@@ -1,5 +1,7 @@
 #pragma once
 
+namespace orvela {
+
 /// The keys that are held down right now.
 namespace Keyboard {
 
@@ -10,3 +12,5 @@ int shiftState();
 void setShiftState(int (*answer)());
 
 } // namespace Keyboard
+
+} // namespace orvela

@@ -2,6 +2,8 @@
 
 #include <QGuiApplication>
 
+namespace orvela {
+
 namespace Keyboard {
 
 namespace {
@@ -25,3 +27,5 @@ void setShiftState(int (*answer)()) {
 }
 
 } // namespace Keyboard
+
+} // namespace orvela

@@ -2,6 +2,8 @@
 
 #include <windows.h>
 
+namespace orvela {
+
 namespace Keyboard {
 
 namespace {
@@ -23,3 +25,5 @@ void setShiftState(int (*answer)()) {
 }
 
 } // namespace Keyboard
+
+} // namespace orvela

@@ -6,6 +6,8 @@
 #include <cstring>
 #include <vector>
 
+using namespace orvela;
+
 namespace {
 
 constexpr char kSource[] = "CARGBPlanePhotoshop";

@@ -15,17 +15,17 @@ public:
     /// become floor(s * 255 / 32768); depths other than 8 and 16 transfer no samples.
     /// @param result  the host's result cell; receives every code that the host returns
     /// @throws CGenericEx when the host refuses a request
-    void FillFrom_Photoshop_Data(host::FilterRecord* record, std::int16_t* result);
+    void FillFrom_Photoshop_Data(orvela::host::FilterRecord* record, std::int16_t* result);
 
     /// Writes the channels back: red, green and blue; red alone to a single channel; blue to grey with
     /// transparency, whose transparency becomes opaque.
     /// @throws CGenericEx when the host refuses a request or has none of one to four channels
-    void copyPlaneToPS(host::FilterRecord* record, std::int16_t* result);
+    void copyPlaneToPS(orvela::host::FilterRecord* record, std::int16_t* result);
 
 private:
-    void writeChannel(int channel, const std::uint8_t* samples, host::FilterRecord* record,
+    void writeChannel(int channel, const std::uint8_t* samples, orvela::host::FilterRecord* record,
                       std::int16_t* result);
-    void copyToOutput(host::FilterRecord* record, const std::uint8_t* samples) const;
-    void copyFromInput(const host::FilterRecord* record, std::uint8_t* samples) const;
-    void writeOpaque(int channel, host::FilterRecord* record, std::int16_t* result);
+    void copyToOutput(orvela::host::FilterRecord* record, const std::uint8_t* samples) const;
+    void copyFromInput(const orvela::host::FilterRecord* record, std::uint8_t* samples) const;
+    void writeOpaque(int channel, orvela::host::FilterRecord* record, std::int16_t* result);
 };

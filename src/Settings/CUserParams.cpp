@@ -1,9 +1,9 @@
 #include "Settings/CUserParams.h"
 
-#include "Utility/DebugBoxes.h"
-#include "Utility/Logger.h"
 #include "Settings/ModeTable.h"
 #include "Settings/SliderTable.h"
+#include "Utility/DebugBoxes.h"
+#include "Utility/Logger.h"
 
 #include <QFile>
 #include <QTextStream>
@@ -12,19 +12,9 @@
 #include <type_traits>
 #include <vector>
 
+using namespace orvela;
+
 namespace {
-
-constexpr SliderField makeField(const char* name, float CSliderParams::*value, int listed) {
-    return {name, value, nullptr, listed};
-}
-constexpr SliderField makeField(const char* name, bool CSliderParams::*flag, int listed) {
-    return {name, nullptr, flag, listed};
-}
-
-constexpr SliderField kSliderFields[] = {
-#define ORVELA_SLIDER_FIELD(type, name, listed) makeField(#name, &CSliderParams::name, listed),
-#include "Settings/SliderFields.inc"
-};
 
 // One line of the listing.
 struct ListedLine {
@@ -54,7 +44,7 @@ void logInOrder(std::vector<ListedLine>& lines) {
 void listSliders(const CSliderParams& sliders, const char* name) {
     Log::scopeEntry(LogLevel::Debug, "Begin Slider Param Listing: %s", name);
     std::vector<ListedLine> lines;
-    for (const SliderField& field : kSliderFields) {
+    for (const SliderField& field : sliderFields()) {
         // This one label has always carried a semicolon.
         const bool odd = field.flag == &CSliderParams::mColor_Effect_Intensity_Enabled;
         const char* label = odd ? "mColor_Effect_Intensity_Enabled;" : field.name;
@@ -68,10 +58,6 @@ void listSliders(const CSliderParams& sliders, const char* name) {
 }
 
 } // namespace
-
-std::span<const SliderField> sliderFields() {
-    return kSliderFields;
-}
 
 CUserParams::CUserParams() = default;
 

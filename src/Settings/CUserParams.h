@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Settings/CSliderParams.h"
 #include "Settings/EGUIMode.h"
 #include "Settings/SliderScale.h"
 
@@ -10,24 +11,8 @@
 #include <atomic>
 #include <cstdint>
 #include <functional>
-#include <span>
 
-/// Every slider position (0 to 1000), switch and picker colour (0 to 255) of a run.
-struct CSliderParams {
-#define ORVELA_SLIDER_FIELD(type, name, listed) type name = {};
-#include "Settings/SliderFields.inc"
-};
-
-/// One field of CSliderParams by name; exactly one of the member pointers is set.
-struct SliderField {
-    const char* name;
-    float CSliderParams::*value;
-    bool CSliderParams::*flag;
-    int listed; ///< position among the lines of the listing, 0 when it has none
-};
-
-/// All fields of CSliderParams, in order.
-std::span<const SliderField> sliderFields();
+namespace orvela {
 
 /// A stop request: written by one thread while others read it. A read that misses the write only delays the
 /// stop.
@@ -46,6 +31,8 @@ private:
 };
 
 using Histogram = std::array<double, 256>;
+
+} // namespace orvela
 
 /// Everything that one processing run needs and produces: slider values, hooks, picture flags, statistics and
 /// the factors that measurements hand to filters. Built for each run, copied into the core and changed by its
@@ -71,7 +58,7 @@ public:
 
     /// Reports the percentage (0 to 100) of the current task; may be called from any thread.
     std::function<void(std::int32_t percent)> mProgressCallback;
-    CancelFlag mCancelRequested;
+    orvela::CancelFlag mCancelRequested;
     bool Final_Touch_Mode_Enabled = false;
     CSliderParams mSliderParams;
 
@@ -79,11 +66,13 @@ public:
 #define ORVELA_KEPT_FIELD(type, name, listed) type name = {};
 #include "Settings/StatisticFields.inc"
 
-    Histogram pHisto_Luma = {};
-    Histogram pHisto_Red = {};
-    Histogram pHisto_Green = {};
-    Histogram pHisto_Blue = {};
+    orvela::Histogram pHisto_Luma = {};
+    orvela::Histogram pHisto_Red = {};
+    orvela::Histogram pHisto_Green = {};
+    orvela::Histogram pHisto_Blue = {};
 };
+
+namespace orvela {
 
 /// The single slider that a single-filter mode shows.
 struct GenericSlider {
@@ -95,6 +84,8 @@ struct GenericSlider {
     const SliderScale* scale = nullptr;
 };
 
+} // namespace orvela
+
 class CUserParamsPhotoshop : public CUserParams {
 public:
     CUserParamsPhotoshop() = default;
@@ -103,5 +94,5 @@ public:
     /// object.
     explicit CUserParamsPhotoshop(EGUIMode mode);
 
-    GenericSlider mGenericSlider;
+    orvela::GenericSlider mGenericSlider;
 };

@@ -2,6 +2,8 @@
 
 #include "Settings/CUserParams.h"
 
+namespace orvela {
+
 /// Groups of level switches that filters and analyzers test together: any switch of the group is on.
 namespace LevelSwitches {
 
@@ -65,3 +67,5 @@ inline bool isTooSharpFor(const CUserParams& params, double lowerBound) {
     const bool outside = params.mSum_Color > 2.18 || params.mSum_Color < lowerBound;
     return sliders.OrvelaLevel3Enabled && outside && automatic;
 }
+
+} // namespace orvela

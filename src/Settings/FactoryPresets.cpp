@@ -1,11 +1,13 @@
 #include "Settings/FactoryPresets.h"
 
-#include "Utility/DebugBoxes.h"
 #include "Settings/ModeTable.h"
+#include "Utility/DebugBoxes.h"
 
 #include <QCoreApplication>
 
 #include <algorithm>
+
+namespace orvela {
 
 namespace {
 
@@ -57,3 +59,5 @@ QString factoryPresetName(EGUIMode mode) {
 }
 
 } // namespace FactoryPresets
+
+} // namespace orvela

@@ -4,6 +4,8 @@
 
 #include <QStringList>
 
+namespace orvela {
+
 /// The presets that come with the program: one for each automatic mode, under the mode's identifier.
 namespace FactoryPresets {
 
@@ -24,3 +26,5 @@ EGUIMode factoryPresetMode(const QString& name);
 QString factoryPresetName(EGUIMode mode);
 
 } // namespace FactoryPresets
+
+} // namespace orvela

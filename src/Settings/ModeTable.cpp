@@ -4,6 +4,8 @@
 
 #include <algorithm>
 
+using namespace orvela;
+
 namespace {
 
 using P = CSliderParams;
@@ -178,6 +180,8 @@ constexpr ModeDescription kModes[] = {
 
 } // namespace
 
+namespace orvela {
+
 namespace ModeTable {
 
 std::span<const ModeDescription> all() {
@@ -191,6 +195,8 @@ const ModeDescription* find(EGUIMode mode) {
 }
 
 } // namespace ModeTable
+
+} // namespace orvela
 
 QString getModeAsString(EGUIMode mode) {
     if (const ModeDescription* description = ModeTable::find(mode))

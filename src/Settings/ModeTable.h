@@ -1,8 +1,11 @@
 #pragma once
 
-#include "Settings/CUserParams.h"
+#include "Settings/CSliderParams.h"
+#include "Settings/EGUIMode.h"
 
 #include <span>
+
+namespace orvela {
 
 /// One field that a mode sets: its position, and the switch that it turns on (null: the switch stays off).
 struct FactorySetting {
@@ -30,3 +33,5 @@ std::span<const ModeDescription> all();
 const ModeDescription* find(EGUIMode mode);
 
 } // namespace ModeTable
+
+} // namespace orvela

@@ -4,6 +4,8 @@
 
 #include <algorithm>
 
+namespace orvela {
+
 namespace {
 
 using P = CSliderParams;
@@ -90,3 +92,5 @@ CSliderParams paramsOf(EGUIMode mode, const PresetContent& content) {
 }
 
 } // namespace PresetConversion
+
+} // namespace orvela

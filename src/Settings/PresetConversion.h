@@ -1,7 +1,9 @@
 #pragma once
 
+#include "Settings/CSliderParams.h"
 #include "Settings/PresetTree.h"
-#include "Settings/CUserParams.h"
+
+namespace orvela {
 
 /// Stored presets as settings and back, through the table of sliders. Controls that mirror another one are
 /// left out; setting the other one sets them.
@@ -18,3 +20,5 @@ PresetContent contentOf(EGUIMode mode, const CSliderParams& sliders);
 CSliderParams paramsOf(EGUIMode mode, const PresetContent& content);
 
 } // namespace PresetConversion
+
+} // namespace orvela

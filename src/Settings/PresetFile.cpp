@@ -6,6 +6,8 @@
 #include <QJsonDocument>
 #include <QSaveFile>
 
+namespace orvela {
+
 namespace {
 
 constexpr int kVersion = 1;
@@ -105,3 +107,5 @@ QStringList PresetFile::unknownNames() const {
             unknown << name;
     return unknown;
 }
+
+} // namespace orvela

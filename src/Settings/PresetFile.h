@@ -1,11 +1,13 @@
 #pragma once
 
-#include "Settings/CUserParams.h"
+#include "Settings/CSliderParams.h"
 
 #include <QJsonObject>
 #include <QStringList>
 
 #include <stdexcept>
+
+namespace orvela {
 
 /// A preset file that cannot be read or written: the text names the file, the cause and what to do.
 class PresetError : public std::runtime_error {
@@ -44,3 +46,5 @@ public:
 private:
     QJsonObject mRoot;
 };
+
+} // namespace orvela

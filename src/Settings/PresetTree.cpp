@@ -8,6 +8,8 @@
 #include <algorithm>
 #include <cmath>
 
+namespace orvela {
+
 namespace {
 
 const QString kPresets = QStringLiteral("2000/UserPresets/");
@@ -158,3 +160,5 @@ void remove(SettingsEdit& edit, EGUIMode mode, const QString& name) {
 }
 
 } // namespace PresetTree
+
+} // namespace orvela

@@ -1,10 +1,12 @@
 #pragma once
 
-#include "Settings/SettingsEdit.h"
 #include "Settings/EGUIMode.h"
+#include "Settings/SettingsEdit.h"
 
 #include <QList>
 #include <QStringList>
+
+namespace orvela {
 
 /// What a stored preset says of a slider block.
 struct PresetSlider {
@@ -73,3 +75,5 @@ void write(SettingsEdit& edit, EGUIMode mode, const QString& name, const PresetC
 void remove(SettingsEdit& edit, EGUIMode mode, const QString& name);
 
 } // namespace PresetTree
+
+} // namespace orvela

@@ -4,6 +4,8 @@
 
 #include <algorithm>
 
+namespace orvela {
+
 namespace SettingFields {
 
 const SliderField* find(std::string_view name) {
@@ -55,3 +57,5 @@ CSliderParams onlyFinalTouch(const CSliderParams& sliders, bool finalTouch) {
 }
 
 } // namespace SettingFields
+
+} // namespace orvela

@@ -1,8 +1,10 @@
 #pragma once
 
-#include "Settings/CUserParams.h"
+#include "Settings/CSliderParams.h"
 
 #include <string_view>
+
+namespace orvela {
 
 /// What the outside may know of the fields of CSliderParams: their names, ranges and switches.
 namespace SettingFields {
@@ -26,3 +28,5 @@ bool anyFinalTouchOn(const CSliderParams& sliders);
 CSliderParams onlyFinalTouch(const CSliderParams& sliders, bool finalTouch);
 
 } // namespace SettingFields
+
+} // namespace orvela

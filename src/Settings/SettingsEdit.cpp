@@ -11,6 +11,8 @@
 
 #include <algorithm>
 
+namespace orvela {
+
 namespace {
 
 using Changes = std::vector<SettingsEdit::Change>;
@@ -114,3 +116,5 @@ void SettingsEdit::commit() const {
     apply(writer, before);
     fail(kUnwritten, reader.fileName(), __LINE__);
 }
+
+} // namespace orvela

@@ -6,6 +6,8 @@
 #include <optional>
 #include <vector>
 
+namespace orvela {
+
 /// A change of the settings store that is made whole or not at all. The store is the one of the organisation
 /// and application names; it is opened for the change only.
 class SettingsEdit {
@@ -31,3 +33,5 @@ public:
 private:
     std::vector<Change> mChanges;
 };
+
+} // namespace orvela

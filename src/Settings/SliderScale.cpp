@@ -1,5 +1,7 @@
 #include "Settings/SliderScale.h"
 
+namespace orvela {
+
 namespace SliderScales {
 
 const SliderScale Tenth = {[](double p) { return p * 0.1; }, [](double v) { return v * 10; }};
@@ -27,3 +29,5 @@ const SliderScale Highlights = {[](double p) { return 255 - p * 0.255; },
                                 [](double v) { return (255 - v) * 3.9215686274509802; }};
 
 } // namespace SliderScales
+
+} // namespace orvela

@@ -1,5 +1,7 @@
 #pragma once
 
+namespace orvela {
+
 /// The two-way map between a slider's position (0 to 1000) and the number shown for it.
 struct SliderScale {
     double (*toShown)(double position);
@@ -23,3 +25,5 @@ extern const SliderScale Shadows;     ///< 0 to 255
 extern const SliderScale Highlights;  ///< 255 down to 0
 
 } // namespace SliderScales
+
+} // namespace orvela

@@ -1,5 +1,7 @@
 #include "Settings/SliderTable.h"
 
+namespace orvela {
+
 namespace SliderTable {
 
 namespace {
@@ -188,3 +190,5 @@ const SliderDescription* single(EGUIMode mode) {
 }
 
 } // namespace SliderTable
+
+} // namespace orvela

@@ -1,9 +1,12 @@
 #pragma once
 
-#include "Settings/CUserParams.h"
+#include "Settings/CSliderParams.h"
+#include "Settings/EGUIMode.h"
 #include "Settings/SliderScale.h"
 
 #include <span>
+
+namespace orvela {
 
 /// Where a slider stands in its pane.
 enum class SliderGroup {
@@ -49,3 +52,5 @@ std::span<const SliderDescription> threeSliders(EGUIMode mode);
 const SliderDescription* single(EGUIMode mode);
 
 } // namespace SliderTable
+
+} // namespace orvela

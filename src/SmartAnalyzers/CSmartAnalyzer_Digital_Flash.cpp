@@ -6,6 +6,8 @@
 #include <algorithm>
 #include <cmath>
 
+using namespace orvela;
+
 using namespace ToneMass;
 
 namespace {

@@ -4,6 +4,8 @@
 
 #include <algorithm>
 
+using namespace orvela;
+
 using namespace ToneMass;
 
 namespace {

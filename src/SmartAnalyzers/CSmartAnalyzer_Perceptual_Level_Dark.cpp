@@ -1,8 +1,10 @@
 #include "SmartAnalyzers/CSmartAnalyzer_Perceptual_Level_Dark.h"
 
-#include "SmartAnalyzers/ToneMass.h"
 #include "Settings/Conditions.h"
+#include "SmartAnalyzers/ToneMass.h"
 #include "Utility/Logger.h"
+
+using namespace orvela;
 
 using namespace ToneMass;
 

@@ -1,11 +1,13 @@
 #include "SmartAnalyzers/CSmartAnalyzer_Perceptual_Level_Middle.h"
 
-#include "SmartAnalyzers/ToneMass.h"
 #include "Settings/Conditions.h"
+#include "SmartAnalyzers/ToneMass.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>
 #include <cmath>
+
+using namespace orvela;
 
 using namespace ToneMass;
 

@@ -1,10 +1,12 @@
 #include "SmartAnalyzers/CSmartAnalyzer_Perceptual_Level_Right.h"
 
-#include "SmartAnalyzers/ToneMass.h"
 #include "Settings/Conditions.h"
+#include "SmartAnalyzers/ToneMass.h"
 #include "Utility/Logger.h"
 
 #include <algorithm>
+
+using namespace orvela;
 
 using namespace ToneMass;
 

@@ -3,6 +3,8 @@
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
 
+using namespace orvela;
+
 namespace {
 constexpr char kSource[] = "SmartAnalyzers/ISmartAnalyzer";
 }

@@ -6,6 +6,8 @@
 #include <algorithm>
 #include <cmath>
 
+namespace orvela {
+
 namespace {
 
 constexpr unsigned kRecountRowStep = 5;
@@ -86,3 +88,5 @@ void recount(const CARGBPlane& plane, CUserParams& params) {
 }
 
 } // namespace ToneMass
+
+} // namespace orvela

@@ -1,9 +1,11 @@
 #pragma once
 
-#include "Utility/CARGBPlane.h"
 #include "Settings/CUserParams.h"
+#include "Utility/CARGBPlane.h"
 
 #include <array>
+
+namespace orvela {
 
 /// The method that all analyzers share: bend a histogram as if a tone curve had been applied to the picture,
 /// then weigh its bins with a smooth step.
@@ -54,3 +56,5 @@ int rightLimit(const CUserParams& params);
 void recount(const CARGBPlane& plane, CUserParams& params);
 
 } // namespace ToneMass
+
+} // namespace orvela

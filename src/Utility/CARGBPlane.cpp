@@ -10,6 +10,8 @@
 #include <new>
 #include <vector>
 
+using namespace orvela;
+
 namespace {
 
 constexpr char kSource[] = "Utility/CARGBPlane";

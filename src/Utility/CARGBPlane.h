@@ -8,6 +8,8 @@
 #include <cstdint>
 #include <memory>
 
+namespace orvela {
+
 /// The three sample arrays of a plane.
 enum class Channel : int { Red = 0, Green = 1, Blue = 2 };
 
@@ -17,6 +19,8 @@ inline constexpr std::array<Channel, 3> kChannels = {Channel::Red, Channel::Gree
 /// One row of a plane: the red, green and blue samples of its pixels, left to right.
 using ConstRow = std::array<const std::uint8_t*, 3>;
 using Row = std::array<std::uint8_t*, 3>;
+
+} // namespace orvela
 
 /// An image of 8-bit red, green and blue samples in three separate row-major arrays (top row first, no
 /// padding): the sample of column x, row y stands at y * width + x. There are no alpha samples. A plane has
@@ -57,14 +61,16 @@ public:
     std::uint32_t blue(int x, int y) const { return mSamples[2][index(x, y)]; }
 
     /// One whole channel; null while the plane is empty.
-    std::uint8_t* samples(Channel channel) { return mSamples[static_cast<std::size_t>(channel)].get(); }
-    const std::uint8_t* samples(Channel channel) const {
+    std::uint8_t* samples(orvela::Channel channel) {
+        return mSamples[static_cast<std::size_t>(channel)].get();
+    }
+    const std::uint8_t* samples(orvela::Channel channel) const {
         return mSamples[static_cast<std::size_t>(channel)].get();
     }
 
     /// Row y of all three channels, unchecked.
-    Row row(int y);
-    ConstRow row(int y) const;
+    orvela::Row row(int y);
+    orvela::ConstRow row(int y) const;
 
     /// Writes the samples as interleaved red, green, blue bytes without a header (3 * width * height bytes);
     /// a file that cannot be opened is only logged.

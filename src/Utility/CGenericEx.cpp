@@ -7,6 +7,8 @@
 #include <deque>
 #include <mutex>
 
+using namespace orvela;
+
 namespace {
 
 struct Record {
@@ -51,6 +53,8 @@ COutOfMemoryEx::COutOfMemoryEx(const QString& message, const char* sourceFile, i
 CBadPtrEx::CBadPtrEx(const QString& message, const char* sourceFile, int line)
     : CGenericEx(message, sourceFile, line, "CBadPtrEx") {}
 
+namespace orvela {
+
 namespace ExceptionStack {
 
 void writeToLog(bool clearAfterwards) {
@@ -81,3 +85,5 @@ QStringList entries() {
 }
 
 } // namespace ExceptionStack
+
+} // namespace orvela

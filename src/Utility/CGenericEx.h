@@ -38,6 +38,8 @@ struct CBadPtrEx : CGenericEx {
     CBadPtrEx(const QString& message, const char* sourceFile, int line);
 };
 
+namespace orvela {
+
 /// The process-wide record of every failure raised since it was last cleared, newest first. Raising and
 /// catching never trim it. Safe to use from several threads.
 namespace ExceptionStack {
@@ -54,3 +56,5 @@ QString oldestMessage();
 QStringList entries();
 
 } // namespace ExceptionStack
+
+} // namespace orvela

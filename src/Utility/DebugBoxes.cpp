@@ -2,6 +2,8 @@
 
 #include <QtGlobal>
 
+namespace orvela {
+
 namespace DebugBoxes {
 
 namespace {
@@ -36,3 +38,5 @@ void debugWarning(const QString& text, const QString& title) {
 }
 
 } // namespace DebugBoxes
+
+} // namespace orvela

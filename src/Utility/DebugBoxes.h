@@ -2,6 +2,8 @@
 
 #include <QString>
 
+namespace orvela {
+
 /// Message boxes of the engine. The engine has no windows: the user interface installs a presenter that shows
 /// a modal box; without one every box counts as answered with OK.
 namespace DebugBoxes {
@@ -33,3 +35,5 @@ int warningBox(void* parent, const QString& title, const QString& text, int butt
 void debugWarning(const QString& text, const QString& title);
 
 } // namespace DebugBoxes
+
+} // namespace orvela

@@ -5,6 +5,8 @@
 #include <cstdint>
 #include <mutex>
 
+using namespace orvela;
+
 namespace {
 
 constexpr std::size_t kMessageSize = 2048;
@@ -53,6 +55,8 @@ void CLoggerFile::write(const QByteArray& line) {
     std::fputc('\n', mFile.get());
     std::fflush(mFile.get());
 }
+
+namespace orvela {
 
 namespace Log {
 
@@ -123,3 +127,5 @@ bool writes(LogLevel level) {
 unsigned logAddress(const void* object) {
     return static_cast<unsigned>(reinterpret_cast<std::uintptr_t>(object));
 }
+
+} // namespace orvela

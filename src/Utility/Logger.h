@@ -5,8 +5,12 @@
 #include <cstdio>
 #include <memory>
 
+namespace orvela {
+
 /// Importance of a log line; a line is written when its level is not above the threshold.
 enum class LogLevel : int { High = 0, Error = 1, Warning = 2, Info = 3, Debug = 4, User = 5 };
+
+} // namespace orvela
 
 /// Receiver of finished log lines.
 class ILogger {
@@ -30,6 +34,8 @@ private:
     };
     std::unique_ptr<std::FILE, Closer> mFile;
 };
+
+namespace orvela {
 
 /// The process-wide logging core. Every call is safe from any thread and never throws. Formatted messages are
 /// cut at 2047 bytes, scope texts and composed lines at 1023.
@@ -63,3 +69,5 @@ bool writes(LogLevel level);
 
 /// The low 32 bits of an address, as log lines show it.
 unsigned logAddress(const void* object);
+
+} // namespace orvela

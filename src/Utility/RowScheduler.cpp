@@ -11,6 +11,8 @@
 
 #if defined(__SANITIZE_THREAD__)
 #include <sanitizer/tsan_interface.h>
+
+using namespace orvela;
 #endif
 
 namespace orvela {

@@ -10,6 +10,8 @@
 #include <string>
 #include <vector>
 
+namespace orvela {
+
 /// A folder of its own for one test, removed with everything in it; shell commands run there with $S naming
 /// the sample photographs.
 class TestFolder {
@@ -48,3 +50,5 @@ public:
 private:
     std::filesystem::path mPath;
 };
+
+} // namespace orvela

@@ -17,6 +17,8 @@
 #include <fstream>
 #include <sstream>
 
+using namespace orvela;
+
 namespace {
 
 namespace fs = std::filesystem;

@@ -6,6 +6,8 @@
 #include <string>
 #include <vector>
 
+namespace orvela {
+
 /// Collects the log lines written while it lives; threshold debug, no prefixes.
 class LogCapture {
 public:
@@ -36,3 +38,5 @@ private:
     };
     std::shared_ptr<std::vector<std::string>> mLines;
 };
+
+} // namespace orvela

@@ -6,6 +6,8 @@
 
 #include <stdexcept>
 
+namespace orvela {
+
 /// Sets a slider, a switch, a statistic or a flag by its name; "pHisto_Luma[128]" is a bin. Throws
 /// std::invalid_argument for other names.
 inline void setField(CUserParams& params, const QString& name, double value) {
@@ -35,3 +37,5 @@ inline CUserParams paramsFrom(const std::string& text) {
         setField(params, word.section('=', 0, 0), word.contains('=') ? word.section('=', 1).toDouble() : 1);
     return params;
 }
+
+} // namespace orvela

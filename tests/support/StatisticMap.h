@@ -5,6 +5,8 @@
 #include <map>
 #include <string>
 
+namespace orvela {
+
 /// The statistics and flags of a parameter object by name.
 inline std::map<std::string, double> statistics(const CUserParams& params) {
     std::map<std::string, double> fields;
@@ -20,3 +22,5 @@ inline void markStatistics(CUserParams& params) {
 #define ORVELA_KEPT_FIELD(type, name, listed) params.name = static_cast<type>(-7);
 #include "Settings/StatisticFields.inc"
 }
+
+} // namespace orvela

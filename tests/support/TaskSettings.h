@@ -11,6 +11,8 @@
 #include <string>
 #include <vector>
 
+namespace orvela {
+
 /// Settings under which a task does its work.
 namespace tasksettings {
 
@@ -106,3 +108,5 @@ inline void measure(CUserParams& params, CARGBPlane& in, CARGBPlane& out) {
 }
 
 } // namespace tasksettings
+
+} // namespace orvela

@@ -7,6 +7,8 @@
 #include <memory>
 #include <vector>
 
+namespace orvela {
+
 /// Planes for tests.
 namespace testplanes {
 
@@ -59,3 +61,5 @@ inline std::vector<std::uint8_t> bytes(const CARGBPlane& plane) {
 }
 
 } // namespace testplanes
+
+} // namespace orvela

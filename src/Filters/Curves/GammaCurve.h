@@ -4,6 +4,8 @@
 
 #include <cmath>
 
+namespace orvela {
+
 /// The power curve of the gamma and midtone filters. A gamma above 1 brightens, below 1 darkens; 1 is the
 /// identity.
 namespace GammaCurve {
@@ -26,3 +28,5 @@ inline ChannelTable table(float gamma) {
 }
 
 } // namespace GammaCurve
+
+} // namespace orvela

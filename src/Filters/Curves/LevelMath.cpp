@@ -4,6 +4,8 @@
 
 #include <cmath>
 
+namespace orvela {
+
 namespace LevelMath {
 
 float bell(double luma, float mean, const Bell& shape) {
@@ -81,3 +83,5 @@ WideTables gammaMaps(float gamma) {
 }
 
 } // namespace LevelMath
+
+} // namespace orvela

@@ -8,6 +8,8 @@
 #include <cstddef>
 #include <functional>
 
+namespace orvela {
+
 /// What the filters of the shadow, midtone and highlight levels share.
 namespace LevelMath {
 
@@ -89,3 +91,5 @@ WideTables factorMaps(float common, const std::array<float, 3>& own);
 WideTables gammaMaps(float gamma);
 
 } // namespace LevelMath
+
+} // namespace orvela

@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+namespace orvela {
+
 /// The contrast curve about a pivot level, in single precision.
 namespace PivotCurve {
 
@@ -22,3 +24,5 @@ inline float apply(float value, float pivot, float k) {
 }
 
 } // namespace PivotCurve
+
+} // namespace orvela

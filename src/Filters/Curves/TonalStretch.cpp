@@ -5,6 +5,8 @@
 #include <algorithm>
 #include <cmath>
 
+namespace orvela {
+
 namespace TonalStretch {
 
 std::optional<int> scanLeft(const Histogram& bins, double threshold, int last) {
@@ -82,3 +84,5 @@ float liftHighlights(float value, float white) {
 }
 
 } // namespace TonalStretch
+
+} // namespace orvela

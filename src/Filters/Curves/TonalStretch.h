@@ -5,6 +5,8 @@
 #include <array>
 #include <optional>
 
+namespace orvela {
+
 /// What the automatic contrast and colour filters share: limits read off 256-bin histograms, and the curves
 /// that stretch between them.
 namespace TonalStretch {
@@ -50,3 +52,5 @@ float pullShadows(float value, float black);
 float liftHighlights(float value, float white);
 
 } // namespace TonalStretch
+
+} // namespace orvela

@@ -4,6 +4,8 @@
 
 #include <algorithm>
 
+namespace orvela {
+
 namespace {
 
 constexpr int kTileWidth = 256;
@@ -129,3 +131,5 @@ void BilateralKernel::applyRowPlain(const CARGBPlane& in, CARGBPlane& out, int y
             out.row(y)[c][x] = static_cast<std::uint8_t>(static_cast<float>(sums[c] / weightSum));
     }
 }
+
+} // namespace orvela

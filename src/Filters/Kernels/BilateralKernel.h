@@ -2,6 +2,8 @@
 
 #include "Utility/CARGBPlane.h"
 
+namespace orvela {
+
 /// The pixel operation of the noise filter: a 3x3 average weighted by distance in place and in colour.
 ///
 ///     out = sum of w * c / sum of w,   w = range[D] * spatial[d^2]
@@ -29,3 +31,5 @@ private:
     const float* mSpatial;
     const float* mRange;
 };
+
+} // namespace orvela

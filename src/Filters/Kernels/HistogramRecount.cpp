@@ -1,9 +1,11 @@
 #include "Filters/Kernels/HistogramRecount.h"
 
-#include "Histograms/IHistogram.h"
+#include "Filters/Kernels/PixelMath.h"
 #include "Utility/RowScheduler.h"
 
 #include <mutex>
+
+namespace orvela {
 
 namespace {
 
@@ -64,3 +66,5 @@ void recountHistograms(const CARGBPlane& plane, CUserParams& params, unsigned ro
     store(total.green, params.pHisto_Green);
     store(total.blue, params.pHisto_Blue);
 }
+
+} // namespace orvela

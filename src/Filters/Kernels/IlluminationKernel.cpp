@@ -1,10 +1,12 @@
 #include "Filters/Kernels/IlluminationKernel.h"
 
-#include "Utility/RowScheduler.h"
 #include "Filters/Kernels/Simd.h"
+#include "Utility/RowScheduler.h"
 
 #include <algorithm>
 #include <cmath>
+
+namespace orvela {
 
 namespace {
 
@@ -113,3 +115,5 @@ void IlluminationKernel::applyPixel(const CARGBPlane& in, CARGBPlane& out, int x
     for (std::size_t c = 0; c < 3; ++c)
         target[c][x] = result(here[c][x], static_cast<int>(sums[c]), k);
 }
+
+} // namespace orvela

@@ -6,6 +6,8 @@
 #include <cstdint>
 #include <vector>
 
+namespace orvela {
+
 /// The pixel operation that both illumination iterations share: each sample is multiplied by a sigmoid gain
 /// that compares it with a weighted surround of the pixel itself and its left, upper and upper-left
 /// neighbours.
@@ -43,3 +45,5 @@ private:
     float mInteriorFactor;            ///< k where the window is whole
     std::vector<std::uint8_t> mTable; ///< interior results by sample and sum; empty when computed directly
 };
+
+} // namespace orvela

@@ -6,6 +6,8 @@
 #include <algorithm>
 #include <cmath>
 
+namespace orvela {
+
 namespace {
 
 constexpr int kWindow = 2 * MoireKernel::kRadius + 1;
@@ -166,3 +168,5 @@ bool MoireKernel::differs(const CARGBPlane& in, const ConstRow& host, int x, int
     }
     return true;
 }
+
+} // namespace orvela

@@ -4,6 +4,8 @@
 
 #include <array>
 
+namespace orvela {
+
 /// The pixel operation of the moire guard: where a darkness-biased Gaussian average of the 5x5 neighbourhood
 /// lies more than 15 levels from the unprocessed host pixel in all three channels, the host pixel is put
 /// back.
@@ -38,3 +40,5 @@ private:
     std::array<float, 2 * kRadius* kRadius + 1> mGauss = {};  ///< weights by squared distance
     std::array<float, 2 * kRadius* kRadius + 1> mShares = {}; ///< the same over the sum of a whole window's
 };
+
+} // namespace orvela

@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <cstdint>
 
+namespace orvela {
+
 /// Arithmetic that several filters share.
 namespace PixelMath {
 
@@ -56,3 +58,5 @@ inline int samplingStep(int width, int height) {
 }
 
 } // namespace PixelMath
+
+} // namespace orvela

@@ -8,6 +8,8 @@
 #include <cstddef>
 #include <cstdint>
 
+namespace orvela {
+
 // How filters map the samples of a row: by a function of the pixel, or by curves of one channel value that
 // are worked out for all 256 values beforehand. The rows that a mapping reads and writes may be the same.
 
@@ -63,3 +65,5 @@ inline void mapKeepingHue(const WideTables& tables, const ConstRow& in, const Ro
         return PixelMath::keepHue({tables[0][r], tables[1][g], tables[2][b]});
     });
 }
+
+} // namespace orvela

@@ -6,6 +6,8 @@
 #include <array>
 #include <cmath>
 
+namespace orvela {
+
 namespace {
 
 constexpr int kTileWidth = 256;
@@ -155,3 +157,5 @@ PixelMath::Rgb SaturationKernel::resaturate(int r, int g, int b) const {
     const std::array<float, 3> c = fromHsv(hueOf(r, g, b, largest, range), saturation, v);
     return {PixelMath::trunc(255 * c[0]), PixelMath::trunc(255 * c[1]), PixelMath::trunc(255 * c[2])};
 }
+
+} // namespace orvela

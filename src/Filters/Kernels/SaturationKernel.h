@@ -5,6 +5,8 @@
 
 #include <vector>
 
+namespace orvela {
+
 /// Changes the saturation of pixels in HSV space, hue and largest channel staying as they are:
 ///
 ///     lowering   Sat' = Sat - Sat * alfa
@@ -30,3 +32,5 @@ private:
     std::vector<float>
         mSaturations; ///< new saturations by the largest channel * 256 + the range of the channels
 };
+
+} // namespace orvela

@@ -5,6 +5,8 @@
 
 #include <algorithm>
 
+namespace orvela {
+
 namespace {
 
 constexpr float kLargestProduct = 1e9; // keeps extreme ratios within integers
@@ -53,3 +55,5 @@ void ScaledTile::store(const Row& out, int first, int count) const {
     for (std::size_t c = 0; c < 3; ++c)
         write(products.channel[c], out[c] + first, count);
 }
+
+} // namespace orvela

@@ -5,6 +5,8 @@
 
 #include <algorithm>
 
+namespace orvela {
+
 /// A run of recoloured pixels on their way into a row, each with the ratio that restores its brightness.
 struct ScaledTile {
     static constexpr int kWidth = 256;
@@ -36,3 +38,5 @@ void recolourRow(const Row& out, int first, int last, Fill fill) {
         tile.store(out, start, count);
     }
 }
+
+} // namespace orvela

@@ -6,6 +6,8 @@
 #include <cmath>
 #include <limits>
 
+namespace orvela {
+
 namespace {
 
 constexpr int kWindow = 2 * SmoothingKernel::kRadius + 1;
@@ -143,3 +145,5 @@ bool SmoothingKernel::isSmooth(const CARGBPlane& in, int x, int y) const {
     }
     return variation / (static_cast<float>(brightness) / Gauss_denominator) < mThreshold;
 }
+
+} // namespace orvela

@@ -4,6 +4,8 @@
 
 #include <array>
 
+namespace orvela {
+
 /// The pixel operation of the edge-aware smoothing: where the colour variation D in the 5x5 window is small
 /// compared with the window's brightness M, the pixel becomes a Gaussian-weighted average.
 ///
@@ -30,3 +32,5 @@ private:
     std::array<float, 10> mGauss = {}; ///< weights by squared distance, entries 0 to 8
     float mThreshold; ///< the smallest float not below the threshold: the comparison is the same
 };
+
+} // namespace orvela

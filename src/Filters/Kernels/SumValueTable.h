@@ -8,6 +8,8 @@
 #include <cstdint>
 #include <vector>
 
+namespace orvela {
+
 /// A curve of a channel value that also depends on its pixel's R + G + B, worked out for every pair that a
 /// pixel can have. 196 KB.
 class SumValueTable {
@@ -53,3 +55,5 @@ public:
 private:
     std::vector<std::uint8_t> mValues;
 };
+
+} // namespace orvela

@@ -12,6 +12,8 @@
 #include <QPainter>
 #include <QScopedValueRollback>
 
+using namespace orvela;
+
 namespace {
 
 constexpr QSize kSize(100, 14);

@@ -8,6 +8,8 @@
 #include <QPainter>
 #include <QPixmap>
 
+using namespace orvela;
+
 namespace {
 
 QString fieldPath() {

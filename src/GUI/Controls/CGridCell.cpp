@@ -2,6 +2,8 @@
 
 #include <QImage>
 
+using namespace orvela;
+
 CGridCell::CGridCell(const CARGBPlane& plane, int left, int top, int right, int bottom)
     : mPlane(plane), mLeft(left), mTop(top), mRight(right), mBottom(bottom) {}
 

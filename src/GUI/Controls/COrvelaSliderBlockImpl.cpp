@@ -9,6 +9,8 @@
 #include <algorithm>
 #include <cmath>
 
+using namespace orvela;
+
 namespace {
 
 constexpr double kLastPosition = 1000;

@@ -24,11 +24,11 @@ public:
     bool isEnabled() const;
 
     /// The map between position and shown number; both are the same until set. Shows nothing anew.
-    void setScale(const SliderScale& scale) { mScale = scale; }
+    void setScale(const orvela::SliderScale& scale) { mScale = scale; }
 
-    const QList<ZoneStop>& zoneStops() const;
+    const QList<orvela::ZoneStop>& zoneStops() const;
     /// Colours of the track, in rising order of position.
-    void setZoneStops(const QList<ZoneStop>& stops);
+    void setZoneStops(const QList<orvela::ZoneStop>& stops);
 
 public Q_SLOTS:
     void on_sldrValue_valueChanged(double position);
@@ -66,6 +66,6 @@ private:
     void fitToFont();
     void fitToPalette();
 
-    SliderScale mScale;
+    orvela::SliderScale mScale;
     CDoubleValidator_FixUp* mValidator;
 };

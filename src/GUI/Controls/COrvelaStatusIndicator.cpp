@@ -8,6 +8,8 @@
 
 #include <algorithm>
 
+using namespace orvela;
+
 namespace {
 
 constexpr int kHeight = 18;

@@ -11,6 +11,8 @@
 
 #include <algorithm>
 
+using namespace orvela;
+
 namespace {
 
 constexpr int kHeight = 7;

@@ -26,9 +26,9 @@ public:
     /// True from a mouse press to its release.
     bool isDragging() const { return mDragging; }
 
-    const QList<ZoneStop>& zoneStops() const { return mStops; }
+    const QList<orvela::ZoneStop>& zoneStops() const { return mStops; }
     /// @param stops  in rising order of position; fewer than two are replaced by a default when painted
-    void setZoneStops(const QList<ZoneStop>& stops);
+    void setZoneStops(const QList<orvela::ZoneStop>& stops);
 
     /// Replaces how keys and wheel step; the plain addition at first.
     void setStepper(const Stepper& stepper) { mStepper = stepper; }
@@ -71,6 +71,6 @@ private:
     double mValue = 0;
     bool mDragging = false;
     double mWheelRest = 0;
-    QList<ZoneStop> mStops;
+    QList<orvela::ZoneStop> mStops;
     Stepper mStepper;
 };

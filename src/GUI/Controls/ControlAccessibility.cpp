@@ -7,6 +7,8 @@
 
 #include <QAccessibleWidget>
 
+namespace orvela {
+
 namespace {
 
 // A slider: its value is the number shown beside it, its range that of the positions.
@@ -92,3 +94,5 @@ void installControlAccessibility() {
     static const bool installed = (QAccessible::installFactory(makeAccess), true);
     static_cast<void>(installed);
 }
+
+} // namespace orvela

@@ -5,6 +5,8 @@
 #include <algorithm>
 #include <cmath>
 
+namespace orvela {
+
 namespace CrispPaint {
 
 QRectF onGrid(const QPainter& painter, const QRectF& rect) {
@@ -26,3 +28,5 @@ void frame(QPainter& painter, const QRectF& rect, const QColor& color) {
 }
 
 } // namespace CrispPaint
+
+} // namespace orvela

@@ -5,6 +5,8 @@
 
 class QPainter;
 
+namespace orvela {
+
 /// Drawing on whole device pixels, so that edges stay sharp at fractional scale factors too.
 namespace CrispPaint {
 
@@ -15,3 +17,5 @@ QRectF onGrid(const QPainter& painter, const QRectF& rect);
 void frame(QPainter& painter, const QRectF& rect, const QColor& color);
 
 } // namespace CrispPaint
+
+} // namespace orvela

@@ -6,6 +6,8 @@
 #include <QGraphicsScene>
 #include <QPen>
 
+namespace orvela {
+
 namespace PreviewScene {
 
 namespace {
@@ -44,3 +46,5 @@ void show(QGraphicsScene& scene, const CARGBPlane& plane, QSize tile) {
 }
 
 } // namespace PreviewScene
+
+} // namespace orvela

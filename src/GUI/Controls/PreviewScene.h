@@ -5,6 +5,8 @@
 class CARGBPlane;
 class QGraphicsScene;
 
+namespace orvela {
+
 /// Fills preview scenes.
 namespace PreviewScene {
 
@@ -16,3 +18,5 @@ void show(QGraphicsScene& scene, const CARGBPlane& plane);
 void show(QGraphicsScene& scene, const CARGBPlane& plane, QSize tile);
 
 } // namespace PreviewScene
+
+} // namespace orvela

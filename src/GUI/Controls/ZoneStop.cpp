@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <cmath>
 
+namespace orvela {
+
 namespace {
 
 int mixed(int from, int to, double share) {
@@ -24,3 +26,5 @@ QColor zoneColor(const QList<ZoneStop>& stops, double position) {
                   mixed(before.color.green(), next->color.green(), share),
                   mixed(before.color.blue(), next->color.blue(), share));
 }
+
+} // namespace orvela

@@ -4,6 +4,8 @@
 #include "Utility/DebugBoxes.h"
 #include "Utility/Logger.h"
 
+using namespace orvela;
+
 CWgtPane3SlidersImpl::CWgtPane3SlidersImpl(QWidget* owner, EGUIMode mode) : IWgtPane(owner, mode) {
     setupUi(this);
     doSetSliders(QString());

@@ -4,6 +4,8 @@
 #include "Settings/FactoryPresets.h"
 #include "Utility/Logger.h"
 
+using namespace orvela;
+
 CWgtPaneAdvancedImpl::CWgtPaneAdvancedImpl(QWidget* owner, EGUIMode mode) : IWgtPane(owner, mode) {
     mShowsPresets = true;
     setupUi(this);

@@ -6,6 +6,8 @@
 #include <QComboBox>
 #include <QTabBar>
 
+using namespace orvela;
+
 namespace {
 
 // The signal's own value is what was set; the block may have moved it to what its text tells. A block that

@@ -3,6 +3,8 @@
 #include "Core/CThreadedCore_Orvela.h"
 #include "GUI/Controls/CColorPicker.h"
 
+using namespace orvela;
+
 namespace {
 
 constexpr int kSliderWidth = 240; // pixels

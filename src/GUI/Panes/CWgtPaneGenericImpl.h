@@ -18,6 +18,6 @@ public:
 private:
     void addColorPicker(const CSliderParams& settings);
 
-    const SliderDescription* mSlider;
+    const orvela::SliderDescription* mSlider;
     CColorPicker* mPicker = nullptr;
 };

@@ -7,6 +7,8 @@
 #include "GUI/Panes/TrackZones.h"
 #include "Utility/Logger.h"
 
+using namespace orvela;
+
 namespace {
 
 constexpr double kMiddle = 500;

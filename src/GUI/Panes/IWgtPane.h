@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Settings/CUserParams.h"
 #include "Settings/SliderTable.h"
 
 #include <QWidget>
@@ -54,20 +55,20 @@ Q_SIGNALS:
 
 protected:
     /// The block that `slider` describes.
-    COrvelaSliderBlockImpl* block(const SliderDescription& slider) const;
+    COrvelaSliderBlockImpl* block(const orvela::SliderDescription& slider) const;
 
     /// Labels the block, puts it to position 500 and tells the owner of its changes. Further calls make the
     /// owner hear of a change once more.
     void setUpSlider(COrvelaSliderBlockImpl* block, const QString& label);
     /// Gives the slider's block all that its description holds, the state and the position (0 to 1000).
-    void setUpSlider(const SliderDescription& slider, bool on, double position);
+    void setUpSlider(const orvela::SliderDescription& slider, bool on, double position);
     /// Sets up every slider with the states and positions of `settings`.
-    void setUpSliders(std::span<const SliderDescription> sliders, const CSliderParams& settings);
+    void setUpSliders(std::span<const orvela::SliderDescription> sliders, const CSliderParams& settings);
     /// Tells the owner of the picker's changes and shows it while its slider is on.
     void setUpColorPicker(CColorPicker* picker, COrvelaSliderBlockImpl* slider);
 
     /// Writes position and state of every slider into the fields that it drives.
-    void writeSliders(std::span<const SliderDescription> sliders, CSliderParams& settings) const;
+    void writeSliders(std::span<const orvela::SliderDescription> sliders, CSliderParams& settings) const;
 
     /// The colour of the colour filter.
     static QColor filterColor(const CSliderParams& settings);

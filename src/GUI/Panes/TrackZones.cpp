@@ -3,6 +3,8 @@
 #include <iterator>
 #include <vector>
 
+namespace orvela {
+
 namespace TrackZones {
 
 namespace {
@@ -61,3 +63,5 @@ QList<ZoneStop> set(int number) {
 }
 
 } // namespace TrackZones
+
+} // namespace orvela

@@ -2,6 +2,8 @@
 
 #include "GUI/Controls/ZoneStop.h"
 
+namespace orvela {
+
 /// The numbered sets of track colours that tell mild from strong and extreme positions.
 namespace TrackZones {
 
@@ -9,3 +11,5 @@ namespace TrackZones {
 QList<ZoneStop> set(int number);
 
 } // namespace TrackZones
+
+} // namespace orvela

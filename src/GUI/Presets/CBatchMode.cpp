@@ -9,6 +9,8 @@
 #include <QMessageBox>
 #include <QSettings>
 
+using namespace orvela;
+
 namespace {
 
 const QString kEnabled = QStringLiteral("batchModeEnabled");

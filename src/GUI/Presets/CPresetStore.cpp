@@ -13,6 +13,8 @@
 
 #include <algorithm>
 
+using namespace orvela;
+
 namespace {
 
 QString text(const char* source) {

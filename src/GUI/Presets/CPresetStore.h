@@ -8,10 +8,10 @@ class QWidget;
 /// Nothing is cached: each operation opens the store, reads or writes, and closes it.
 namespace CPresetStore {
 
-using FactoryPresets::factoryPresetMode;
-using FactoryPresets::factoryPresetName;
-using FactoryPresets::isFactoryMode;
-using FactoryPresets::isFactoryPresetName;
+using orvela::FactoryPresets::factoryPresetMode;
+using orvela::FactoryPresets::factoryPresetName;
+using orvela::FactoryPresets::isFactoryMode;
+using orvela::FactoryPresets::isFactoryPresetName;
 
 /// The reserved name under which the last accepted run's settings are kept.
 QString batchPresetName();

@@ -4,6 +4,8 @@
 
 #include <QMessageBox>
 
+namespace orvela {
+
 static_assert(DebugBoxes::Ok == int(QMessageBox::Ok));
 
 namespace {
@@ -19,3 +21,5 @@ int present(void* parent, const QString& title, const QString& text, int buttons
 void installMessageBoxes() {
     DebugBoxes::setPresenter(present);
 }
+
+} // namespace orvela

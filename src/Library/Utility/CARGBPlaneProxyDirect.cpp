@@ -2,6 +2,8 @@
 
 #include <atomic>
 
+using namespace orvela;
+
 namespace {
 std::atomic<CARGBPlaneProxy*> gCurrent = nullptr;
 }

@@ -14,6 +14,8 @@
 
 #include <thread>
 
+using namespace orvela;
+
 namespace {
 
 using testing::ElementsAre;

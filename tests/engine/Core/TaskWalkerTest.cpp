@@ -3,8 +3,8 @@
 #include "Core/CThreadedCore_FinalTouch.h"
 #include "Core/CThreadedCore_Orvela.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
-#include "Utility/CGenericEx.h"
 #include "Settings/ModeTable.h"
+#include "Utility/CGenericEx.h"
 #include "Utility/RowScheduler.h"
 #include "support/StatisticMap.h"
 #include "support/TaskSettings.h"
@@ -14,6 +14,8 @@
 
 #include <cmath>
 #include <set>
+
+using namespace orvela;
 
 namespace {
 

@@ -3,6 +3,8 @@
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
 #include "StretchTestSupport.h"
 
+using namespace orvela;
+
 using namespace stretchtest;
 
 namespace {

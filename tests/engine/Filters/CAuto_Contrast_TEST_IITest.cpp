@@ -2,6 +2,8 @@
 
 #include "StretchTestSupport.h"
 
+using namespace orvela;
+
 using namespace stretchtest;
 
 TEST(CAuto_Contrast_TEST_II, GeneratedAndHazyPictures) {

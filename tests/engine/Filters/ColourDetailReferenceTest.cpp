@@ -6,6 +6,8 @@
 
 #include <fstream>
 
+using namespace orvela;
+
 namespace {
 
 // A picture from hexadecimal RGB bytes.

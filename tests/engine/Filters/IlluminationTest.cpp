@@ -8,6 +8,8 @@
 
 #include <gtest/gtest.h>
 
+using namespace orvela;
+
 namespace {
 
 using testplanes::at;

@@ -9,6 +9,8 @@
 
 #include <sstream>
 
+using namespace orvela;
+
 namespace {
 
 using testplanes::at;

@@ -5,6 +5,8 @@
 
 #include <gtest/gtest.h>
 
+using namespace orvela;
+
 namespace {
 
 // Ratios up to 3 and huge ones over noise, white and a single channel.

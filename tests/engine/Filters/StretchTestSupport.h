@@ -9,6 +9,8 @@
 
 #include <gtest/gtest.h>
 
+namespace orvela {
+
 /// What the tests of the automatic contrast and colour filters share.
 namespace stretchtest {
 
@@ -101,3 +103,5 @@ void expectHazyStretch(U params) {
 }
 
 } // namespace stretchtest
+
+} // namespace orvela

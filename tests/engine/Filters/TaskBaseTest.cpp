@@ -17,6 +17,8 @@
 #include <mutex>
 #include <set>
 
+using namespace orvela;
+
 namespace {
 
 using testing::ElementsAre;

@@ -10,6 +10,8 @@
 
 #include <gtest/gtest.h>
 
+using namespace orvela;
+
 namespace {
 
 using testplanes::at;

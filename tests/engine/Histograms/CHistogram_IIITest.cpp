@@ -7,6 +7,8 @@
 
 #include <gtest/gtest.h>
 
+using namespace orvela;
+
 namespace {
 
 template <typename Task>

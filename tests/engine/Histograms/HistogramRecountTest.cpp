@@ -6,6 +6,8 @@
 
 #include <gtest/gtest.h>
 
+using namespace orvela;
+
 using testplanes::Pixel;
 
 TEST(HistogramRecount, SamplesStartAnewInEachPiece) {

@@ -8,6 +8,8 @@
 
 #include <cmath>
 
+using namespace orvela;
+
 namespace {
 
 const std::vector<std::string> kSampled = {"CHistogram0",    "CHistogram_III",  "CHistogram_IV",

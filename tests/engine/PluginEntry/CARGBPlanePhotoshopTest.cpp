@@ -7,6 +7,8 @@
 #include <cstring>
 #include <vector>
 
+using namespace orvela;
+
 namespace {
 
 /// A host whose buffers are the image's own planes, each with padded rows of `stride` samples.

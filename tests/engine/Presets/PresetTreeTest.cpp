@@ -1,12 +1,14 @@
+#include "Settings/ModeTable.h"
 #include "Settings/PresetConversion.h"
 #include "Utility/CGenericEx.h"
-#include "Settings/ModeTable.h"
 
 #include <QElapsedTimer>
 #include <QPoint>
 #include <QSettings>
 
 #include <gtest/gtest.h>
+
+using namespace orvela;
 
 namespace {
 

@@ -15,6 +15,8 @@
 #include <csignal>
 #include <functional>
 
+using namespace orvela;
+
 namespace {
 
 class SettingsEditTest : public testing::Test {

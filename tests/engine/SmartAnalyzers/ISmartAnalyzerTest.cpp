@@ -11,6 +11,8 @@
 #include <fstream>
 #include <string>
 
+using namespace orvela;
+
 namespace {
 
 // Parameters with patterned histograms whose statistics hold a value that no analyzer writes.

@@ -11,6 +11,8 @@
 
 #include <gtest/gtest.h>
 
+using namespace orvela;
+
 namespace {
 
 TEST(CARGBPlane, EmptyPlaneTakesSizeSamplesAndModeOfItsSource) {

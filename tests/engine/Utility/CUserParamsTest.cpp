@@ -1,7 +1,7 @@
 #include "Settings/CUserParams.h"
 
-#include "Utility/DebugBoxes.h"
 #include "Settings/ModeTable.h"
+#include "Utility/DebugBoxes.h"
 #include "support/LogCapture.h"
 #include "support/ParamsText.h"
 
@@ -11,6 +11,8 @@
 #include <gtest/gtest.h>
 
 #include <map>
+
+using namespace orvela;
 
 namespace {
 

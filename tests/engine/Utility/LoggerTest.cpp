@@ -12,6 +12,8 @@
 #include <fstream>
 #include <thread>
 
+using namespace orvela;
+
 namespace {
 
 using testing::ElementsAre;

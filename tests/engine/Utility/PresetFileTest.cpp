@@ -6,6 +6,8 @@
 
 #include <gtest/gtest.h>
 
+using namespace orvela;
+
 namespace {
 
 class PresetFileTest : public testing::Test {

@@ -5,6 +5,8 @@
 #include <map>
 #include <string>
 
+using namespace orvela;
+
 namespace {
 
 // One of each kind of scale.

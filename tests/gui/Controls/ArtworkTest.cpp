@@ -8,6 +8,8 @@
 
 #include <map>
 
+using namespace orvela;
+
 namespace {
 
 qsizetype colorsOf(const QImage& image) {

@@ -14,6 +14,8 @@
 
 #include <cmath>
 
+using namespace orvela;
+
 namespace {
 
 const QColor kGreen(0, 255, 40);

@@ -12,6 +12,8 @@
 
 #include <cstdlib>
 
+using namespace orvela;
+
 namespace {
 
 /// A plane whose samples tell their place: red 10 x, green 10 y, blue x + y.

@@ -13,6 +13,8 @@
 
 #include <cmath>
 
+using namespace orvela;
+
 namespace {
 
 /// A block with the scale "tenth" (0 to 100), shown in an active window with a second block below it.

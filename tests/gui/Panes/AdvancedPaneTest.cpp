@@ -6,6 +6,8 @@
 
 #include <gtest/gtest.h>
 
+using namespace orvela;
+
 namespace {
 
 class AdvancedPane : public testing::Test {

@@ -10,6 +10,8 @@
 
 #include <map>
 
+using namespace orvela;
+
 namespace {
 
 class FinalTouchPane : public testing::Test {

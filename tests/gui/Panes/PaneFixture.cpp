@@ -1,15 +1,17 @@
 #include "PaneFixture.h"
 
 #include "Core/CThreadedCore.h"
+#include "Settings/SettingFields.h"
 #include "Utility/CARGBPlane.h"
 #include "Utility/DebugBoxes.h"
-#include "Settings/SettingFields.h"
 
 #include <QSignalSpy>
 
 #include <gtest/gtest.h>
 
 #include <cmath>
+
+namespace orvela {
 
 namespace {
 
@@ -113,3 +115,5 @@ QStringList boxes(const std::function<void()>& action) {
     DebugBoxes::setPresenter(nullptr);
     return gBoxes;
 }
+
+} // namespace orvela

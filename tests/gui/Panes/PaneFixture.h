@@ -7,6 +7,8 @@
 #include <QColor>
 #include <QVBoxLayout>
 
+namespace orvela {
+
 /// Stands in for the window of a pane and records what it is told.
 class RecordingOwner : public QWidget {
     Q_OBJECT
@@ -61,3 +63,5 @@ void expectLeadsOn(IWgtPane* pane, QAbstractButton* button, const char* coreClas
 
 /// "title|text" of every box shown while `action` runs.
 QStringList boxes(const std::function<void()>& action);
+
+} // namespace orvela

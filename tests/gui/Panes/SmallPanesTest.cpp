@@ -9,6 +9,8 @@
 
 #include <map>
 
+using namespace orvela;
+
 namespace {
 
 void expectPlainPane(IWgtPane* pane) {

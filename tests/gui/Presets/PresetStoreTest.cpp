@@ -4,9 +4,9 @@
 #include "GUI/Presets/CBatchMode.h"
 #include "GUI/Presets/CPresetStore.h"
 #include "Platform/Keyboard.h"
+#include "Settings/ModeTable.h"
 #include "Settings/PresetConversion.h"
 #include "Utility/CGenericEx.h"
-#include "Settings/ModeTable.h"
 #include "support/LogCapture.h"
 
 #include <QApplication>
@@ -17,6 +17,8 @@
 #include <QTimer>
 
 #include <gtest/gtest.h>
+
+using namespace orvela;
 
 namespace {
 

@@ -2,6 +2,8 @@
 
 #include <unistd.h>
 
+using namespace orvela;
+
 namespace {
 
 class EnhanceCommandTest : public ProgramTest {};

@@ -13,6 +13,8 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+using namespace orvela;
+
 namespace {
 
 // What the program writes to a terminal on its standard error.

@@ -2,6 +2,8 @@
 
 #include <QSettings>
 
+using namespace orvela;
+
 namespace {
 
 class PresetsCommand : public ProgramTest {

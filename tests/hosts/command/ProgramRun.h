@@ -8,6 +8,8 @@
 
 #include <string>
 
+namespace orvela {
+
 /// What the program answered.
 struct Answer {
     int status = -1;
@@ -67,3 +69,5 @@ protected:
 
     QTemporaryDir mFolder;
 };
+
+} // namespace orvela

@@ -8,6 +8,8 @@
 #include <QJsonDocument>
 #include <QJsonObject>
 
+using namespace orvela;
+
 namespace {
 
 std::string refusal(const SettingOptions& options) {

@@ -7,6 +7,8 @@
 
 #include <cstdlib>
 
+using namespace orvela;
+
 namespace {
 
 Photograph counting(ColorModel model, int depth, int width, int height) {

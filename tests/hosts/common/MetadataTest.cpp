@@ -6,6 +6,8 @@
 
 #include <gmock/gmock.h>
 
+using namespace orvela;
+
 namespace {
 
 using testing::ElementsAre;

@@ -5,6 +5,8 @@
 #include <gmock/gmock.h>
 #include <sys/wait.h>
 
+using namespace orvela;
+
 namespace {
 
 std::string refusal(const std::filesystem::path& path) {

@@ -11,6 +11,8 @@
 
 #include <csignal>
 
+using namespace orvela;
+
 namespace {
 
 namespace fs = std::filesystem;

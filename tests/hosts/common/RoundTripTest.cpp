@@ -7,6 +7,8 @@
 #include <cmath>
 #include <ostream>
 
+using namespace orvela;
+
 namespace {
 
 // What the filter does when no task changes anything.
