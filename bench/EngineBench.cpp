@@ -116,7 +116,7 @@ void benchTask(benchmark::State& state, const PipelineTask& task, const Size& si
     tasksettings::measure(measured, scene.in, scene.out);
     measure(state, size, [&](Scene& each) {
         CUserParamsPhotoshop params = measured;
-        task.make(&params, &each.in, &each.out)->Apply();
+        task.make({}, &params, &each.in, &each.out)->Apply();
     });
 }
 
@@ -138,7 +138,7 @@ void benchBareRun(benchmark::State& state, EGUIMode mode, const Size& size) {
         for (const PipelineStep& step : PipelineTable::mainSteps()) {
             for (const PipelineTask& task : step.tasks) {
                 if (!task.condition || task.condition(params))
-                    task.make(&params, &scene.in, &scene.out)->Apply();
+                    task.make({}, &params, &scene.in, &scene.out)->Apply();
                 if (task.afterwards)
                     task.afterwards(params);
             }

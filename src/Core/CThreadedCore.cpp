@@ -1,7 +1,9 @@
 #include "Core/CThreadedCore.h"
 
+#include "Core/Snapshot.h"
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
+#include "Utility/RowScheduler.h"
 
 #include <QCoreApplication>
 #include <QThread>
@@ -26,12 +28,22 @@ void CThreadedCore::setParams(const CUserParamsPhotoshop& params) {
 }
 
 void CThreadedCore::run() {
+    const LogDepth ownDepth;
+    if (mContext.scheduler)
+        mContext.scheduler->execute([this] { runAnnounced(); });
+    else
+        runAnnounced();
+}
+
+void CThreadedCore::runAnnounced() {
     mTotalSteps = 0;
     mCurrentStep = 0;
     mRunThread = QThread::currentThread();
     mSinceService.start();
     mParams.mProgressCallback = [this](int percent) { reportProgress(percent); };
     mLastProcessingDone = false;
+    mReports.clear();
+    mFailure = {};
 
     announce(0, 1, "Duplicating Input Plane");
     emitPercentDone(0);
@@ -46,14 +58,31 @@ void CThreadedCore::run() {
 }
 
 bool CThreadedCore::runPipeline() {
-    mOutPlane->copyFrom(*mInPlane);
-    try {
+    const bool reachedEnd = guarded([this] {
+        mOutPlane->copyFrom(*mInPlane);
         return doRun();
+    });
+    // Filters hand their result on by exchanging the planes; both are to hold it.
+    const bool bothHoldIt = guarded([this] {
+        mOutPlane->copyFrom(*mInPlane);
+        return true;
+    });
+    return reachedEnd && bothHoldIt;
+}
+
+bool CThreadedCore::guarded(const std::function<bool()>& action) {
+    try {
+        return action();
     } catch (...) {
-        Log::log(LogLevel::Info, "%s %d", "Core/CThreadedCore", 50);
-        ExceptionStack::clear();
-        return false;
+        mFailure = Failure::current();
     }
+    Log::log(LogLevel::Info, "%s %d", "Core/CThreadedCore", 50);
+    ExceptionStack::clear();
+    return false;
+}
+
+std::unique_ptr<CARGBPlane> CThreadedCore::snapshot(const QRect& area, int reduction) const {
+    return takeSnapshot(*mInPlane, area, reduction);
 }
 
 void CThreadedCore::stop() {
@@ -92,9 +121,12 @@ void CThreadedCore::runTask(const PipelineTask& task) {
     if (!task.condition || task.condition(mParams)) {
         QElapsedTimer timer;
         timer.start();
-        const bool applied = task.make(&mParams, mInPlane, mOutPlane)->Apply();
+        const std::unique_ptr<TaskBase> made = task.make(mContext, &mParams, mInPlane, mOutPlane);
+        made->Apply();
+        mReports.push_back({task.name, task.kind, made->outcome(), made->failure(),
+                            static_cast<double>(timer.nsecsElapsed()) / 1e6});
         if (mObserver)
-            mObserver({task.name, task.kind, applied, static_cast<double>(timer.nsecsElapsed()) / 1e6});
+            mObserver(mReports.back());
     }
     if (task.afterwards)
         task.afterwards(mParams);

@@ -10,7 +10,10 @@
 
 #include <atomic>
 #include <functional>
+#include <memory>
+#include <vector>
 
+class QRect;
 class QThread;
 
 namespace orvela {
@@ -19,7 +22,8 @@ namespace orvela {
 struct TaskReport {
     const char* name; ///< class name of the task
     TaskKind kind;
-    bool applied; ///< false when it did not apply, failed or was cancelled
+    TaskOutcome outcome;
+    Failure failure;
     double milliseconds;
 };
 
@@ -27,8 +31,9 @@ struct TaskReport {
 
 /// Runs one enhancement of a whole image: a fixed sequence of tasks, announced step by step.
 ///
-/// The run executes on the thread that calls run(). Pending events of that thread are processed at every
-/// announcement and while rows are worked on, so that its handlers can stop the run. One run at a time.
+/// The run executes on the thread that calls run(), whichever it is. Pending events of that thread are
+/// processed at every announcement and while rows are worked on, so that its handlers can stop the run. One
+/// run at a time; other cores may run on other threads meanwhile.
 class CThreadedCore : public QObject {
     Q_OBJECT
 
@@ -42,6 +47,9 @@ public:
     /// The parameters as the last run left them.
     const CUserParamsPhotoshop& params() const { return mParams; }
 
+    /// What the tasks of the next runs share beside parameters and planes.
+    void setContext(const orvela::RunContext& context) { mContext = context; }
+
     /// Runs the pipeline; the result is told by lastProcessingDone() and the last announcement, "All Done" or
     /// "Failed". A stopped run walks on through its announcements and ends with "All Done".
     void run();
@@ -54,6 +62,17 @@ public:
 
     /// Calls `observer` after every task, on the thread of the run, before the next one starts.
     void setObserver(std::function<void(const orvela::TaskReport&)> observer);
+
+    /// What the tasks of the last run did, in their order; those that the run left out are missing.
+    const std::vector<orvela::TaskReport>& reports() const { return mReports; }
+
+    /// Why the last run ended with "Failed".
+    const orvela::Failure& failure() const { return mFailure; }
+
+    /// A copy of the picture as it stands between two tasks, for an observer or a receiver of stepDone(); to
+    /// be asked on the thread of the run. See orvela::takeSnapshot().
+    /// @throws CGenericEx when the memory cannot be had
+    std::unique_ptr<CARGBPlane> snapshot(const QRect& area, int reduction) const;
 
 Q_SIGNALS:
     /// Step number, number of steps, name of the step that starts now. The receiver answers with
@@ -87,7 +106,9 @@ protected:
     CUserParamsPhotoshop mParams;
 
 private:
+    void runAnnounced();
     bool runPipeline();
+    bool guarded(const std::function<bool()>& action);
     void reportProgress(int percent);
 
     QSemaphore mSemaphore;
@@ -96,5 +117,8 @@ private:
     std::atomic<int> mReportedPercent = 0; ///< latest percentage of any row
     QThread* mRunThread = nullptr;
     QElapsedTimer mSinceService;
+    orvela::RunContext mContext;
     std::function<void(const orvela::TaskReport&)> mObserver;
+    std::vector<orvela::TaskReport> mReports;
+    orvela::Failure mFailure;
 };

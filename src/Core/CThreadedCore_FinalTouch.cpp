@@ -27,12 +27,12 @@ bool CThreadedCore_FinalTouch::doRun() {
     mParams.Final_Touch_Mode_Enabled = true;
     try {
         mInPlane->copyFrom(*mOriginalPlane);
-        mOutPlane->copyFrom(*mOriginalPlane);
         for (const PipelineTask& task : PipelineTable::finalTouchTasks())
             runTask(task);
     } catch (...) {
         Log::scopeExit(LogLevel::Error, "Unable to complete the 16th filters block.");
-        throw CGenericEx(QStringLiteral("Unable to complete the 16th filters block."), kSource, 168);
+        std::throw_with_nested(
+            CGenericEx(QStringLiteral("Unable to complete the 16th filters block."), kSource, 168));
     }
     return true;
 }

@@ -54,16 +54,18 @@ namespace {
 
 template <typename Filter>
 PipelineTask filter(const char* name, bool (*condition)(const CUserParams&) = nullptr) {
-    const auto make = [](CUserParams* params, CARGBPlane* in, CARGBPlane* out) -> std::unique_ptr<TaskBase> {
-        return std::make_unique<Filter>(params, in, out);
+    const auto make = [](const RunContext& context, CUserParams* params, CARGBPlane* in,
+                         CARGBPlane* out) -> std::unique_ptr<TaskBase> {
+        return std::make_unique<Filter>(context, params, in, out);
     };
     return {name, TaskKind::Filter, make, condition};
 }
 
 template <typename Task>
 PipelineTask measurement(const char* name, TaskKind kind) {
-    const auto make = [](CUserParams* params, CARGBPlane* in, CARGBPlane*) -> std::unique_ptr<TaskBase> {
-        return std::make_unique<Task>(params, in);
+    const auto make = [](const RunContext& context, CUserParams* params, CARGBPlane* in,
+                         CARGBPlane*) -> std::unique_ptr<TaskBase> {
+        return std::make_unique<Task>(context, params, in);
     };
     return {name, kind, make};
 }

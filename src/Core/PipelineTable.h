@@ -14,7 +14,8 @@ enum class TaskKind { Filter, Histogram, Analyzer };
 struct PipelineTask {
     const char* name; ///< class name
     TaskKind kind;
-    std::unique_ptr<TaskBase> (*make)(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+    std::unique_ptr<TaskBase> (*make)(const RunContext& context, CUserParams* params, CARGBPlane* inPlane,
+                                      CARGBPlane* outPlane);
     bool (*condition)(const CUserParams& params) = nullptr; ///< whether to run it at all; null: always
     void (*afterwards)(CUserParams& params) = nullptr;      ///< what follows it, run or not
 };

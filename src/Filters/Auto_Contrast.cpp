@@ -5,7 +5,6 @@
 
 #include <algorithm>
 #include <cmath>
-#include <utility>
 
 using namespace orvela;
 
@@ -21,28 +20,15 @@ bool lacksOneColour(const CUserParams& params) {
 
 } // namespace
 
-Auto_Contrast::Auto_Contrast(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
-    : IFilter(params, inPlane, outPlane) {
-    mName = "Auto_Contrast";
-}
-
-bool Auto_Contrast::PreApply() {
-    if (!applies())
-        return false;
-    Log::log(LogLevel::Debug, "Applying CAuto_Contrast filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
-    Log::log(LogLevel::Debug, "IN 2 AUTOCONTRAST MODE DETECTED");
-    Log::log(LogLevel::Debug, "Bicromic:%d", mParams->Bicromic);
-
-    mParams->Shift_Level = 1.0F;
-    scanChannels(PixelMath::trunc(TonalStretch::baseThreshold(mInPlane->pixelCount())));
-    mParams->m_Opaco = mLimits.isHazy();
-    mThreshold = chooseThreshold();
-    scanChannels(mThreshold);
-    mCurve = makeTable([this](int value) {
-        return mParams->m_Opaco ? hazyCurve(value, mLimits) : normalCurve(value, mLimits);
-    });
-    return true;
+const TaskDescription& Auto_Contrast::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/Auto_Contrast",
+        .line = 325,
+        .dumpName = "Auto_Contrast",
+        .opening = "Applying CAuto_Contrast filter from plane at 0x%x to plane at 0x%x...",
+        .completion = "Auto Contrast filter complete.",
+    };
+    return kDescription;
 }
 
 bool Auto_Contrast::applies() {
@@ -52,26 +38,40 @@ bool Auto_Contrast::applies() {
            !sliders.ContrastEnabled && !sliders.BrightnessEnabled && !mParams->Under_Exposed_Picture;
 }
 
+void Auto_Contrast::prepare() {
+    Log::log(LogLevel::Debug, "IN 2 AUTOCONTRAST MODE DETECTED");
+    Log::log(LogLevel::Debug, "Bicromic:%d", mParams->Bicromic);
+    mParams->Shift_Level = 1.0F;
+    scanChannels(PixelMath::trunc(TonalStretch::baseThreshold(mInPlane->pixelCount())));
+    mParams->m_Opaco = mLimits.isHazy();
+    scanChannels(chooseThreshold());
+    mCurve = makeTable([this](int value) {
+        return mParams->m_Opaco ? hazyCurve(value, mLimits) : normalCurve(value, mLimits);
+    });
+}
+
 // A scan that finds nothing keeps the limit of the pass before.
 void Auto_Contrast::scanChannels(double threshold) {
-    static constexpr std::array kNames = {" C_Red", " C_Green", "  C_Blue"};
+    static constexpr std::array kLeftNames = {"C_Red", "C_Green", " C_Blue"};
+    static constexpr std::array kNames = {"C_Red", "C_Green", "C_Blue"};
     static constexpr std::array kLeftEnds = {255, 254, 254};
     const auto histograms = TonalStretch::channelHistograms(*mParams);
     threshold *= mParams->Shift_Level;
     for (std::size_t c = 0; c < 3; ++c) {
         if (const auto i = TonalStretch::scanLeft(*histograms[c], threshold, kLeftEnds[c])) {
             mChannels[c].black = *i;
-            Log::log(LogLevel::Debug, "i=%s_Left_limit:%d %f", kNames[c], *i, static_cast<double>(*i));
+            Log::log(LogLevel::Debug, "i= %s_Left_limit:%d %f", kLeftNames[c], *i, static_cast<double>(*i));
         }
         if (const auto i = TonalStretch::scanRight(*histograms[c], threshold, 2)) {
             mChannels[c].white = *i;
-            Log::log(LogLevel::Debug, "i=%s_Right_limit:%d %f", kNames[c], *i, static_cast<double>(*i));
+            Log::log(LogLevel::Debug, "i= %s_Right_limit:%d %f", kNames[c], *i, static_cast<double>(*i));
         }
     }
     mLimits = TonalStretch::combine(mChannels);
 }
 
-int Auto_Contrast::chooseThreshold() {
+// Of the second scans, in samples.
+int Auto_Contrast::chooseThreshold() const {
     const double root = std::sqrt(static_cast<double>(mInPlane->pixelCount()));
     if (mParams->m_Opaco) {
         Log::log(LogLevel::Debug, "m_Opaco: %d ", mParams->m_Opaco);
@@ -97,13 +97,6 @@ std::uint8_t Auto_Contrast::normalCurve(int value, TonalStretch::Limits limits) 
     return static_cast<std::uint8_t>(TonalStretch::liftHighlights(pulled, static_cast<float>(limits.white)));
 }
 
-void Auto_Contrast::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/Auto_Contrast", 325);
-    const int y = static_cast<int>(row);
-    mapRow(mCurve, std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
-}
-
-bool Auto_Contrast::PostApply() {
-    Log::log(LogLevel::Debug, "Auto Contrast filter complete.");
-    return true;
+void Auto_Contrast::mapRow(const PixelRow& row) const {
+    mapChannels(mCurve, row);
 }

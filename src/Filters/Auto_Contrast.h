@@ -1,8 +1,8 @@
 #pragma once
 
 #include "Filters/Curves/TonalStretch.h"
-#include "Filters/IFilter.h"
 #include "Filters/Kernels/RowMapping.h"
+#include "Filters/PointFilter.h"
 
 /// The contrast step of the automatic-contrast mode: one black limit L and one white limit R, combined from
 /// the channel histograms, stretch all three channels. A hazy picture (R < 215 and L > 40) is stretched hard,
@@ -13,9 +13,9 @@
 ///
 /// Stays away from pictures with a colour cast (it sets Bicromic) and from under-exposed ones, and gives way
 /// to manual contrast and brightness.
-class Auto_Contrast final : public IFilter {
+class Auto_Contrast final : public orvela::PointFilter {
 public:
-    Auto_Contrast(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+    using orvela::PointFilter::PointFilter;
 
     /// New value of a channel value (0 to 255) in a hazy picture; with equal limits 255.
     static std::uint8_t hazyCurve(int value, orvela::TonalStretch::Limits limits);
@@ -23,17 +23,16 @@ public:
     static std::uint8_t normalCurve(int value, orvela::TonalStretch::Limits limits);
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
-    bool applies();
     void scanChannels(double threshold);
-    int chooseThreshold();
+    int chooseThreshold() const;
 
     std::array<orvela::TonalStretch::Limits, 3> mChannels; ///< red, green, blue
     orvela::TonalStretch::Limits mLimits;                  ///< combined
-    std::int32_t mThreshold = 0;                           ///< of the second scans, in samples
     orvela::ChannelTable mCurve = {};
 };

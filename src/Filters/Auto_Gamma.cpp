@@ -6,31 +6,34 @@
 #include "Utility/Logger.h"
 
 #include <cmath>
-#include <utility>
 
 using namespace orvela;
 
-Auto_Gamma::Auto_Gamma(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
-    : IFilter(params, inPlane, outPlane) {
-    mName = "Auto_Gamma";
+const TaskDescription& Auto_Gamma::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/Auto_Gamma",
+        .line = 107,
+        .dumpName = "Auto_Gamma",
+        .opening = "Applying Auto_Gamma from plane at 0x%x to plane at 0x%x...",
+        .matched = "Auto_Gamma Condition matched.",
+    };
+    return kDescription;
 }
 
-bool Auto_Gamma::PreApply() {
+bool Auto_Gamma::applies() {
     const CSliderParams& sliders = mParams->mSliderParams;
-    if (!isAutomaticMode(sliders) && !sliders.mAuto_Color_Enabled)
-        return false;
-    Log::log(LogLevel::Debug, "Applying Auto_Gamma from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
-    Log::log(LogLevel::Debug, "Auto_Gamma Condition matched.");
-    addSamples();
+    return isAutomaticMode(sliders) || sliders.mAuto_Color_Enabled;
+}
+
+void Auto_Gamma::prepare() {
+    addSamplesToHistogram();
     const float gamma = gammaFor(meanLuma());
     Log::log(LogLevel::Debug, "Level_M %f", static_cast<double>(gamma));
     mTable = GammaCurve::table(gamma);
-    return true;
 }
 
 // What the histogram already holds stays.
-void Auto_Gamma::addSamples() {
+void Auto_Gamma::addSamplesToHistogram() {
     const CARGBPlane& in = *mInPlane;
     const int step = PixelMath::samplingStep(in.width(), in.height());
     Log::log(LogLevel::Debug, "Histo_Step %d", step);
@@ -64,8 +67,6 @@ float Auto_Gamma::gammaFor(float mean) const {
     return 1.0F;
 }
 
-void Auto_Gamma::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/Auto_Gamma", 107);
-    const int y = static_cast<int>(row);
-    mapRow(mTable, std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
+void Auto_Gamma::mapRow(const PixelRow& row) const {
+    mapChannels(mTable, row);
 }

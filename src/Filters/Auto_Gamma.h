@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Filters/IFilter.h"
 #include "Filters/Kernels/RowMapping.h"
+#include "Filters/PointFilter.h"
 
 /// Gamma from the mean luma m of the picture (see GammaCurve): dark pictures are brightened a little, those
 /// of medium brightness pulled to the middle, bright ones left alone.
@@ -10,16 +10,18 @@
 ///
 /// The mean is that of pHisto_Luma after this filter has added its own samples of the picture to it; without
 /// any count gamma is 1.
-class Auto_Gamma final : public IFilter {
+class Auto_Gamma final : public orvela::PointFilter {
 public:
-    Auto_Gamma(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+    using orvela::PointFilter::PointFilter;
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
-    void addSamples();
+    void addSamplesToHistogram();
     float meanLuma() const;
     float gammaFor(float mean) const;
 

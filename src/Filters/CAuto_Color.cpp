@@ -4,7 +4,6 @@
 
 #include <algorithm>
 #include <cmath>
-#include <utility>
 
 using namespace orvela;
 
@@ -28,15 +27,23 @@ bool flattens(float s) {
 
 } // namespace
 
-CAuto_Color::CAuto_Color(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
-    : IFilter(params, inPlane, outPlane) {
-    mName = "CAuto_Color";
+const TaskDescription& CAuto_Color::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/CAuto_Color",
+        .line = 195,
+        .dumpName = "CAuto_Color",
+        .opening = "Applying CAuto_Color filter from plane at 0x%x to plane at 0x%x...",
+        .completion = "CAuto_Color_I filter complete.",
+    };
+    return kDescription;
 }
 
-bool CAuto_Color::PreApply() {
-    if (!mParams->mSliderParams.mAuto_Color_Enabled)
-        return false;
-    logStart();
+bool CAuto_Color::applies() {
+    return mParams->mSliderParams.mAuto_Color_Enabled;
+}
+
+void CAuto_Color::prepare() {
+    logFlags();
     const float s = mParams->mSliderParams.mAuto_Color_Value / 1000;
     mParams->Shift_Level = s;
     const double threshold = (s * 6.67 - 3.67) * std::sqrt(static_cast<double>(mInPlane->pixelCount()));
@@ -56,12 +63,9 @@ bool CAuto_Color::PreApply() {
         mCurves[c] =
             makeTable([limits = mLimits[c]](int value) { return curve(value, limits.black, limits.white); });
     }
-    return true;
 }
 
-void CAuto_Color::logStart() const {
-    Log::log(LogLevel::Debug, "Applying CAuto_Color filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
+void CAuto_Color::logFlags() const {
     Log::log(LogLevel::Debug, "Shift_Level: %f",
              static_cast<double>(mParams->mSliderParams.mAuto_Color_Value / 1000));
     Log::log(LogLevel::Debug, "Auto_Color_Enabled %d", mParams->mSliderParams.mAuto_Color_Enabled);
@@ -93,14 +97,6 @@ std::uint8_t CAuto_Color::curve(int value, float black, float white) {
     return static_cast<std::uint8_t>(TonalStretch::liftHighlights(pulled, white));
 }
 
-void CAuto_Color::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CAuto_Color", 195);
-    const int y = static_cast<int>(row);
-    mapRow({&mCurves[0], &mCurves[1], &mCurves[2]}, std::as_const(*mInPlane).row(y), mOutPlane->row(y),
-           mInPlane->width());
-}
-
-bool CAuto_Color::PostApply() {
-    Log::log(LogLevel::Debug, "CAuto_Color_I filter complete.");
-    return true;
+void CAuto_Color::mapRow(const PixelRow& row) const {
+    mapChannels({&mCurves[0], &mCurves[1], &mCurves[2]}, row);
 }

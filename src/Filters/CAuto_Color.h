@@ -1,15 +1,15 @@
 #pragma once
 
 #include "Filters/Curves/TonalStretch.h"
-#include "Filters/IFilter.h"
 #include "Filters/Kernels/RowMapping.h"
+#include "Filters/PointFilter.h"
 
 /// Automatic colour correction: each channel is stretched softly between limits of its own, which it reads
 /// off its histogram. mAuto_Color_Value / 1000 = S, 0 to 1, sets how far the limits follow the histogram and
 /// how many samples, (6.67 S - 3.67) * sqrt(pixels), a bin must exceed to count.
-class CAuto_Color final : public IFilter {
+class CAuto_Color final : public orvela::PointFilter {
 public:
-    CAuto_Color(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+    using orvela::PointFilter::PointFilter;
 
     /// Black limit for a histogram that starts at bin i: i * S, at most 120 up to S = 0.5; between 0.5 and
     /// 0.75 flattened, i / 2 * (1 + S / cosh(i / 140)).
@@ -21,12 +21,13 @@ public:
     static std::uint8_t curve(int value, float black, float white);
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
-    void logStart() const;
+    void logFlags() const;
 
     struct FloatLimits {
         float black = 0;

@@ -5,7 +5,6 @@
 
 #include <algorithm>
 #include <cmath>
-#include <utility>
 
 using namespace orvela;
 
@@ -27,18 +26,37 @@ float iterationShare(bool enabled, float value) {
 
 } // namespace
 
-CAuto_Contrast_I::CAuto_Contrast_I(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
-    : IFilter(params, inPlane, outPlane) {
-    mName = "CAuto_Contrast_I";
+const TaskDescription& CAuto_Contrast_I::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/CAuto_Contrast_I",
+        .line = 171,
+        .dumpName = "CAuto_Contrast_I",
+        .start = "Applying CAuto_Contrast_I filter from plane at 0x%x to plane at 0x%x.",
+        .completion = "CAuto_Contrast_I Filter complete.",
+    };
+    return kDescription;
 }
 
-bool CAuto_Contrast_I::PreApply() {
-    Log::log(LogLevel::Debug, "Applying CAuto_Contrast_I filter from plane at 0x%x to plane at 0x%x.",
-             logAddress(mInPlane), logAddress(mOutPlane));
-    if (!applies())
-        return false;
+bool CAuto_Contrast_I::applies() {
+    storeSharpnessSwitch();
+    const CUserParams& p = *mParams;
+    const CSliderParams& sliders = p.mSliderParams;
+    return (sliders.OrvelaLevelEnabled || sliders.OrvelaLevel2Enabled) && !p.Switch_TOO_SHARP &&
+           p.Normal_Picture && !p.Under_Exposed_Picture;
+}
+
+void CAuto_Contrast_I::storeSharpnessSwitch() {
+    CUserParams& p = *mParams;
+    p.Switch_TOO_SHARP = p.Switch_TOO_SHARP_ORV_I && p.Switch_TOO_SHARP_ORV_II;
+    Log::log(LogLevel::Debug, "mSum_Color %f", p.mSum_Color);
+    Log::log(LogLevel::Debug, "Switch_TOO_SHARP auto contratst %d  %d", p.Switch_TOO_SHARP_ORV_II,
+             p.Switch_TOO_SHARP_ORV_I);
+}
+
+void CAuto_Contrast_I::prepare() {
     Log::log(LogLevel::Debug, "CAuto_Contrast_I Condition matched and Soft_Orvela is %d.",
              mParams->Soft_Orvela);
+    useHostPicture();
     prepareRatios();
     logRatios();
     const auto gains = [](float ratio) {
@@ -47,18 +65,6 @@ bool CAuto_Contrast_I::PreApply() {
     };
     mGains = {gains(RatioR), gains(RatioG), gains(RatioB)};
     prepareFade();
-    return true;
-}
-
-bool CAuto_Contrast_I::applies() {
-    CUserParams& p = *mParams;
-    const CSliderParams& sliders = p.mSliderParams;
-    p.Switch_TOO_SHARP = p.Switch_TOO_SHARP_ORV_I && p.Switch_TOO_SHARP_ORV_II;
-    Log::log(LogLevel::Debug, "mSum_Color %f", p.mSum_Color);
-    Log::log(LogLevel::Debug, "Switch_TOO_SHARP auto contratst %d  %d", p.Switch_TOO_SHARP_ORV_II,
-             p.Switch_TOO_SHARP_ORV_I);
-    return (sliders.OrvelaLevelEnabled || sliders.OrvelaLevel2Enabled) && !p.Switch_TOO_SHARP &&
-           p.Normal_Picture && !p.Under_Exposed_Picture;
 }
 
 void CAuto_Contrast_I::prepareRatios() {
@@ -136,37 +142,28 @@ int CAuto_Contrast_I::fade(int processed, int host) const {
     return PixelMath::trunc(static_cast<float>(sum));
 }
 
-void CAuto_Contrast_I::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CAuto_Contrast_I", 171);
-    const int y = static_cast<int>(row);
-    const int width = mInPlane->width();
-    const Row out = mOutPlane->row(y);
-    const ConstRow host = hostRow(y);
-    mapKeepingHue(mGains, std::as_const(*mInPlane).row(y), out, width);
-    if (y < 50 && Log::writes(LogLevel::Debug))
-        logOverflows({out[0], out[1], out[2]}, host);
-    for (std::size_t c = 0; c < 3; ++c) {
-        for (int x = 0; x < width; ++x)
-            out[c][x] = static_cast<std::uint8_t>(fade(out[c][x], host[c][x]));
-    }
-}
-
-void CAuto_Contrast_I::logOverflows(const ConstRow& processed, const ConstRow& host) const {
+void CAuto_Contrast_I::logOverflows(const PixelRow& balanced, const ConstRow& host) const {
     static constexpr std::array kNames = {"Red", "Green", "Blue"};
-    const auto faded = [&](std::size_t c, int x) { return fade(processed[c][x], host[c][x]); };
-    for (int x = 0; x < mInPlane->width(); ++x) {
+    const auto faded = [&](std::size_t c, int x) { return fade(balanced.out[c][x], host[c][x]); };
+    for (int x = 0; x < balanced.width; ++x) {
         if (faded(0, x) <= 255 && faded(1, x) <= 255 && faded(2, x) <= 255)
             continue;
         for (std::size_t c = 0; c < 3; ++c) {
-            Log::log(LogLevel::Debug,
-                     "int %c_tmp(%d) =%s(%d)*Fade_Inverse(%f)+%c_aux(%d)*Fade_Value_factor(%f);",
-                     kNames[c][0], faded(c, x), kNames[c], processed[c][x], static_cast<double>(Fade_Inverse),
-                     kNames[c][0], host[c][x], static_cast<double>(Fade_Value_factor));
+            Log::log(
+                LogLevel::Debug, "int %c_tmp(%d) =%s(%d)*Fade_Inverse(%f)+%c_aux(%d)*Fade_Value_factor(%f);",
+                kNames[c][0], faded(c, x), kNames[c], balanced.out[c][x], static_cast<double>(Fade_Inverse),
+                kNames[c][0], host[c][x], static_cast<double>(Fade_Value_factor));
         }
     }
 }
 
-bool CAuto_Contrast_I::PostApply() {
-    Log::log(LogLevel::Debug, "CAuto_Contrast_I Filter complete.");
-    return true;
+void CAuto_Contrast_I::mapRow(const PixelRow& row) const {
+    const ConstRow host = hostRow(row.y);
+    mapKeepingHue(mGains, row);
+    if (row.y < 50 && Log::writes(LogLevel::Debug))
+        logOverflows(row, host);
+    for (std::size_t c = 0; c < 3; ++c) {
+        for (int x = 0; x < row.width; ++x)
+            row.out[c][x] = static_cast<std::uint8_t>(fade(row.out[c][x], host[c][x]));
+    }
 }

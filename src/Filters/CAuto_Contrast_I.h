@@ -1,8 +1,8 @@
 #pragma once
 
 #include "Filters/Curves/TonalStretch.h"
-#include "Filters/IFilter.h"
 #include "Filters/Kernels/RowMapping.h"
+#include "Filters/PointFilter.h"
 
 /// Brings the channel means back to what they were before the illumination iterations, keeping the hue where
 /// a channel saturates, and fades the result toward the unprocessed picture:
@@ -12,26 +12,27 @@
 ///
 /// mFade_Value (0 to 1000), the iterations' levels and the picture's size set the fade. Bright pictures whose
 /// means all fell get gains that are normalised to an average brightness instead.
-class CAuto_Contrast_I final : public IFilter {
+class CAuto_Contrast_I final : public orvela::PointFilter {
 public:
-    CAuto_Contrast_I(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+    using orvela::PointFilter::PointFilter;
 
     /// Share of the fade that a picture of this size gets: 0.5 for large, near 1 for small ones.
     static float sharpnessFactor(int width, int height);
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
-    bool applies();
+    void storeSharpnessSwitch();
     void prepareRatios();
     void normaliseRatios(float f);
     void logRatios() const;
     void prepareFade();
     int fade(int processed, int host) const;
-    void logOverflows(const orvela::ConstRow& processed, const orvela::ConstRow& host) const;
+    void logOverflows(const orvela::PixelRow& balanced, const orvela::ConstRow& host) const;
 
     float RatioR = 1.0F;
     float RatioG = 1.0F;

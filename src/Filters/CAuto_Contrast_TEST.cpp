@@ -7,36 +7,21 @@
 
 #include <algorithm>
 #include <cmath>
-#include <utility>
 
 using namespace orvela;
 
-CAuto_Contrast_TEST::CAuto_Contrast_TEST(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
-    : IFilter(params, inPlane, outPlane) {
-    mName = "CAuto_Contrast_TEST";
+const TaskDescription& CAuto_Contrast_TEST::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/CAuto_Contrast_TEST",
+        .line = 315,
+        .dumpName = "CAuto_Contrast_TEST",
+        .start = "Applying CAuto_Contrast_TEST filter ",
+        .completion = "CAuto_Contrast_TEST Filter complete.",
+    };
+    return kDescription;
 }
 
-bool CAuto_Contrast_TEST::PreApply() {
-    Log::log(LogLevel::Debug, "Applying CAuto_Contrast_TEST filter ");
-    if (!applies())
-        return false;
-    Log::log(LogLevel::Debug, "CAuto_Contrast_TEST Condition matched and Soft_Orvela is %d.",
-             mParams->Soft_Orvela);
-    recountHistograms(*mInPlane, *mParams, 3, 3);
-
-    const int pixels = mInPlane->pixelCount();
-    mThreshold = PixelMath::trunc(TonalStretch::baseThreshold(pixels));
-    const int root = PixelMath::trunc(std::sqrt(static_cast<double>(pixels)));
-    TonalStretch::Limits luma;
-    if (!TonalStretch::readLumaLimits(*mParams, luma, mThreshold, root < 700 ? 0 : root))
-        readChannelLimits();
-    C_Left_limit = luma.black;
-    C_Right_limit = luma.white;
-    mHazyCurve = makeTable([luma](int value) { return TonalStretch::stretchHazy(value, luma); });
-    return true;
-}
-
-bool CAuto_Contrast_TEST::applies() const {
+bool CAuto_Contrast_TEST::applies() {
     const CSliderParams& s = mParams->mSliderParams;
     const bool corrected = s.AutoContrast_Enabled || LevelSwitches::anyPerceptual(s) ||
                            s.OrvelaLevelEnabled || s.OrvelaLevel2Enabled;
@@ -46,6 +31,23 @@ bool CAuto_Contrast_TEST::applies() const {
     const bool purelyAutomatic = !manual && plain && !s.ClarityFilterEnabled && mParams->Normal_Picture &&
                                  !mParams->Under_Exposed_Picture;
     return !s.mAuto_Color_Enabled && !purelyAutomatic;
+}
+
+void CAuto_Contrast_TEST::prepare() {
+    Log::log(LogLevel::Debug, "CAuto_Contrast_TEST Condition matched and Soft_Orvela is %d.",
+             mParams->Soft_Orvela);
+    recountHistograms(*mInPlane, *mParams, 3, 3);
+
+    const int pixels = mInPlane->pixelCount();
+    mThreshold = PixelMath::trunc(TonalStretch::baseThreshold(pixels));
+    const int root = PixelMath::trunc(std::sqrt(static_cast<double>(pixels)));
+    TonalStretch::Limits luma;
+    mHazy = TonalStretch::storeHaze(*mParams, luma, mThreshold, root < 700 ? 0 : root);
+    if (!mHazy)
+        readChannelLimits();
+    C_Left_limit = luma.black;
+    C_Right_limit = luma.white;
+    mHazyCurve = makeTable([luma](int value) { return TonalStretch::stretchHazy(value, luma); });
 }
 
 void CAuto_Contrast_TEST::readChannelLimits() {
@@ -73,23 +75,14 @@ int CAuto_Contrast_TEST::stretch(int value, int black, float factor) {
     return PixelMath::trunc(static_cast<float>(value - black) * factor);
 }
 
-void CAuto_Contrast_TEST::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CAuto_Contrast_TEST", 315);
-    const ConstRow in = std::as_const(*mInPlane).row(static_cast<int>(row));
-    const Row out = mOutPlane->row(static_cast<int>(row));
-    const int width = mInPlane->width();
-    if (mParams->m_Opaco) {
-        mapRow(mHazyCurve, in, out, width);
+void CAuto_Contrast_TEST::mapRow(const PixelRow& row) const {
+    if (mHazy) {
+        mapChannels(mHazyCurve, row);
         return;
     }
-    mapPixels(in, out, width, [this](std::uint8_t r, std::uint8_t g, std::uint8_t b) {
+    mapPixels(row, [this](std::uint8_t r, std::uint8_t g, std::uint8_t b) {
         if (std::min({r, g, b}) < mLimits.black)
             return PixelMath::Rgb{r, g, b};
         return PixelMath::keepHue({mCurve[r], mCurve[g], mCurve[b]});
     });
-}
-
-bool CAuto_Contrast_TEST::PostApply() {
-    Log::log(LogLevel::Debug, "CAuto_Contrast_TEST Filter complete.");
-    return true;
 }

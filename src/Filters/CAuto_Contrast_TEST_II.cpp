@@ -6,41 +6,46 @@
 #include "Utility/Logger.h"
 
 #include <cmath>
-#include <utility>
 
 using namespace orvela;
 
-CAuto_Contrast_TEST_II::CAuto_Contrast_TEST_II(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
-    : IFilter(params, inPlane, outPlane) {
-    mName = "CAuto_Contrast_TEST_II";
+const TaskDescription& CAuto_Contrast_TEST_II::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/CAuto_Contrast_TEST_II",
+        .line = 310,
+        .dumpName = "CAuto_Contrast_TEST_II",
+        .completion = "CAuto_Contrast_TEST_II Filter complete.",
+    };
+    return kDescription;
 }
 
-bool CAuto_Contrast_TEST_II::PreApply() {
+bool CAuto_Contrast_TEST_II::applies() {
     const bool automatic = isAutomaticMode(mParams->mSliderParams);
     Log::log(LogLevel::Debug, "Bicromic=%d.", mParams->Bicromic);
     Log::log(LogLevel::Debug, "Automatic_Mode=%d.", automatic);
-    if (!(mParams->Normal_Picture && automatic) && !mParams->mSliderParams.mAuto_Color_Enabled)
-        return false;
+    return (mParams->Normal_Picture && automatic) || mParams->mSliderParams.mAuto_Color_Enabled;
+}
+
+void CAuto_Contrast_TEST_II::prepare() {
     Log::log(LogLevel::Debug, "CAuto_Contrast_TEST_II Condition matched and Soft_Orvela is %d.",
              mParams->Soft_Orvela);
     mParams->Shift_Level = 1.0F;
-    measure();
+    storeHistograms();
 
     const double root = std::sqrt(static_cast<double>(mInPlane->pixelCount()));
     const auto hazyThreshold = static_cast<float>(root >= 700 ? root : 0);
     mThreshold = static_cast<float>(TonalStretch::baseThreshold(mInPlane->pixelCount()));
     TonalStretch::Limits luma;
-    const bool hazy = TonalStretch::readLumaLimits(*mParams, luma, mThreshold * mParams->Shift_Level,
-                                                   hazyThreshold * mParams->Shift_Level);
+    mHazy = TonalStretch::storeHaze(*mParams, luma, mThreshold * mParams->Shift_Level,
+                                    hazyThreshold * mParams->Shift_Level);
     C_Left_limit = luma.black;
     C_Right_limit = luma.white;
-    if (!hazy)
+    if (!mHazy)
         readChannelLimits();
     prepareCurves();
-    return true;
 }
 
-void CAuto_Contrast_TEST_II::measure() {
+void CAuto_Contrast_TEST_II::storeHistograms() {
     recountHistograms(*mInPlane, *mParams, 1, 1);
     Log::log(LogLevel::Debug, "iImageSize: %f ", static_cast<double>(mInPlane->pixelCount()));
     if (!Log::writes(LogLevel::Debug))
@@ -105,17 +110,9 @@ int CAuto_Contrast_TEST_II::stretch(int value, TonalStretch::Limits limits, floa
     return PixelMath::trunc(static_cast<float>(value - limits.black) * factor);
 }
 
-void CAuto_Contrast_TEST_II::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CAuto_Contrast_TEST_II", 310);
-    const ConstRow in = std::as_const(*mInPlane).row(static_cast<int>(row));
-    const Row out = mOutPlane->row(static_cast<int>(row));
-    if (mParams->m_Opaco)
-        mapRow(mHazyCurve, in, out, mInPlane->width());
+void CAuto_Contrast_TEST_II::mapRow(const PixelRow& row) const {
+    if (mHazy)
+        mapChannels(mHazyCurve, row);
     else
-        mapKeepingHue(mCurves, in, out, mInPlane->width());
-}
-
-bool CAuto_Contrast_TEST_II::PostApply() {
-    Log::log(LogLevel::Debug, "CAuto_Contrast_TEST_II Filter complete.");
-    return true;
+        mapKeepingHue(mCurves, row);
 }

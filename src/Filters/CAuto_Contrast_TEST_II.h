@@ -1,8 +1,8 @@
 #pragma once
 
 #include "Filters/Curves/TonalStretch.h"
-#include "Filters/IFilter.h"
 #include "Filters/Kernels/RowMapping.h"
+#include "Filters/PointFilter.h"
 
 /// The stretch of the automatic modes, by limits that go only half way: from 0 to the first and from 255 to
 /// the last bin of each channel that counts. Measures its input anew, on every pixel.
@@ -10,21 +10,22 @@
 ///     hazy (by luma):  each channel linearly between the luma limits, clamped
 ///     otherwise:       (c - L) * 255 / (R - L) from L on, c * 255 / R below it, with the channel's own
 ///                      limits; the hue is kept where a channel exceeds 255
-class CAuto_Contrast_TEST_II final : public IFilter {
+class CAuto_Contrast_TEST_II final : public orvela::PointFilter {
 public:
-    CAuto_Contrast_TEST_II(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+    using orvela::PointFilter::PointFilter;
 
     /// New value of a channel value (0 to 255) between the channel's limits; exceeds 255 above the white one.
     /// @param factor  255 / (white - black), or 1
     static int stretch(int value, orvela::TonalStretch::Limits limits, float factor);
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
-    void measure();
+    void storeHistograms();
     void readChannelLimits();
     void prepareCurves();
 
@@ -39,6 +40,7 @@ private:
     float HighLight_Radio_R = 1.0F;
     float HighLight_Radio_G = 1.0F;
     float HighLight_Radio_B = 1.0F;
+    bool mHazy = false;
     float mThreshold = 0; ///< in samples
     orvela::ChannelTable mHazyCurve = {};
     orvela::WideTables mCurves = {};

@@ -9,4 +9,7 @@ public:
 
     /// Reports the empty filter to the log. Always false: nothing was changed.
     virtual bool ApplyEmpty();
+
+protected:
+    const orvela::TaskDescription& description() const override;
 };

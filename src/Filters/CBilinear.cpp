@@ -19,41 +19,50 @@ constexpr std::size_t kRanges = 3 * 255 * 255 + 1;
 constexpr double kRangeScale = 0.05;
 constexpr float kLargeSide = 700; // square root of the pixel count
 
-} // namespace
-
-CBilinear::CBilinear(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
-    : IFilter(params, inPlane, outPlane) {
-    mName = "CBilinear";
+float sideOf(const CARGBPlane& plane) {
+    return static_cast<float>(std::sqrt(static_cast<double>(plane.pixelCount())));
 }
 
-bool CBilinear::PreApply() {
-    const CSliderParams& sliders = mParams->mSliderParams;
-    const auto side = static_cast<float>(std::sqrt(static_cast<double>(mInPlane->pixelCount())));
-    Log::log(LogLevel::Debug, "Applying CBilinear filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
+} // namespace
+
+const TaskDescription& CBilinear::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = kSource,
+        .line = 124,
+        .dumpName = "CBilinear",
+        .start = "Applying CBilinear filter from plane at 0x%x to plane at 0x%x...",
+        .matched = "CBilinear Condition matched.",
+        .completion = "Bilinear Noise Filter complete.",
+        .writes = Writes::SomePixels,
+    };
+    return kDescription;
+}
+
+bool CBilinear::applies() {
+    const float side = sideOf(*mInPlane);
     Log::log(LogLevel::Debug, "Size_Factor: %f", static_cast<double>(side));
     Log::log(LogLevel::Debug, "Bilinear_Filtering_Enabled && Normal_Picture");
-    if (!matches(side))
-        return false;
-    Log::log(LogLevel::Debug, "CBilinear Condition matched.");
-    const double position = sliders.BilinearFilteringValue;
-    const auto value = static_cast<float>(side > kLargeSide ? position * 0.6 : position);
+    // The flag as it was on entry counts for the large pictures, the new one for all.
+    const CSliderParams& sliders = mParams->mSliderParams;
+    const bool big = (sliders.OrvelaLevelEnabled || sliders.OrvelaLevel2Enabled) && side > kLargeSide &&
+                     !mParams->Switch_TOO_SHARP;
+    storeSharpnessSwitch();
+    return (sliders.BilinearFilteringEnabled || big) && !mParams->Switch_TOO_SHARP && mParams->Normal_Picture;
+}
+
+void CBilinear::storeSharpnessSwitch() {
+    mParams->Switch_TOO_SHARP = mParams->Switch_TOO_SHARP_ORV_I && mParams->Switch_TOO_SHARP_ORV_II &&
+                                mParams->mSliderParams.OrvelaLevel3Enabled;
+    Log::log(LogLevel::Debug, "Switch_TOO_SHARP: %d", mParams->Switch_TOO_SHARP);
+}
+
+void CBilinear::prepare() {
+    const double position = mParams->mSliderParams.BilinearFilteringValue;
+    const auto value = static_cast<float>(sideOf(*mInPlane) > kLargeSide ? position * 0.6 : position);
     const float sigma = value * 4.5F / 1000 + 0.5F;
     prepareTables(sigma * sigma);
     mVertStart = 1;
     mVertEnd = static_cast<std::uint32_t>(mInPlane->height() - 1);
-    return true;
-}
-
-// The flag as it was on entry counts for the large pictures, the new one for all.
-bool CBilinear::matches(float side) const {
-    const CSliderParams& sliders = mParams->mSliderParams;
-    const bool big = (sliders.OrvelaLevelEnabled || sliders.OrvelaLevel2Enabled) && side > kLargeSide &&
-                     !mParams->Switch_TOO_SHARP;
-    mParams->Switch_TOO_SHARP =
-        mParams->Switch_TOO_SHARP_ORV_I && mParams->Switch_TOO_SHARP_ORV_II && sliders.OrvelaLevel3Enabled;
-    Log::log(LogLevel::Debug, "Switch_TOO_SHARP: %d", mParams->Switch_TOO_SHARP);
-    return (sliders.BilinearFilteringEnabled || big) && !mParams->Switch_TOO_SHARP && mParams->Normal_Picture;
 }
 
 void CBilinear::prepareTables(float spatialVariance) {
@@ -88,14 +97,11 @@ CBilinear::Floats CBilinear::allocate(std::size_t count) const {
 }
 
 void CBilinear::ApplyRow(std::uint32_t row) {
-    beginRow(row, kSource, 124);
     BilateralKernel(m_cBilinear.get(), m_sBilinear.get())
         .applyRow(*mInPlane, *mOutPlane, static_cast<int>(row));
 }
 
-bool CBilinear::PostApply() {
+void CBilinear::complete() {
     m_cBilinear.reset();
     m_sBilinear.reset();
-    Log::log(LogLevel::Debug, "Bilinear Noise Filter complete.");
-    return true;
 }

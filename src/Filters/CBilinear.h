@@ -15,21 +15,23 @@
 /// photograph. The one-pixel border is left alone.
 class CBilinear : public IFilter {
 public:
-    CBilinear(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+    using IFilter::IFilter;
 
 protected:
     using Floats = std::unique_ptr<float[]>;
 
+    const orvela::TaskDescription& description() const override;
     /// Decides also, for later filters, whether the picture counts as too sharp.
+    bool applies() override;
     /// @throws COutOfMemoryEx when there is no memory for a table
-    bool PreApply() override;
+    void prepare() override;
     void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    void complete() override;
     /// Memory for a table, null when there is none.
     virtual Floats allocate(std::size_t count) const;
 
 private:
-    bool matches(float side) const;
+    void storeSharpnessSwitch();
     void prepareTables(float spatialVariance);
 
     Floats m_cBilinear; ///< spatial weights by d^2

@@ -4,7 +4,6 @@
 #include "Utility/Logger.h"
 
 #include <cmath>
-#include <utility>
 
 using namespace orvela;
 
@@ -21,19 +20,25 @@ WideTable curveAround(int mean, float variance, float sloper) {
 
 } // namespace
 
-CClarity::CClarity(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
-    : IFilter(params, inPlane, outPlane) {
-    mName = "CClarity";
+const TaskDescription& CClarity::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/CClarity",
+        .line = 67,
+        .dumpName = "CClarity",
+        .opening = "Applying CClarity filter from plane at 0x%x to plane at 0x%x...",
+        .matched = "CClarity Condition matched.",
+        .completion = "CClarity Filter complete.",
+    };
+    return kDescription;
 }
 
-bool CClarity::PreApply() {
+bool CClarity::applies() {
     const CSliderParams& sliders = mParams->mSliderParams;
-    if (!sliders.ClarityFilterEnabled || isAutomaticMode(sliders))
-        return false;
-    Log::log(LogLevel::Debug, "Applying CClarity filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
-    Log::log(LogLevel::Debug, "CClarity Condition matched.");
-    const double value = sliders.ClarityFilterValue;
+    return sliders.ClarityFilterEnabled && !isAutomaticMode(sliders);
+}
+
+void CClarity::prepare() {
+    const double value = mParams->mSliderParams.ClarityFilterValue;
     const auto sigma = static_cast<float>(value * 50 / 1000 + 2);
     const float variance = sigma * sigma;
     const auto sloper = static_cast<float>(value <= 600 ? 511 : 1120 - value * 102 / 100);
@@ -41,16 +46,8 @@ bool CClarity::PreApply() {
                curveAround(PixelMath::trunc(mParams->m_OriginalLumaG), variance, sloper),
                curveAround(PixelMath::trunc(mParams->m_OriginalLumaB), variance, sloper)};
     Log::log(LogLevel::Debug, "sloper= %f", static_cast<double>(sloper));
-    return true;
 }
 
-void CClarity::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CClarity", 67);
-    const int y = static_cast<int>(row);
-    mapKeepingHue(mCurves, std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
-}
-
-bool CClarity::PostApply() {
-    Log::log(LogLevel::Debug, "CClarity Filter complete.");
-    return true;
+void CClarity::mapRow(const PixelRow& row) const {
+    mapKeepingHue(mCurves, row);
 }

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Filters/IFilter.h"
 #include "Filters/Kernels/RowMapping.h"
+#include "Filters/PointFilter.h"
 
 /// Clarity: brightens each channel by its distance d from the picture's channel mean, most at a moderate
 /// distance, least near white.
@@ -10,14 +10,15 @@
 ///     d >= 0: c' = c + (255 - c) * T(d) / sloper,   d < 0: c' = c - (255 - c) * T(d) / 511
 ///
 /// sloper is 511 up to position 600 and falls to 100 at 1000. Results above 255 are rescaled with their hue.
-class CClarity final : public IFilter {
+class CClarity final : public orvela::PointFilter {
 public:
-    CClarity(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+    using orvela::PointFilter::PointFilter;
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
     orvela::WideTables mCurves = {};

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Filters/IFilter.h"
 #include "Filters/Kernels/RowMapping.h"
+#include "Filters/PointFilter.h"
 
 /// Colour filter: tints every pixel toward a chosen colour T, then restores the pixel's mean brightness.
 ///
@@ -9,24 +9,16 @@
 ///
 /// v is the intensity / 1000, 0 to 1; results above 255 are rescaled with their hue. Main runs use the
 /// colour filter's colour and intensity, final-touch runs the touch colour and intensity.
-class CColor final : public IFilter {
+class CColor final : public orvela::PointFilter {
 public:
-    using IFilter::IFilter;
+    using orvela::PointFilter::PointFilter;
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
-    struct Tint {
-        Tint() = default;
-        Tint(float intensity, float red, float green, float blue);
-
-        float v = 0;    ///< weight of the colour
-        float keep = 1; ///< weight of the pixel
-        orvela::WideTables curves = {};
-    };
-
-    Tint mNormal;
-    Tint mTouch;
+    orvela::WideTables mTint = {}; ///< of the channels, before the brightness is restored
 };

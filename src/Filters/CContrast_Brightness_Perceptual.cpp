@@ -2,10 +2,10 @@
 
 #include "Filters/Curves/PivotCurve.h"
 #include "Filters/Kernels/PixelMath.h"
+#include "Filters/Kernels/RowMapping.h"
 #include "Utility/Logger.h"
 
 #include <cmath>
-#include <utility>
 
 using namespace orvela;
 
@@ -33,16 +33,25 @@ int PerceptualContrast::apply(int c, float weight) const {
     return PixelMath::trunc(PivotCurve::apply(brightened, mean, k));
 }
 
-bool CContrast_Brightness_Perceptual::PreApply() {
-    if (!isWanted(mParams->mSliderParams))
-        return false;
+const TaskDescription& CContrast_Brightness_Perceptual::description() const {
+    static constexpr TaskDescription kMain = {.source = "Filters/CContrast_Brightness_Perceptual",
+                                              .line = 160};
+    static constexpr TaskDescription kTouch = {.source = "Filters/CContrast_Brightness_Perceptual",
+                                               .line = 206};
+    return mParams->Final_Touch_Mode_Enabled ? kTouch : kMain;
+}
+
+bool CContrast_Brightness_Perceptual::applies() {
+    return isWanted(mParams->mSliderParams);
+}
+
+void CContrast_Brightness_Perceptual::prepare() {
     mActive = mParams->Final_Touch_Mode_Enabled ? prepareTouch() : prepareMain();
-    if (mActive) {
-        mTable.build([this](int sum) {
-            return [this, weight = mContrast.weight(sum)](int c) { return mContrast.apply(c, weight); };
-        });
-    }
-    return true;
+    if (!mActive)
+        return;
+    mTable.build([this](int sum) {
+        return [this, weight = mContrast.weight(sum)](int c) { return mContrast.apply(c, weight); };
+    });
 }
 
 bool CContrast_Brightness_Perceptual::prepareMain() {
@@ -113,10 +122,9 @@ void CContrast_Brightness_Perceptual::logTouch() const {
     number("Perceptual_Brightness_Touch_Value %f", s.mPerceptual_Brightness_Touch_Value);
 }
 
-void CContrast_Brightness_Perceptual::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CContrast_Brightness_Perceptual", mParams->Final_Touch_Mode_Enabled ? 206 : 160);
-    if (!mActive)
-        return;
-    const int y = static_cast<int>(row);
-    mTable.mapRow(std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
+void CContrast_Brightness_Perceptual::mapRow(const PixelRow& row) const {
+    if (mActive)
+        mTable.map(row);
+    else
+        copyPixels(row);
 }

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Filters/IFilter.h"
 #include "Filters/Kernels/SumValueTable.h"
+#include "Filters/PointFilter.h"
 
 namespace orvela {
 
@@ -30,13 +30,15 @@ struct PerceptualContrast {
 /// A main run takes Contrast2Value and Brightness2Value and raises no contrast on a side that already clips;
 /// a final-touch run takes the perceptual touch sliders. Leaves the picture alone when the plain sliders are
 /// on or it is under-exposed; skipped with automatic contrast.
-class CContrast_Brightness_Perceptual final : public IFilter {
+class CContrast_Brightness_Perceptual final : public orvela::PointFilter {
 public:
-    using IFilter::IFilter;
+    using orvela::PointFilter::PointFilter;
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
     bool prepareMain();

@@ -5,7 +5,6 @@
 #include "Utility/Logger.h"
 
 #include <cmath>
-#include <utility>
 
 using namespace orvela;
 
@@ -29,16 +28,25 @@ int FlashContrast::apply(int c, float weight) const {
     return PixelMath::trunc(PivotCurve::apply(value, mean, weight * (value < mean ? low : high)));
 }
 
-bool CDigital_Flash_Perceptual::PreApply() {
-    const CSliderParams& sliders = mParams->mSliderParams;
-    if (!sliders.DigitalFlashEnabled)
-        return false;
-    Log::log(LogLevel::Debug,
-             "Applying CDigital_Flash_Perceptual filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
-    Log::log(LogLevel::Debug, "CDigital_Flash_Perceptual 1st Condition matched.");
+const TaskDescription& CDigital_Flash_Perceptual::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/CDigital_Flash_Perceptual",
+        .line = 87,
+        .opening = "Applying CDigital_Flash_Perceptual filter from plane at 0x%x to plane at 0x%x...",
+        .matched = "CDigital_Flash_Perceptual 1st Condition matched.",
+        .completion = "CDigital_Flash_Perceptual filter complete.",
+    };
+    return kDescription;
+}
+
+bool CDigital_Flash_Perceptual::applies() {
+    return mParams->mSliderParams.DigitalFlashEnabled;
+}
+
+void CDigital_Flash_Perceptual::prepare() {
+    useHostPicture();
     if (mParams->m_Histo_Light_Exception == 0) {
-        const double flash = sliders.mDigital_Flash_Value;
+        const double flash = mParams->mSliderParams.mDigital_Flash_Value;
         mContrast.high = static_cast<float>(mParams->m_P_C_H_C_F_H * flash / FlashDivisor);
         mContrast.low = static_cast<float>(mParams->m_P_C_H_C_F_L * flash / FlashDivisor);
     }
@@ -49,7 +57,6 @@ bool CDigital_Flash_Perceptual::PreApply() {
         return [this, weight = mContrast.weight(sum)](int c) { return mContrast.apply(c, weight); };
     });
     prepareFade();
-    return true;
 }
 
 void CDigital_Flash_Perceptual::prepareFade() {
@@ -61,28 +68,16 @@ void CDigital_Flash_Perceptual::prepareFade() {
     mKeep = 1 - mFade;
 }
 
-void CDigital_Flash_Perceptual::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CDigital_Flash_Perceptual", 87);
-    const int y = static_cast<int>(row);
-    const Row out = mOutPlane->row(y);
-    mTable.mapRow(std::as_const(*mInPlane).row(y), out, mInPlane->width());
-    fadeRow(hostRow(y), out);
-}
-
 // The sum in double, stored as float: a value equal to the host's stays.
-void CDigital_Flash_Perceptual::fadeRow(ConstRow host, Row out) const {
+void CDigital_Flash_Perceptual::mapRow(const PixelRow& row) const {
+    mTable.map(row);
+    const ConstRow host = hostRow(row.y);
     const double fade = mFade;
     const double keep = mKeep;
-    const int width = mInPlane->width();
-    for (std::size_t channel = 0; channel < out.size(); ++channel) {
-        const std::uint8_t* from = host[channel];
-        std::uint8_t* to = out[channel];
-        for (int x = 0; x < width; ++x)
+    for (std::size_t c = 0; c < host.size(); ++c) {
+        const std::uint8_t* from = host[c];
+        std::uint8_t* to = row.out[c];
+        for (int x = 0; x < row.width; ++x)
             to[x] = static_cast<std::uint8_t>(static_cast<float>(from[x] * fade + to[x] * keep));
     }
-}
-
-bool CDigital_Flash_Perceptual::PostApply() {
-    Log::log(LogLevel::Debug, "CDigital_Flash_Perceptual filter complete.");
-    return true;
 }

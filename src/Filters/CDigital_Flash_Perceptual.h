@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Filters/IFilter.h"
 #include "Filters/Kernels/SumValueTable.h"
+#include "Filters/PointFilter.h"
 
 namespace orvela {
 
@@ -32,18 +32,18 @@ struct FlashContrast {
 ///
 ///     fade = mFade_Value / 1000 * (a / 5 + 1.1), at most 1,   a = (flash / 1000 - 0.7) / 0.3 above 700, else
 ///     0
-class CDigital_Flash_Perceptual final : public IFilter {
+class CDigital_Flash_Perceptual final : public orvela::PointFilter {
 public:
-    using IFilter::IFilter;
+    using orvela::PointFilter::PointFilter;
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
     void prepareFade();
-    void fadeRow(orvela::ConstRow host, orvela::Row out) const;
 
     orvela::FlashContrast mContrast;
     orvela::SumValueTable mTable;

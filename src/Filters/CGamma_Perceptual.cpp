@@ -3,30 +3,34 @@
 #include "Filters/Curves/GammaCurve.h"
 #include "Utility/Logger.h"
 
-#include <utility>
-
 using namespace orvela;
 
-CGamma_Perceptual::CGamma_Perceptual(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
-    : IFilter(params, inPlane, outPlane) {
-    mName = "CGamma_Perceptual";
+const TaskDescription& CGamma_Perceptual::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/CGamma_Perceptual",
+        .line = 61,
+        .dumpName = "CGamma_Perceptual",
+        .start = "Applying Gamma_Perceptual filter from plane at 0x%x to plane at 0x%x...",
+        .matched = "CGamma_Perceptual 1st Condition matched.",
+        .completion = "CGamma_Perceptual Filter complete.",
+    };
+    return kDescription;
 }
 
-bool CGamma_Perceptual::PreApply() {
+bool CGamma_Perceptual::applies() {
     const CSliderParams& sliders = mParams->mSliderParams;
-    Log::log(LogLevel::Debug, "Applying Gamma_Perceptual filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
-    if (!sliders.PerceptualGammaEnabled || sliders.mAuto_Color_Enabled)
-        return false;
-    Log::log(LogLevel::Debug, "CGamma_Perceptual 1st Condition matched.");
-    const float gamma = sliders.GammaCorrectionEnabled ? 1.0F : perceptualGamma();
+    return sliders.PerceptualGammaEnabled && !sliders.mAuto_Color_Enabled;
+}
+
+void CGamma_Perceptual::prepare() {
+    const float gamma = mParams->mSliderParams.GammaCorrectionEnabled ? 1.0F : takeGamma();
     if (gamma != 1)
         Log::log(LogLevel::Debug, "CGamma_Perceptual 2nd Condition matched.");
     mTable = GammaCurve::table(gamma);
-    return true;
 }
 
-float CGamma_Perceptual::perceptualGamma() const {
+// Lowers the factor that it uses up.
+float CGamma_Perceptual::takeGamma() {
     const double v = mParams->mSliderParams.PerceptualGamma;
     if (v < 500) {
         const double low = mParams->m_M_H_L_F;
@@ -37,13 +41,6 @@ float CGamma_Perceptual::perceptualGamma() const {
     return static_cast<float>((v - 500) / 500 * mParams->m_M_H_H_F + 1);
 }
 
-void CGamma_Perceptual::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CGamma_Perceptual", 61);
-    const int y = static_cast<int>(row);
-    mapRow(mTable, std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
-}
-
-bool CGamma_Perceptual::PostApply() {
-    Log::log(LogLevel::Debug, "CGamma_Perceptual Filter complete.");
-    return true;
+void CGamma_Perceptual::mapRow(const PixelRow& row) const {
+    mapChannels(mTable, row);
 }

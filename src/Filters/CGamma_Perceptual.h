@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Filters/IFilter.h"
 #include "Filters/Kernels/RowMapping.h"
+#include "Filters/PointFilter.h"
 
 /// Gamma within the range that the analysis of the midtones found fit for the picture (see GammaCurve).
 ///
@@ -11,17 +11,18 @@
 ///
 /// From 500 on a factor m_M_H_H_F above 1 is first lowered by 1, for every later reader too. Stays neutral
 /// while the plain gamma slider is on.
-class CGamma_Perceptual final : public IFilter {
+class CGamma_Perceptual final : public orvela::PointFilter {
 public:
-    CGamma_Perceptual(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+    using orvela::PointFilter::PointFilter;
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
-    float perceptualGamma() const;
+    float takeGamma();
 
     orvela::ChannelTable mTable = {};
 };

@@ -1,9 +1,6 @@
 #include "Filters/CGamma_Simple_Filter.h"
 
 #include "Filters/Curves/GammaCurve.h"
-#include "Utility/Logger.h"
-
-#include <utility>
 
 using namespace orvela;
 
@@ -18,24 +15,25 @@ float gammaAt(float position) {
 
 } // namespace
 
-bool CGamma_Simple_Filter::PreApply() {
-    const CSliderParams& sliders = mParams->mSliderParams;
-    if (!sliders.GammaCorrectionEnabled)
-        return false;
-    Log::log(LogLevel::Debug, "Applying Gamma_Simple_Filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
-    Log::log(LogLevel::Debug, "CGamma_Simple_Filter Condition matched.");
-    mTable = GammaCurve::table(gammaAt(sliders.GammaCorrectionValue));
-    return true;
+const TaskDescription& CGamma_Simple_Filter::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/CGamma_Simple_Filter",
+        .line = 63,
+        .opening = "Applying Gamma_Simple_Filter from plane at 0x%x to plane at 0x%x...",
+        .matched = "CGamma_Simple_Filter Condition matched.",
+        .completion = "CGamma_Simple_Filter Filter complete.",
+    };
+    return kDescription;
 }
 
-void CGamma_Simple_Filter::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CGamma_Simple_Filter", 63);
-    const int y = static_cast<int>(row);
-    mapRow(mTable, std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
+bool CGamma_Simple_Filter::applies() {
+    return mParams->mSliderParams.GammaCorrectionEnabled;
 }
 
-bool CGamma_Simple_Filter::PostApply() {
-    Log::log(LogLevel::Debug, "CGamma_Simple_Filter Filter complete.");
-    return true;
+void CGamma_Simple_Filter::prepare() {
+    mTable = GammaCurve::table(gammaAt(mParams->mSliderParams.GammaCorrectionValue));
+}
+
+void CGamma_Simple_Filter::mapRow(const PixelRow& row) const {
+    mapChannels(mTable, row);
 }

@@ -3,29 +3,37 @@
 #include "Settings/Conditions.h"
 #include "Utility/Logger.h"
 
-#include <utility>
-
 using namespace orvela;
 
-bool CLevel_Dark_Left::PreApply() {
+const TaskDescription& CLevel_Dark_Left::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/CLevel_Dark_Left",
+        .line = __LINE__,
+        .opening = "Applying CLevel_Dark_Left filter from plane at 0x%x to plane at 0x%x...",
+        .completion = "CLevel_Dark_Left Filter complete.",
+    };
+    return kDescription;
+}
+
+bool CLevel_Dark_Left::applies() {
     const CSliderParams& sliders = mParams->mSliderParams;
-    const bool touched = LevelSwitches::touchDark(sliders);
-    if ((!sliders.mAbsolute_Dark_Enabled && !touched) || sliders.mAuto_Color_Enabled)
-        return false;
+    return (sliders.mAbsolute_Dark_Enabled || LevelSwitches::touchDark(sliders)) &&
+           !sliders.mAuto_Color_Enabled;
+}
+
+void CLevel_Dark_Left::prepare() {
+    const CSliderParams& sliders = mParams->mSliderParams;
     const bool finalTouch = mParams->Final_Touch_Mode_Enabled;
-    Log::log(LogLevel::Debug, "Applying CLevel_Dark_Left filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
     Log::log(LogLevel::Debug, "!Final_Touch_Mode_Enabled  %d.", !finalTouch);
     LevelMath::Levels levels;
     if (!finalTouch && sliders.mAbsolute_Dark_Enabled)
         levels = mainLevels();
-    else if (finalTouch && touched)
+    else if (finalTouch && LevelSwitches::touchDark(sliders))
         levels = touchLevels();
     const auto weight = [mean = mParams->m_OriginalLuma](double luma) {
         return luma <= mean ? LevelMath::bell(luma, mean, LevelMath::kNarrowBell) : 1.0F;
     };
     mTables.emplace(levels, weight, LevelMath::darken);
-    return true;
 }
 
 LevelMath::Levels CLevel_Dark_Left::mainLevels() const {
@@ -41,13 +49,6 @@ LevelMath::Levels CLevel_Dark_Left::touchLevels() const {
                                   LevelMath::absoluteLevel(sliders.mDark_Touch_Value_B)}});
 }
 
-void CLevel_Dark_Left::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CLevel_Dark_Left", __LINE__);
-    const int y = static_cast<int>(row);
-    mTables->applyRow(std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
-}
-
-bool CLevel_Dark_Left::PostApply() {
-    Log::log(LogLevel::Debug, "CLevel_Dark_Left Filter complete.");
-    return true;
+void CLevel_Dark_Left::mapRow(const PixelRow& row) const {
+    mTables->apply(row);
 }

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/Curves/LevelMath.h"
-#include "Filters/IFilter.h"
+#include "Filters/PointFilter.h"
 
 #include <optional>
 
@@ -12,14 +12,15 @@
 ///
 /// A main run moves all channels by mAbsolute_Dark_Value; a final-touch run by mDark_Touch_Value_RGB, or by a
 /// channel's own value where that is not 0. Stays away in automatic colour.
-class CLevel_Dark_Left final : public IFilter {
+class CLevel_Dark_Left final : public orvela::PointFilter {
 public:
-    using IFilter::IFilter;
+    using orvela::PointFilter::PointFilter;
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
     orvela::LevelMath::Levels mainLevels() const;

@@ -3,27 +3,38 @@
 #include "Settings/Conditions.h"
 #include "Utility/Logger.h"
 
-#include <utility>
-
 using namespace orvela;
 
-bool CLevel_Dark_Left_Perceptual::PreApply() {
+const TaskDescription& CLevel_Dark_Left_Perceptual::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/CLevel_Dark_Left_Perceptual",
+        .line = __LINE__,
+        .opening = "Applying CLevel_Dark_Left_Perceptual filter from plane at 0x%x to plane at 0x%x...",
+        .completion = "CLevel_Dark_Left_Perceptual Filter complete.",
+        .writes = Writes::SomePixels,
+    };
+    return kDescription;
+}
+
+bool CLevel_Dark_Left_Perceptual::applies() {
+    const CSliderParams& sliders = mParams->mSliderParams;
+    const bool absolute = sliders.mAbsolute_Dark_Enabled || LevelSwitches::touchDark(sliders);
+    return (sliders.PerceptualDarkEnabled || LevelSwitches::touchPerceptualDark(sliders)) && !absolute;
+}
+
+void CLevel_Dark_Left_Perceptual::prepare() {
     const CSliderParams& sliders = mParams->mSliderParams;
     const bool touched = LevelSwitches::touchPerceptualDark(sliders);
-    const bool absolute = sliders.mAbsolute_Dark_Enabled || LevelSwitches::touchDark(sliders);
-    if ((!sliders.PerceptualDarkEnabled && !touched) || absolute)
-        return false;
     const bool finalTouch = mParams->Final_Touch_Mode_Enabled;
-    Log::log(LogLevel::Debug,
-             "Applying CLevel_Dark_Left_Perceptual filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
     Log::log(LogLevel::Debug, "!Final_Touch_Mode_Enabled 000 %d.", !finalTouch);
     mTouch = finalTouch && touched;
     LevelMath::Levels levels;
-    if (mTouch)
+    if (mTouch) {
+        useHostPicture();
         levels = touchLevels();
-    else if (!finalTouch && sliders.PerceptualDarkEnabled)
+    } else if (!finalTouch && sliders.PerceptualDarkEnabled) {
         levels = mainLevels();
+    }
     mTables.emplace(
         levels, [this](double luma) { return weight(luma); }, LevelMath::darken);
     Log::log(LogLevel::Debug, "Final_Touch_Mode_Enabled %d", finalTouch);
@@ -31,7 +42,6 @@ bool CLevel_Dark_Left_Perceptual::PreApply() {
     Log::log(LogLevel::Debug, " Normal_Picture%d", mParams->Normal_Picture);
     Log::log(LogLevel::Debug, " !Touch_Tone_Dark_Enabled %d", !LevelSwitches::touchDark(sliders));
     mVertEnd = static_cast<std::uint32_t>(mInPlane->height() - 1);
-    return true;
 }
 
 LevelMath::Levels CLevel_Dark_Left_Perceptual::mainLevels() const {
@@ -55,25 +65,17 @@ float CLevel_Dark_Left_Perceptual::weight(double luma) const {
     return LevelMath::topRangeWeight(position);
 }
 
-void CLevel_Dark_Left_Perceptual::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CLevel_Dark_Left_Perceptual", __LINE__);
-    const int y = static_cast<int>(row);
-    mTables->applyRow(std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
-    if (mTouch)
-        averageWithHost(y);
-}
-
 // The moved value was truncated, which does not change the truncated average with a whole number.
-void CLevel_Dark_Left_Perceptual::averageWithHost(int y) const {
-    const ConstRow host = hostRow(y);
-    const Row out = mOutPlane->row(y);
+void CLevel_Dark_Left_Perceptual::averageWithHost(const PixelRow& row) const {
+    const ConstRow host = hostRow(row.y);
     for (std::size_t c = 0; c < 3; ++c) {
-        for (int x = 0; x < mInPlane->width(); ++x)
-            out[c][x] = static_cast<std::uint8_t>((out[c][x] + host[c][x]) / 2);
+        for (int x = 0; x < row.width; ++x)
+            row.out[c][x] = static_cast<std::uint8_t>((row.out[c][x] + host[c][x]) / 2);
     }
 }
 
-bool CLevel_Dark_Left_Perceptual::PostApply() {
-    Log::log(LogLevel::Debug, "CLevel_Dark_Left_Perceptual Filter complete.");
-    return true;
+void CLevel_Dark_Left_Perceptual::mapRow(const PixelRow& row) const {
+    mTables->apply(row);
+    if (mTouch)
+        averageWithHost(row);
 }

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/Curves/LevelMath.h"
-#include "Filters/IFilter.h"
+#include "Filters/PointFilter.h"
 
 #include <optional>
 
@@ -13,20 +13,21 @@
 ///
 /// A final-touch run darkens by the RGB level, then each channel by its own, and takes the average with the
 /// unprocessed host pixel. Gives way to the absolute shadows. The last row is left alone.
-class CLevel_Dark_Left_Perceptual final : public IFilter {
+class CLevel_Dark_Left_Perceptual final : public orvela::PointFilter {
 public:
-    using IFilter::IFilter;
+    using orvela::PointFilter::PointFilter;
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
     orvela::LevelMath::Levels mainLevels() const;
     orvela::LevelMath::Levels touchLevels() const;
     float weight(double luma) const;
-    void averageWithHost(int y) const;
+    void averageWithHost(const orvela::PixelRow& row) const;
 
     std::optional<orvela::LevelMath::MoveTables> mTables;
     bool mTouch = false;

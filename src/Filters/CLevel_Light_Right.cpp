@@ -3,32 +3,39 @@
 #include "Settings/Conditions.h"
 #include "Utility/Logger.h"
 
-#include <utility>
-
 using namespace orvela;
 
-bool CLevel_Light_Right::PreApply() {
+const TaskDescription& CLevel_Light_Right::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/CLevel_Light_Right",
+        .line = __LINE__,
+        .opening = "Applying CLevel_Light_Right filter from plane at 0x%x to plane at 0x%x...",
+    };
+    return kDescription;
+}
+
+bool CLevel_Light_Right::applies() {
     const CSliderParams& sliders = mParams->mSliderParams;
     const bool touched = LevelSwitches::touchLight(sliders);
-    if ((!sliders.mAbsolute_Light_Enabled && !touched) || sliders.mAuto_Color_Enabled)
-        return false;
+    const bool touchedToNothing = mParams->Final_Touch_Mode_Enabled && touched &&
+                                  sliders.mLight_Touch_Value_RGB == 0 && sliders.mLight_Touch_Value_R == 0 &&
+                                  sliders.mLight_Touch_Value_G == 0 && sliders.mLight_Touch_Value_B == 0;
+    return (sliders.mAbsolute_Light_Enabled || touched) && !sliders.mAuto_Color_Enabled && !touchedToNothing;
+}
+
+void CLevel_Light_Right::prepare() {
+    const CSliderParams& sliders = mParams->mSliderParams;
     const bool finalTouch = mParams->Final_Touch_Mode_Enabled;
-    if (finalTouch && touched && sliders.mLight_Touch_Value_RGB == 0 && sliders.mLight_Touch_Value_R == 0 &&
-        sliders.mLight_Touch_Value_G == 0 && sliders.mLight_Touch_Value_B == 0)
-        return false;
-    Log::log(LogLevel::Debug, "Applying CLevel_Light_Right filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
     Log::log(LogLevel::Debug, "!Final_Touch_Mode_Enabled  %d.", !finalTouch);
     LevelMath::Levels levels;
     if (!finalTouch && sliders.mAbsolute_Light_Enabled)
         levels = mainLevels();
-    else if (finalTouch && touched)
+    else if (finalTouch && LevelSwitches::touchLight(sliders))
         levels = touchLevels();
     const auto weight = [mean = mParams->m_OriginalLuma](double luma) {
         return LevelMath::bell(luma, mean, LevelMath::kWideBell);
     };
     mTables.emplace(levels, weight, LevelMath::brighten);
-    return true;
 }
 
 LevelMath::Levels CLevel_Light_Right::mainLevels() const {
@@ -44,8 +51,6 @@ LevelMath::Levels CLevel_Light_Right::touchLevels() const {
                                   LevelMath::absoluteLevel(sliders.mLight_Touch_Value_B)}});
 }
 
-void CLevel_Light_Right::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CLevel_Light_Right", __LINE__);
-    const int y = static_cast<int>(row);
-    mTables->applyRow(std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
+void CLevel_Light_Right::mapRow(const PixelRow& row) const {
+    mTables->apply(row);
 }

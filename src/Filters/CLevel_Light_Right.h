@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/Curves/LevelMath.h"
-#include "Filters/IFilter.h"
+#include "Filters/PointFilter.h"
 
 #include <optional>
 
@@ -13,13 +13,15 @@
 /// A main run moves all channels by mAbsolute_Light_Value, whose position 0 stands for L = 255; a final-touch
 /// run by mLight_Touch_Value_RGB, or by a channel's own value where that is not 0, and not at all when all
 /// four are 0. Stays away in automatic colour.
-class CLevel_Light_Right final : public IFilter {
+class CLevel_Light_Right final : public orvela::PointFilter {
 public:
-    using IFilter::IFilter;
+    using orvela::PointFilter::PointFilter;
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
     orvela::LevelMath::Levels mainLevels() const;

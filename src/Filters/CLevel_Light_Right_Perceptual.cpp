@@ -3,19 +3,26 @@
 #include "Settings/Conditions.h"
 #include "Utility/Logger.h"
 
-#include <utility>
-
 using namespace orvela;
 
-bool CLevel_Light_Right_Perceptual::PreApply() {
+const TaskDescription& CLevel_Light_Right_Perceptual::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/CLevel_Light_Right_Perceptual",
+        .line = __LINE__,
+        .opening = "Applying CLevel_Light_Right_Perceptual filter from plane at 0x%x to plane at 0x%x...",
+    };
+    return kDescription;
+}
+
+bool CLevel_Light_Right_Perceptual::applies() {
+    const CSliderParams& sliders = mParams->mSliderParams;
+    return sliders.PerceptualLightEnabled || LevelSwitches::touchPerceptualLight(sliders);
+}
+
+void CLevel_Light_Right_Perceptual::prepare() {
     const CSliderParams& sliders = mParams->mSliderParams;
     const bool touched = LevelSwitches::touchPerceptualLight(sliders);
-    if (!sliders.PerceptualLightEnabled && !touched)
-        return false;
     const bool finalTouch = mParams->Final_Touch_Mode_Enabled;
-    Log::log(LogLevel::Debug,
-             "Applying CLevel_Light_Right_Perceptual filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
     Log::log(LogLevel::Debug, "!Final_Touch_Mode_Enabled  %d.", !finalTouch);
     mTouch = finalTouch && touched;
     LevelMath::Levels levels;
@@ -26,7 +33,6 @@ bool CLevel_Light_Right_Perceptual::PreApply() {
         levels = touchLevels();
     mTables.emplace(
         levels, [this](double luma) { return weight(luma); }, LevelMath::brighten);
-    return true;
 }
 
 LevelMath::Levels CLevel_Light_Right_Perceptual::mainLevels() const {
@@ -52,8 +58,6 @@ float CLevel_Light_Right_Perceptual::weight(double luma) const {
     return LevelMath::topRangeWeight(position);
 }
 
-void CLevel_Light_Right_Perceptual::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CLevel_Light_Right_Perceptual", __LINE__);
-    const int y = static_cast<int>(row);
-    mTables->applyRow(std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
+void CLevel_Light_Right_Perceptual::mapRow(const PixelRow& row) const {
+    mTables->apply(row);
 }

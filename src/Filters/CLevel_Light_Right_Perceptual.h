@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/Curves/LevelMath.h"
-#include "Filters/IFilter.h"
+#include "Filters/PointFilter.h"
 
 #include <optional>
 
@@ -13,13 +13,15 @@
 ///
 /// A final-touch run, with k of width 120 for every luma, brightens by the RGB level, then each channel by
 /// its own. Gives way to the absolute levels.
-class CLevel_Light_Right_Perceptual final : public IFilter {
+class CLevel_Light_Right_Perceptual final : public orvela::PointFilter {
 public:
-    using IFilter::IFilter;
+    using orvela::PointFilter::PointFilter;
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
     orvela::LevelMath::Levels mainLevels() const;

@@ -4,25 +4,32 @@
 #include "Settings/Conditions.h"
 #include "Utility/Logger.h"
 
-#include <utility>
-
 using namespace orvela;
 
-bool CLevel_Middle::PreApply() {
+const TaskDescription& CLevel_Middle::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/CLevel_Middle",
+        .line = __LINE__,
+        .opening = "Applying CLevel_Middle filter from plane at 0x%x to plane at 0x%x...",
+    };
+    return kDescription;
+}
+
+bool CLevel_Middle::applies() {
     const CSliderParams& sliders = mParams->mSliderParams;
-    const bool touched = LevelSwitches::touchMiddle(sliders);
-    if ((!sliders.mAbsolute_Middle_Enabled && !touched) || sliders.mAuto_Color_Enabled)
-        return false;
+    return (sliders.mAbsolute_Middle_Enabled || LevelSwitches::touchMiddle(sliders)) &&
+           !sliders.mAuto_Color_Enabled;
+}
+
+void CLevel_Middle::prepare() {
+    const CSliderParams& sliders = mParams->mSliderParams;
     const bool finalTouch = mParams->Final_Touch_Mode_Enabled;
-    Log::log(LogLevel::Debug, "Applying CLevel_Middle filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
     Log::log(LogLevel::Debug, "!Final_Touch_Mode_Enabled  %d.", !finalTouch);
     mMaps = LevelMath::factorMaps(1, {1, 1, 1});
     if (!finalTouch && sliders.mAbsolute_Middle_Enabled && sliders.mAbsolute_Middle_Value != 500)
         prepareMain();
-    else if (finalTouch && touched)
+    else if (finalTouch && LevelSwitches::touchMiddle(sliders))
         prepareTouch();
-    return true;
 }
 
 void CLevel_Middle::prepareMain() {
@@ -56,8 +63,6 @@ void CLevel_Middle::prepareTouch() {
     Log::log(LogLevel::Debug, "Gamma_Radio_B %f", static_cast<double>(own[2]));
 }
 
-void CLevel_Middle::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CLevel_Middle", __LINE__);
-    const int y = static_cast<int>(row);
-    mapKeepingHue(mMaps, std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
+void CLevel_Middle::mapRow(const PixelRow& row) const {
+    mapKeepingHue(mMaps, row);
 }

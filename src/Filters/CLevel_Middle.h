@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/Curves/LevelMath.h"
-#include "Filters/IFilter.h"
+#include "Filters/PointFilter.h"
 
 /// Absolute midtones: multiplies by the ratio by which a gamma would move the mean luma.
 ///
@@ -9,13 +9,15 @@
 ///
 /// A main run uses mAbsolute_Middle_Value and the mean luma; a final-touch run mMiddle_Touch_Value_RGB, then
 /// each channel's own value and mean. Too bright pixels keep their hue. Stays away in automatic colour.
-class CLevel_Middle final : public IFilter {
+class CLevel_Middle final : public orvela::PointFilter {
 public:
-    using IFilter::IFilter;
+    using orvela::PointFilter::PointFilter;
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
     void prepareMain();

@@ -4,7 +4,6 @@
 #include "Utility/Logger.h"
 
 #include <limits>
-#include <utility>
 
 using namespace orvela;
 
@@ -36,13 +35,14 @@ constexpr std::array<Tone, 4> kTones = {{
      2.0},
 }};
 
+// Uses a part of the coefficient up.
 double decreased(float& high) {
     if (high > 1)
         high -= 1;
     return high;
 }
 
-float touchGamma(CUserParams& params, const Tone& tone) {
+float takeTouchGamma(CUserParams& params, const Tone& tone) {
     if (!(params.mSliderParams.*tone.enabled))
         return 1;
     const double position = params.mSliderParams.*tone.position;
@@ -91,25 +91,33 @@ void logTones(const CUserParams& params) {
 
 } // namespace
 
-bool CLevel_Middle_Perceptual::PreApply() {
+const TaskDescription& CLevel_Middle_Perceptual::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/CLevel_Middle_Perceptual",
+        .line = __LINE__,
+        .opening = "Applying CLevel_Middle_Perceptual filter from plane at 0x%x to plane at 0x%x...",
+    };
+    return kDescription;
+}
+
+bool CLevel_Middle_Perceptual::applies() {
     const CSliderParams& sliders = mParams->mSliderParams;
-    const bool touched = LevelSwitches::touchPerceptualMiddle(sliders);
-    if (!sliders.PerceptualMiddleEnabled && !touched)
-        return false;
+    return sliders.PerceptualMiddleEnabled || LevelSwitches::touchPerceptualMiddle(sliders);
+}
+
+void CLevel_Middle_Perceptual::prepare() {
+    const CSliderParams& sliders = mParams->mSliderParams;
     const bool finalTouch = mParams->Final_Touch_Mode_Enabled;
-    Log::log(LogLevel::Debug,
-             "Applying CLevel_Middle_Perceptual filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
     Log::log(LogLevel::Debug, "!Final_Touch_Mode_Enabled  %d.", !finalTouch);
     mMaps = LevelMath::factorMaps(1, {1, 1, 1});
     if (!finalTouch && sliders.PerceptualMiddleEnabled && !sliders.mAbsolute_Middle_Enabled)
-        mMaps = LevelMath::gammaMaps(mainGamma());
-    else if (finalTouch && touched && !LevelSwitches::touchMiddle(sliders) && mParams->Normal_Picture)
-        prepareTouch();
-    return true;
+        mMaps = LevelMath::gammaMaps(takeMainGamma());
+    else if (finalTouch && LevelSwitches::touchPerceptualMiddle(sliders) &&
+             !LevelSwitches::touchMiddle(sliders) && mParams->Normal_Picture)
+        takeTouchMaps();
 }
 
-float CLevel_Middle_Perceptual::mainGamma() {
+float CLevel_Middle_Perceptual::takeMainGamma() {
     const CSliderParams& sliders = mParams->mSliderParams;
     if (sliders.PerceptualGammaEnabled || !mParams->Normal_Picture || LevelSwitches::anyAbsolute(sliders))
         return 1;
@@ -120,11 +128,11 @@ float CLevel_Middle_Perceptual::mainGamma() {
     return static_cast<float>(position / 500 * (1 - low) + low);
 }
 
-void CLevel_Middle_Perceptual::prepareTouch() {
+void CLevel_Middle_Perceptual::takeTouchMaps() {
     logTones(*mParams);
     std::array<float, 4> gammas;
     for (std::size_t i = 0; i < kTones.size(); ++i)
-        gammas[i] = touchGamma(*mParams, kTones[i]);
+        gammas[i] = takeTouchGamma(*mParams, kTones[i]);
     Log::log(LogLevel::Debug, "CLevel_Middle_Perceptual TOUCH 2nd Condition matched.");
 
     const Bounds bounds = ratioBounds(*mParams);
@@ -141,8 +149,6 @@ void CLevel_Middle_Perceptual::prepareTouch() {
     mMaps = LevelMath::factorMaps(factors[0], {factors[1], factors[2], factors[3]});
 }
 
-void CLevel_Middle_Perceptual::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CLevel_Middle_Perceptual", __LINE__);
-    const int y = static_cast<int>(row);
-    mapKeepingHue(mMaps, std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width());
+void CLevel_Middle_Perceptual::mapRow(const PixelRow& row) const {
+    mapKeepingHue(mMaps, row);
 }

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/Curves/LevelMath.h"
-#include "Filters/IFilter.h"
+#include "Filters/PointFilter.h"
 
 /// Perceptual midtones: a gamma between the measured coefficients m_M_H_L_F (low) and m_M_H_H_F (high).
 ///
@@ -11,17 +11,19 @@
 /// A high coefficient above 1 is decreased by 1 for good before its use. A final-touch run multiplies by
 /// ratios that such gammas of the means give, for all channels, then for each; a ratio r below 1 acts as the
 /// factor 1 - r. Too bright pixels keep their hue. Gives way to the absolute midtones.
-class CLevel_Middle_Perceptual final : public IFilter {
+class CLevel_Middle_Perceptual final : public orvela::PointFilter {
 public:
-    using IFilter::IFilter;
+    using orvela::PointFilter::PointFilter;
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
-    float mainGamma();
-    void prepareTouch();
+    float takeMainGamma();
+    void takeTouchMaps();
 
     orvela::WideTables mMaps = {};
 };

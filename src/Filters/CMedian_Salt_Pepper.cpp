@@ -2,10 +2,8 @@
 
 #include "Filters/Kernels/PixelMath.h"
 #include "Filters/Kernels/ScaledTile.h"
-#include "Utility/Logger.h"
 
 #include <algorithm>
-#include <utility>
 
 using namespace orvela;
 
@@ -23,26 +21,30 @@ int thirdSmallest(int a, int b, int c, int d) {
 
 } // namespace
 
-CMedian_Salt_Pepper::CMedian_Salt_Pepper(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
-    : IFilter(params, inPlane, outPlane) {
-    mName = "CMedian_Salt_Pepper";
+const TaskDescription& CMedian_Salt_Pepper::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/CMedian_Salt_Pepper",
+        .line = 52,
+        .dumpName = "CMedian_Salt_Pepper",
+        .opening = "Applying CMedian_Salt_Pepper filter from plane at 0x%x to plane at 0x%x...",
+        .completion = "CMedian_Salt_Pepper Filter complete.",
+        .writes = Writes::SomePixels,
+    };
+    return kDescription;
 }
 
-bool CMedian_Salt_Pepper::PreApply() {
-    const CSliderParams& sliders = mParams->mSliderParams;
-    if (!sliders.SaltPepperEnabled || mParams->Switch_TOO_SHARP)
-        return false;
-    Log::log(LogLevel::Debug, "Applying CMedian_Salt_Pepper filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
-    const double factor = 2 - static_cast<double>(sliders.SaltPepperValue) * 1.9 / 1000;
+bool CMedian_Salt_Pepper::applies() {
+    return mParams->mSliderParams.SaltPepperEnabled && !mParams->Switch_TOO_SHARP;
+}
+
+void CMedian_Salt_Pepper::prepare() {
+    const double factor = 2 - static_cast<double>(mParams->mSliderParams.SaltPepperValue) * 1.9 / 1000;
     mSpotFactor = mParams->Dark_middle ? 0.5F : static_cast<float>(factor);
     mVertStart = mRadius;
     mVertEnd = static_cast<std::uint32_t>(mInPlane->height() - mRadius);
-    return true;
 }
 
 void CMedian_Salt_Pepper::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CMedian_Salt_Pepper", 52);
     const int y = static_cast<int>(row);
     const ConstRow above = std::as_const(*mInPlane).row(y - mRadius);
     const ConstRow here = std::as_const(*mInPlane).row(y);
@@ -58,9 +60,4 @@ void CMedian_Salt_Pepper::ApplyRow(std::uint32_t row) {
         const PixelMath::Rgb c = {here[0][x], here[1][x], here[2][x]};
         tile.set(i, c, isSpot ? static_cast<float>(median * 3) / static_cast<float>(c.r + c.g + c.b) : 1.0F);
     });
-}
-
-bool CMedian_Salt_Pepper::PostApply() {
-    Log::log(LogLevel::Debug, "CMedian_Salt_Pepper Filter complete.");
-    return true;
 }

@@ -11,12 +11,13 @@
 /// Dark spots and the one-pixel border are left alone.
 class CMedian_Salt_Pepper final : public IFilter {
 public:
-    CMedian_Salt_Pepper(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+    using IFilter::IFilter;
 
 protected:
-    bool PreApply() override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
     void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
 
 private:
     static constexpr std::int32_t mRadius = 1;

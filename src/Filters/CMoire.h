@@ -13,10 +13,11 @@ public:
     using IFilter::IFilter;
 
 protected:
-    bool PreApply() override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
     void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
 
 private:
-    std::optional<orvela::MoireKernel> mKernel; ///< between PreApply and PostApply
+    std::optional<orvela::MoireKernel> mKernel;
 };

@@ -6,25 +6,36 @@
 
 using namespace orvela;
 
-COrv_I_Iter::COrv_I_Iter(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
-    : IFilter(params, inPlane, outPlane) {
-    mName = "COrv_I_Iter";
+const TaskDescription& COrv_I_Iter::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/COrv_I_Iter",
+        .line = 115,
+        .dumpName = "COrv_I_Iter",
+        .start = "Applying COrv_I_Iter filter from plane at 0x%x to plane at 0x%x...",
+        .matched = "COrv_I_Iter Condition matched.",
+        .completion = "Orv_I_Iter Filter complete.",
+    };
+    return kDescription;
 }
 
-bool COrv_I_Iter::PreApply() {
+bool COrv_I_Iter::applies() {
+    storeSharpnessSwitch();
     const CSliderParams& sliders = mParams->mSliderParams;
-    Log::log(LogLevel::Debug, "Applying COrv_I_Iter filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
-    Log::log(LogLevel::Debug, "mSum_Color %f", mParams->mSum_Color);
-    mParams->Switch_TOO_SHARP_ORV_I = isTooSharpFor(*mParams, 0.25);
-    Log::log(LogLevel::Debug, "Switch_TOO_SHARP ORV I %d", mParams->Switch_TOO_SHARP_ORV_I);
     Log::log(LogLevel::Debug, "Orvela_Level_Enabled %d", sliders.OrvelaLevelEnabled);
     Log::log(LogLevel::Debug, "Normal_Picture %d", mParams->Normal_Picture);
     Log::log(LogLevel::Debug, "!Under_Exposed_Picture %d", !mParams->Under_Exposed_Picture);
-    if (mParams->Switch_TOO_SHARP_ORV_I || !sliders.OrvelaLevelEnabled || !mParams->Normal_Picture ||
-        mParams->Under_Exposed_Picture)
-        return false;
-    Log::log(LogLevel::Debug, "COrv_I_Iter Condition matched.");
+    return !mParams->Switch_TOO_SHARP_ORV_I && sliders.OrvelaLevelEnabled && mParams->Normal_Picture &&
+           !mParams->Under_Exposed_Picture;
+}
+
+void COrv_I_Iter::storeSharpnessSwitch() {
+    Log::log(LogLevel::Debug, "mSum_Color %f", mParams->mSum_Color);
+    mParams->Switch_TOO_SHARP_ORV_I = isTooSharpFor(*mParams, 0.25);
+    Log::log(LogLevel::Debug, "Switch_TOO_SHARP ORV I %d", mParams->Switch_TOO_SHARP_ORV_I);
+}
+
+void COrv_I_Iter::prepare() {
+    const CSliderParams& sliders = mParams->mSliderParams;
     Log::log(LogLevel::Debug, "Orvela_Level_Value Second Iteration: %f",
              static_cast<double>(sliders.OrvelaLevelValue));
 
@@ -39,16 +50,12 @@ bool COrv_I_Iter::PreApply() {
     Log::log(LogLevel::Debug, "Orvela_Lightness %f", static_cast<double>(lightness));
     Log::log(LogLevel::Debug, "dEpsilon  %f", static_cast<double>(dEpsilon));
     Log::log(LogLevel::Debug, "mSum_Color  %f", mParams->mSum_Color);
-    return true;
 }
 
 void COrv_I_Iter::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/COrv_I_Iter", 115);
     mKernel->applyRow(*mInPlane, *mOutPlane, static_cast<int>(row));
 }
 
-bool COrv_I_Iter::PostApply() {
+void COrv_I_Iter::complete() {
     mKernel.reset();
-    Log::log(LogLevel::Debug, "Orv_I_Iter Filter complete.");
-    return true;
 }

@@ -10,13 +10,17 @@
 /// the darker flat areas come out.
 class COrv_I_Iter final : public IFilter {
 public:
-    COrv_I_Iter(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+    using IFilter::IFilter;
 
 protected:
-    bool PreApply() override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
     void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    void complete() override;
 
 private:
+    void storeSharpnessSwitch();
+
     std::optional<orvela::IlluminationKernel> mKernel;
 };

@@ -1,9 +1,5 @@
 #include "Filters/CSpecial_Contrast_Perceptual.h"
 
-#include "Utility/Logger.h"
-
-#include <utility>
-
 using namespace orvela;
 
 namespace {
@@ -23,14 +19,23 @@ struct ChannelMass {
 
 } // namespace
 
-bool CSpecial_Contrast_Perceptual::PreApply() {
+const TaskDescription& CSpecial_Contrast_Perceptual::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/CSpecial_Contrast_Perceptual",
+        .line = 76,
+        .start = "Applying CSpecial_Contrast_Perceptual filter from plane at 0x%x to plane at 0x%x...",
+        .matched = "CSpecial_Contrast_Perceptual Condition matched.",
+        .completion = "CSpecial_Contrast_Perceptual filter complete.",
+    };
+    return kDescription;
+}
+
+bool CSpecial_Contrast_Perceptual::applies() {
     const CSliderParams& sliders = mParams->mSliderParams;
-    Log::log(LogLevel::Debug,
-             "Applying CSpecial_Contrast_Perceptual filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
-    if (!sliders.Contrast2Enabled || sliders.mAuto_Color_Enabled || mParams->Under_Exposed_Picture)
-        return false;
-    Log::log(LogLevel::Debug, "CSpecial_Contrast_Perceptual Condition matched.");
+    return sliders.Contrast2Enabled && !sliders.mAuto_Color_Enabled && !mParams->Under_Exposed_Picture;
+}
+
+void CSpecial_Contrast_Perceptual::prepare() {
     findTint();
     const double keep = 1 - mTint;
     for (std::size_t channel = 0; channel < mTables.size(); ++channel) {
@@ -38,7 +43,6 @@ bool CSpecial_Contrast_Perceptual::PreApply() {
         mTables[channel] = makeTable(
             [keep, added](int c) { return PixelMath::trunc(static_cast<float>(c * keep + added)); });
     }
-    return true;
 }
 
 // At most one primary can be missing while the others are present.
@@ -56,16 +60,8 @@ void CSpecial_Contrast_Perceptual::findTint() {
     }
 }
 
-void CSpecial_Contrast_Perceptual::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CSpecial_Contrast_Perceptual", 76);
-    const int y = static_cast<int>(row);
-    const auto correct = [this](std::uint8_t r, std::uint8_t g, std::uint8_t b) {
+void CSpecial_Contrast_Perceptual::mapRow(const PixelRow& row) const {
+    mapPixels(row, [this](std::uint8_t r, std::uint8_t g, std::uint8_t b) {
         return PixelMath::restoreMean({mTables[0][r], mTables[1][g], mTables[2][b]}, (r + g + b) / 3);
-    };
-    mapPixels(std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width(), correct);
-}
-
-bool CSpecial_Contrast_Perceptual::PostApply() {
-    Log::log(LogLevel::Debug, "CSpecial_Contrast_Perceptual filter complete.");
-    return true;
+    });
 }

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "Filters/IFilter.h"
 #include "Filters/Kernels/RowMapping.h"
+#include "Filters/PointFilter.h"
 
 #include <array>
 
@@ -14,14 +14,15 @@
 ///
 /// Pixels that leave the range are scaled down with their hue kept. Where no primary is missing, only the
 /// truncation of the mean lowers a pixel.
-class CSpecial_Contrast_Perceptual final : public IFilter {
+class CSpecial_Contrast_Perceptual final : public orvela::PointFilter {
 public:
-    using IFilter::IFilter;
+    using orvela::PointFilter::PointFilter;
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
     void findTint();

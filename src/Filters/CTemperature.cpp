@@ -1,9 +1,6 @@
 #include "Filters/CTemperature.h"
 
 #include "Filters/Kernels/RowMapping.h"
-#include "Utility/Logger.h"
-
-#include <utility>
 
 using namespace orvela;
 
@@ -25,18 +22,26 @@ std::int32_t intervalOf(int kelvin) {
 
 } // namespace
 
-bool CTemperature::PreApply() {
-    const CSliderParams& sliders = mParams->mSliderParams;
-    if (!sliders.Temperature_Enabled)
-        return false;
-    Log::log(LogLevel::Debug, "Applying CTemperature filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
-    Log::log(LogLevel::Debug, "CTemperature Condition matched.");
-    const auto kelvin =
-        static_cast<float>(static_cast<double>(sliders.Temperature_Value) * 8000 / 1000 + 2000);
+const TaskDescription& CTemperature::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/CTemperature",
+        .line = 72,
+        .opening = "Applying CTemperature filter from plane at 0x%x to plane at 0x%x...",
+        .matched = "CTemperature Condition matched.",
+        .completion = "CTemperature filter complete.",
+    };
+    return kDescription;
+}
+
+bool CTemperature::applies() {
+    return mParams->mSliderParams.Temperature_Enabled;
+}
+
+void CTemperature::prepare() {
+    const double position = mParams->mSliderParams.Temperature_Value;
+    const auto kelvin = static_cast<float>(position * 8000 / 1000 + 2000);
     mInterval = intervalOf(PixelMath::trunc(kelvin));
     prepareGains();
-    return true;
 }
 
 // The first component's normalisation is linear in the brightness and cancels it; the second and third divide
@@ -57,29 +62,21 @@ void CTemperature::prepareGains() {
         a = static_cast<float>(a / total());
         b = static_cast<float>(b / total());
         c = static_cast<float>(c / total());
-        mGains[sum] = {c + 1, b + 1, a + 1};
+        mGains[sum] = {c + 1.0, b + 1.0, a + 1.0}; // one formula with the channel: in double
     }
 }
 
-void CTemperature::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/CTemperature", 72);
-    const int y = static_cast<int>(row);
-    const auto warm = [this](int red, int green, int blue) {
+void CTemperature::mapRow(const PixelRow& row) const {
+    mapPixels(row, [this](int red, int green, int blue) {
         const int sum = red + green + blue;
         if (sum < kDarkestSum)
             return PixelMath::Rgb{red, green, blue};
         const Gains& gains = mGains[static_cast<std::size_t>(sum)];
-        const float r = gains.r * static_cast<float>(red);
-        const float g = gains.g * static_cast<float>(green);
-        const float b = gains.b * static_cast<float>(blue);
+        const auto r = static_cast<float>(gains.r * red);
+        const auto g = static_cast<float>(gains.g * green);
+        const auto b = static_cast<float>(gains.b * blue);
         const auto k = static_cast<float>(sum / (static_cast<double>(r) + g + b));
         return PixelMath::keepHue(
             {PixelMath::trunc(r * k), PixelMath::trunc(g * k), PixelMath::trunc(b * k)});
-    };
-    mapPixels(std::as_const(*mInPlane).row(y), mOutPlane->row(y), mInPlane->width(), warm);
-}
-
-bool CTemperature::PostApply() {
-    Log::log(LogLevel::Debug, "CTemperature filter complete.");
-    return true;
+    });
 }

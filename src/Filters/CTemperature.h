@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Filters/IFilter.h"
+#include "Filters/PointFilter.h"
 
 #include <array>
 
@@ -14,20 +14,21 @@
 ///
 /// where 140000 brings the sixteen points closest to the Planckian locus. Channel gains are one plus the
 /// normalised linear components of that colour at the pixel's brightness.
-class CTemperature final : public IFilter {
+class CTemperature final : public orvela::PointFilter {
 public:
-    using IFilter::IFilter;
+    using orvela::PointFilter::PointFilter;
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
 
 private:
     struct Gains {
-        float r;
-        float g;
-        float b;
+        double r;
+        double g;
+        double b;
     };
 
     void prepareGains();

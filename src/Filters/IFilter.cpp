@@ -1,12 +1,13 @@
 #include "Filters/IFilter.h"
 
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
+#include "Utility/Assertion.h"
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
 
 #include <QDir>
-#include <QSettings>
 
+#include <algorithm>
 #include <atomic>
 
 using namespace orvela;
@@ -15,7 +16,8 @@ namespace {
 
 constexpr char kSource[] = "Filters/IFilter";
 
-void dumpAfter(const QByteArray& task, const CARGBPlane& plane) {
+// Numbered over all runs of the process, so that no run overwrites the files of another.
+void dumpAfter(const char* task, const CARGBPlane& plane) {
     static std::atomic<unsigned> counter = 0;
     const QString file = QStringLiteral("image_after_%1_%2_%3x%4.raw")
                              .arg(QString::fromLatin1(task))
@@ -26,48 +28,65 @@ void dumpAfter(const QByteArray& task, const CARGBPlane& plane) {
     plane.dumpToRaw(path.toLocal8Bit());
 }
 
-const CARGBPlane& hostPlane() {
-    const auto* direct = dynamic_cast<const CARGBPlaneProxyDirect*>(CARGBPlaneProxy::current());
-    if (!direct)
-        qt_assert_x("IFilter::GetRGBFromHost", "This version of GetRGBFromHost requires direct proxy.",
-                    kSource, 89);
-    return direct->plane();
-}
-
 } // namespace
 
-IFilter::IFilter(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
-    : mParams(params), mInPlane(inPlane), mOutPlane(outPlane) {
-    mVertEnd = inPlane ? static_cast<std::uint32_t>(inPlane->height()) : 0;
-    if (!mParams) {
+IFilter::IFilter(const RunContext& context, CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
+    : TaskBase(context, params, inPlane), mOutPlane(outPlane) {
+    if (!params) {
         Log::log(LogLevel::Error, "The User Settings object was invalid.");
         throw CBadPtrEx(QStringLiteral("The User Settings object was invalid."), kSource, 31);
     }
-    if (!mOutPlane) {
+    if (!outPlane) {
         Log::log(LogLevel::Error, "The Output plane was invalid!");
         throw CBadPtrEx(QStringLiteral("The filter has an invalid Output plane."), kSource, 41);
     }
 }
 
+void IFilter::onPass() {
+    if (description().writes != Writes::SomePixels)
+        return;
+    const auto height = static_cast<std::uint32_t>(mInPlane->height());
+    const bool visitsNeighbours = mVertStep == 1;
+    keepRows(0, visitsNeighbours ? std::min(mVertStart, height) : height);
+    keepRows(std::min(passEnd(), height), height);
+}
+
+void IFilter::onRow(std::uint32_t row) {
+    if (description().writes == Writes::SomePixels)
+        keepRows(row, row + 1);
+}
+
+void IFilter::keepRows(std::uint32_t first, std::uint32_t last) {
+    for (std::uint32_t y = first; y < last; ++y) {
+        const ConstRow from = std::as_const(*mInPlane).row(static_cast<int>(y));
+        const Row to = mOutPlane->row(static_cast<int>(y));
+        for (std::size_t c = 0; c < to.size(); ++c)
+            std::copy_n(from[c], mInPlane->width(), to[c]);
+    }
+}
+
 void IFilter::onSuccess() {
     Log::log(LogLevel::Debug, "onSuccess copying from out to in");
-    mInPlane->copyFrom(*mOutPlane);
-    if (QSettings().value(QStringLiteral("2000/GUI/dumpImageAfterFile")).toInt() != 0)
-        dumpAfter(mName, *mInPlane);
+    if (description().writes != Writes::Nothing)
+        mInPlane->swapSamples(*mOutPlane);
+    if (mContext.dumpsPictures)
+        dumpAfter(description().dumpName, *mInPlane);
 }
 
 void IFilter::onStopped() {
-    if (mRowBegun)
-        mOutPlane->copyFrom(*mInPlane);
+    mOutPlane->copyFrom(*mInPlane);
 }
 
-void IFilter::GetRGBFromHost(int x, int y, std::uint32_t& r, std::uint32_t& g, std::uint32_t& b) {
-    const CARGBPlane& host = hostPlane();
-    r = host.red(x, y);
-    g = host.green(x, y);
-    b = host.blue(x, y);
+void IFilter::useHostPicture() {
+    const CARGBPlaneProxy* proxy = mContext.proxy ? mContext.proxy : CARGBPlaneProxy::current();
+    const auto* direct = dynamic_cast<const CARGBPlaneProxyDirect*>(proxy);
+    require(direct != nullptr, "IFilter::GetRGBFromHost",
+            "This version of GetRGBFromHost requires direct proxy.", kSource, 89);
+    mHostPicture = &direct->plane();
 }
 
-ConstRow IFilter::hostRow(int y) {
-    return hostPlane().row(y);
+void IFilter::GetRGBFromHost(int x, int y, std::uint32_t& r, std::uint32_t& g, std::uint32_t& b) const {
+    r = mHostPicture->red(x, y);
+    g = mHostPicture->green(x, y);
+    b = mHostPicture->blue(x, y);
 }

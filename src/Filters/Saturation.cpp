@@ -7,28 +7,33 @@
 
 #include <algorithm>
 #include <cmath>
-#include <utility>
 
 using namespace orvela;
 
 namespace {
 
-constexpr float kWidth = 11.0F; // of the window around a channel mean
+constexpr double kWidth = 11; // of the window around a channel mean
 constexpr unsigned kRowGrain = 16;
 
 } // namespace
 
-Saturation::Saturation(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
-    : IFilter(params, inPlane, outPlane) {
-    mName = "Saturation";
+const TaskDescription& Saturation::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/Saturation",
+        .line = 146,
+        .dumpName = "Saturation",
+        .start = "Applying Saturation filter from plane at 0x%x to plane at 0x%x...",
+        .matched = "CSaturation Condition matched.",
+        .completion = "Saturation Filter complete.",
+    };
+    return kDescription;
 }
 
-bool Saturation::PreApply() {
-    Log::log(LogLevel::Debug, "Applying Saturation filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
-    if (!mParams->mSliderParams.SaturationEnabled)
-        return false;
-    Log::log(LogLevel::Debug, "CSaturation Condition matched.");
+bool Saturation::applies() {
+    return mParams->mSliderParams.SaturationEnabled;
+}
+
+void Saturation::prepare() {
     chooseStrength(mParams->mSliderParams.SaturationValue);
     Log::log(LogLevel::Debug, " Saturation alfa: %f", static_cast<double>(mAlfa));
     mStep = PixelMath::samplingStep(mInPlane->width(), mInPlane->height());
@@ -40,7 +45,6 @@ bool Saturation::PreApply() {
         prepareDominant(means);
     else
         mHsv.emplace(mChange, mAlfa);
-    return true;
 }
 
 void Saturation::chooseStrength(float position) {
@@ -96,7 +100,8 @@ void Saturation::prepareDominant(const Means& means) {
                 return c;
             const double below = max - c;
             const double slope = below == 0 ? 0 : below / (mean * 0.025);
-            const double pull = 1 / std::cosh((c - mean) / kWidth) * (std::tanh(slope) + 1);
+            const double pull =
+                1 / std::cosh((static_cast<double>(c) - mean) / kWidth) * (std::tanh(slope) + 1);
             const auto value = static_cast<float>(c - pull * distance * mStrength / 2);
             return PixelMath::trunc(std::max(value, 0.0F));
         });
@@ -104,25 +109,20 @@ void Saturation::prepareDominant(const Means& means) {
     mCurves = {curve(means.r), curve(means.g), curve(means.b)};
 }
 
-void Saturation::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/Saturation", 146);
-    const int width = mInPlane->width();
-    const ConstRow in = std::as_const(*mInPlane).row(static_cast<int>(row));
-    const Row out = mOutPlane->row(static_cast<int>(row));
-    if (mDominant) {
-        mapKeepingHue(mCurves, in, out, width);
-        return;
-    }
-    mHsv->applyRow(in, out, width);
+void Saturation::mapRow(const PixelRow& row) const {
+    if (mDominant)
+        mapKeepingHue(mCurves, row);
+    else
+        mHsv->applyRow(row);
 }
 
-bool Saturation::PostApply() {
+void Saturation::complete() {
     const float meanOut = measure(*mOutPlane, mStep + 1).all;
     const float ratio = meanOut > 0 ? mMeanIn / meanOut : 1.0F;
     Log::log(LogLevel::Debug, " Saturation mean_out %f", static_cast<double>(meanOut));
     Log::log(LogLevel::Debug, " Saturation Radion_iso_Luma %f", static_cast<double>(ratio));
     const auto height = static_cast<unsigned>(mOutPlane->height());
-    orvela::forEachRange(0, height, kRowGrain, [&](unsigned first, unsigned last) {
+    forEachRange(0, height, kRowGrain, [&](unsigned first, unsigned last) {
         for (unsigned y = first; y < last; ++y) {
             const Row row = mOutPlane->row(static_cast<int>(y));
             recolourRow(row, 0, mOutPlane->width(), [&row, ratio](ScaledTile& tile, int i, int x) {
@@ -130,6 +130,4 @@ bool Saturation::PostApply() {
             });
         }
     });
-    Log::log(LogLevel::Debug, "Saturation Filter complete.");
-    return true;
 }

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "Filters/IFilter.h"
 #include "Filters/Kernels/RowMapping.h"
 #include "Filters/Kernels/SaturationKernel.h"
+#include "Filters/PointFilter.h"
 
 #include <optional>
 
@@ -20,14 +20,16 @@
 ///     (1 / cosh((c - u) / 11)) * (tanh((max - c) / (u * 0.025)) + 1) * d * k / 2
 ///
 /// with d the distance of the largest mean from the channel's own. A u of 0 with c at max takes tanh of 0.
-class Saturation final : public IFilter {
+class Saturation final : public orvela::PointFilter {
 public:
-    Saturation(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+    using orvela::PointFilter::PointFilter;
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void mapRow(const orvela::PixelRow& row) const override;
+    void complete() override;
 
 private:
     struct Means {

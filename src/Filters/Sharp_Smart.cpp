@@ -5,7 +5,6 @@
 
 #include <algorithm>
 #include <cmath>
-#include <utility>
 
 using namespace orvela;
 
@@ -32,16 +31,21 @@ double detailAt(const CARGBPlane& in, int x, int y) {
 
 } // namespace
 
-Sharp_Smart::Sharp_Smart(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane)
-    : IFilter(params, inPlane, outPlane) {
-    mName = "Sharp_Smart";
+const TaskDescription& Sharp_Smart::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Filters/Sharp_Smart",
+        .line = 64,
+        .dumpName = "Sharp_Smart",
+        .start = "Applying Sharp_Smart filter from plane at 0x%x to plane at 0x%x...",
+        .completion = "Sharp_Smart Noise Filter complete.",
+        .writes = Writes::Nothing,
+    };
+    return kDescription;
 }
 
-bool Sharp_Smart::PreApply() {
+void Sharp_Smart::prepare() {
     const int width = mInPlane->width();
     const int height = mInPlane->height();
-    Log::log(LogLevel::Debug, "Applying Sharp_Smart filter from plane at 0x%x to plane at 0x%x...",
-             logAddress(mInPlane), logAddress(mOutPlane));
     Log::log(LogLevel::Debug, "Size_Factor: %f", std::sqrt(static_cast<double>(mInPlane->pixelCount())));
     mParams->mSum_Color = 0;
     mStep = width < 700 && height < 700 ? 1 : PixelMath::samplingStep(width, height);
@@ -50,21 +54,17 @@ bool Sharp_Smart::PreApply() {
     mVertEnd = static_cast<std::uint32_t>(height - mStep);
     mVertStep = static_cast<std::uint32_t>(mStep);
     mRowSums.assign(static_cast<std::size_t>(std::max(0, (height - mStep) / mStep)), 0.0);
-    return true;
 }
 
 void Sharp_Smart::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Filters/Sharp_Smart", 64);
     double sum = 0;
     for (int x = 0; x < mInPlane->width() - mStep; x += mStep)
         sum += detailAt(*mInPlane, x, static_cast<int>(row));
     mRowSums[row / mVertStep] = sum;
 }
 
-bool Sharp_Smart::PostApply() {
+void Sharp_Smart::complete() {
     for (const double sum : mRowSums)
         mParams->mSum_Color += sum;
     Log::log(LogLevel::Debug, "mSum_Color %f", mParams->mSum_Color);
-    Log::log(LogLevel::Debug, "Sharp_Smart Noise Filter complete.");
-    return true;
 }

@@ -9,12 +9,13 @@
 /// every number of threads.
 class Sharp_Smart final : public IFilter {
 public:
-    Sharp_Smart(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+    using IFilter::IFilter;
 
 protected:
-    bool PreApply() override;
+    const orvela::TaskDescription& description() const override;
+    void prepare() override;
     void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    void complete() override;
 
 private:
     std::int32_t mStep = 1;       ///< distance of the samples in rows and columns

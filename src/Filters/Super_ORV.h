@@ -10,12 +10,13 @@
 /// so smoothed flat areas darken by 1.9 %.
 class Super_ORV final : public IFilter {
 public:
-    Super_ORV(CUserParams* params, CARGBPlane* inPlane, CARGBPlane* outPlane);
+    using IFilter::IFilter;
 
 protected:
-    bool PreApply() override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
     void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
 
 private:
     static constexpr std::int32_t mRadius = orvela::SmoothingKernel::kRadius;

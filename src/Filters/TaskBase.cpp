@@ -1,5 +1,6 @@
 #include "Filters/TaskBase.h"
 
+#include "Utility/Assertion.h"
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
 #include "Utility/RowScheduler.h"
@@ -9,6 +10,14 @@
 using namespace orvela;
 
 namespace {
+
+// Rows that one thread works on before it takes others: enough for kernels that share work between
+// neighbouring rows, few enough to keep all processors busy.
+constexpr unsigned kBandRows = 16;
+
+struct CanceledEx final : CGenericEx {
+    CanceledEx(const char* source, int line) : CGenericEx(QStringLiteral("User canceled."), source, line) {}
+};
 
 // Times one phase between a scope entry and the matching exit of the log.
 class PhaseTimer {
@@ -26,15 +35,36 @@ private:
 
 } // namespace
 
+TaskBase::TaskBase(const RunContext& context, CUserParams* params, CARGBPlane* inPlane)
+    : mContext(context), mParams(params), mInPlane(inPlane),
+      mVertEnd(inPlane ? static_cast<std::uint32_t>(inPlane->height()) : 0) {}
+
 bool TaskBase::Apply() {
     try {
-        if (runPhases())
-            return true;
+        mOutcome = runPhases() ? TaskOutcome::Applied : TaskOutcome::Skipped;
+    } catch (const CanceledEx&) {
+        fail(TaskOutcome::Cancelled, {});
     } catch (...) {
-        Log::scopeExit(LogLevel::Error, "Unable to complete filter block.");
+        fail(TaskOutcome::Failed, Failure::current());
     }
-    onStopped();
-    return false;
+    if (mOutcome != TaskOutcome::Applied && mPassBegun)
+        restore();
+    return mOutcome == TaskOutcome::Applied;
+}
+
+void TaskBase::fail(TaskOutcome outcome, const Failure& failure) {
+    Log::scopeExit(LogLevel::Error, "Unable to complete filter block.");
+    mOutcome = outcome;
+    mFailure = failure;
+}
+
+void TaskBase::restore() {
+    try {
+        onStopped();
+    } catch (...) {
+        mOutcome = TaskOutcome::Failed;
+        mFailure = Failure::current();
+    }
 }
 
 bool TaskBase::runPhases() {
@@ -46,6 +76,7 @@ bool TaskBase::runPhases() {
     pre.done();
 
     const PhaseTimer pass("Pre DoApplyParallel");
+    mPassBegun = true;
     if (!DoApplyParallel()) {
         Log::scopeExit(LogLevel::Debug, "Task canceled in DoApplyParallel.");
         return false;
@@ -66,26 +97,77 @@ bool TaskBase::runPhases() {
     return true;
 }
 
-void TaskBase::ApplyRow(std::uint32_t) {}
-
-bool TaskBase::DoApplyParallel() {
-    Q_ASSERT_X(mVertStep != 0, "TaskBase::DoApplyParallel()", "mVertStep");
-    if (mVertEnd <= mVertStart || static_cast<std::int32_t>(mVertEnd) < 0)
-        return true;
-    const std::uint32_t count = (mVertEnd - mVertStart) / mVertStep;
-    orvela::forEachRange(mVertStart, mVertStart + count, 1, [this](unsigned first, unsigned last) {
-        for (unsigned i = first; i < last; ++i)
-            ApplyRow(i * mVertStep);
-    });
+bool TaskBase::PreApply() {
+    const TaskDescription& texts = description();
+    log(texts.start);
+    if (!applies())
+        return false;
+    log(texts.opening);
+    log(texts.matched);
+    prepare();
     return true;
 }
 
-void beginRow(const CUserParams& params, const CARGBPlane& inPlane, std::uint32_t row, const char* source,
-              int line) {
-    if (params.mCancelRequested)
-        throw CGenericEx(QStringLiteral("User canceled."), source, line);
-    if (params.mProgressCallback) {
-        const float perRow = 100.0F / static_cast<float>(inPlane.height());
-        params.mProgressCallback(static_cast<std::int32_t>(perRow * static_cast<float>(row + 1)));
+bool TaskBase::PostApply() {
+    complete();
+    log(description().completion);
+    return true;
+}
+
+void TaskBase::log(const char* text) const {
+    if (text)
+        Log::log(LogLevel::Debug, text, logAddress(mInPlane.get()), logAddress(outPlane()));
+}
+
+void TaskBase::ApplyRow(std::uint32_t) {}
+
+void TaskBase::ApplyBand(const RowBand& band) {
+    for (const std::uint32_t row : band)
+        ApplyRow(row);
+}
+
+bool TaskBase::DoApplyParallel() {
+    require(mVertStep != 0, "TaskBase::DoApplyParallel()", "mVertStep", "Filters/TaskBase", 100);
+    onPass();
+    forEachRange(mVertStart, passEnd(), kBandRows,
+                 [this](unsigned first, unsigned last) { ApplyBand(RowBand(*this, first, last)); });
+    return true;
+}
+
+std::uint32_t TaskBase::passEnd() const {
+    const bool empty = mVertEnd <= mVertStart || static_cast<std::int32_t>(mVertEnd) < 0;
+    return empty ? mVertStart : mVertStart + (mVertEnd - mVertStart) / mVertStep;
+}
+
+const TaskDescription& TaskBase::description() const {
+    static constexpr TaskDescription kNone;
+    return kNone;
+}
+
+std::uint32_t TaskBase::enterRow(std::uint32_t index) {
+    const std::uint32_t row = index * mVertStep;
+    if (const TaskDescription& own = description(); own.testsStop) {
+        if (mParams->mCancelRequested)
+            throw CanceledEx(own.source, own.line);
+        if (mParams->mProgressCallback) {
+            const float perRow = 100.0F / static_cast<float>(mInPlane->height());
+            mParams->mProgressCallback(static_cast<std::int32_t>(perRow * static_cast<float>(row + 1)));
+        }
     }
+    onRow(row);
+    return row;
+}
+
+Failure Failure::current() {
+    try {
+        throw;
+    } catch (const std::exception& failure) {
+        return {innermostMessage(failure), isOutOfMemory(failure)};
+    } catch (...) {
+        return {QStringLiteral("unknown error"), false};
+    }
+}
+
+std::uint32_t RowBand::enter(std::uint32_t index) const {
+    return mTask.enterRow(index);
 }

@@ -16,23 +16,29 @@ float greySpread(int r, int g, int b) {
 
 } // namespace
 
-bool CHistogram0::PreApply() {
+const TaskDescription& CHistogram0::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Histograms/CHistogram0",
+        .line = __LINE__,
+    };
+    return kDescription;
+}
+
+void CHistogram0::prepare() {
     mWhite = 0;
     mBlack = 0;
     mSampleCount = 0;
     prepareSampling();
-    return true;
 }
 
 void CHistogram0::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Histograms/CHistogram0", __LINE__);
     RowCounts counts = countSampledRow(row);
     countGreys(row, counts);
     merge(counts, true);
 }
 
 void CHistogram0::countGreys(std::uint32_t row, RowCounts& counts) const {
-    const ConstRow in = std::as_const(*mInPlane).row(static_cast<int>(row));
+    const ConstRow in = mInPlane->row(static_cast<int>(row));
     for (int x = 0; x < mInPlane->width() - mHistoStep; x += mHistoStep) {
         const std::uint32_t luma = PixelMath::lumaOf(in[0][x], in[1][x], in[2][x]);
         if (greySpread(in[0][x], in[1][x], in[2][x]) >= 30)
@@ -42,21 +48,20 @@ void CHistogram0::countGreys(std::uint32_t row, RowCounts& counts) const {
     }
 }
 
-bool CHistogram0::PostApply() {
+void CHistogram0::complete() {
     scaleBins();
     storeBandShares();
     mParams->m_Histo_Light_Exception = HighlightShares<double>::of(mRed, mGreen, mBlue, pixels()).flag();
     storeMeans();
-    return true;
 }
 
-void CHistogram0::storeBandShares() const {
+void CHistogram0::storeBandShares() {
     mParams->m_Dark_Acu = sumOf(mLuma, 1, 85) / pixels();
     mParams->m_Middle_Acu = sumOf(mLuma, 86, 170) / pixels();
     mParams->m_Light_Acu = sumOf(mLuma, 220, 255) / pixels();
 }
 
-void CHistogram0::storeMeans() const {
+void CHistogram0::storeMeans() {
     const auto mean = [this](std::uint32_t sum) {
         return static_cast<float>(mSampleCount == 0 ? 0 : sum / mSampleCount);
     };

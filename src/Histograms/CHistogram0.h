@@ -9,12 +9,13 @@ public:
     using IHistogram::IHistogram;
 
 protected:
-    bool PreApply() override;
+    const orvela::TaskDescription& description() const override;
+    void prepare() override;
     void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    void complete() override;
 
 private:
     void countGreys(std::uint32_t row, RowCounts& counts) const;
-    void storeBandShares() const;
-    void storeMeans() const;
+    void storeBandShares();
+    void storeMeans();
 };

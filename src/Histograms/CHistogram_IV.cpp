@@ -4,33 +4,34 @@
 
 using namespace orvela;
 
-bool CHistogram_IV::PreApply() {
-    if (!mParams->mSliderParams.mAuto_Color_Enabled)
-        return false;
-    Log::log(LogLevel::Debug, "CHistogram_IV is starting.");
+const TaskDescription& CHistogram_IV::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Histograms/CHistogram_IV",
+        .line = __LINE__,
+        .opening = "CHistogram_IV is starting.",
+    };
+    return kDescription;
+}
+
+bool CHistogram_IV::applies() {
+    return mParams->mSliderParams.mAuto_Color_Enabled;
+}
+
+void CHistogram_IV::prepare() {
     logFlags();
     mParams->Dark_Ave = 0;
     mParams->Middle_Ave = 0;
     mParams->Light_Ave = 0;
     prepareSampling();
-    return true;
 }
 
-void CHistogram_IV::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Histograms/CHistogram_IV", __LINE__);
-    merge(countSampledRow(row));
-}
-
-bool CHistogram_IV::PostApply() {
-    if (!mParams->mSliderParams.mAuto_Color_Enabled)
-        return false;
+void CHistogram_IV::complete() {
     scaleBins();
     storeMeans();
     mParams->Dark_Ave = bandAverage<double>(mLuma, 1, 85);
     mParams->Middle_Ave = bandAverage<double>(mLuma, 86, 170);
     mParams->Light_Ave = bandAverage<double>(mLuma, 171, 255);
-    testCast(4);
-    return true;
+    storeCast(4);
 }
 
 void CHistogram_IV::logFlags() const {

@@ -7,15 +7,22 @@
 
 using namespace orvela;
 
-bool CHistogram_Luma_Final::PreApply() {
-    Log::log(LogLevel::Debug, "CHistogram_Luma_Final is starting.");
+const TaskDescription& CHistogram_Luma_Final::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Histograms/CHistogram_Luma_Final",
+        .line = __LINE__,
+        .opening = "CHistogram_Luma_Final is starting.",
+        .completion = "CHistogram_Luma_Final complete.",
+    };
+    return kDescription;
+}
+
+void CHistogram_Luma_Final::prepare() {
     mSumLuma = 0;
     mSampleCount = 0;
-    return true;
 }
 
 void CHistogram_Luma_Final::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Histograms/CHistogram_Luma_Final", __LINE__);
     RowCounts counts;
     const ConstRow in = std::as_const(*mInPlane).row(static_cast<int>(row));
     for (int x = 0; x < mInPlane->width(); ++x)
@@ -23,9 +30,7 @@ void CHistogram_Luma_Final::ApplyRow(std::uint32_t row) {
     merge(counts);
 }
 
-bool CHistogram_Luma_Final::PostApply() {
+void CHistogram_Luma_Final::complete() {
     mParams->m_OriginalLuma = static_cast<float>(mSampleCount == 0 ? 0 : mSumLuma / mSampleCount);
     Log::log(LogLevel::Debug, "m_OriginalLuma  %f", static_cast<double>(mParams->m_OriginalLuma));
-    Log::log(LogLevel::Debug, "CHistogram_Luma_Final complete.");
-    return true;
 }

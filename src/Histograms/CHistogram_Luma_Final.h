@@ -8,7 +8,8 @@ public:
     using CLocalHistogram::CLocalHistogram;
 
 protected:
-    bool PreApply() override;
+    const orvela::TaskDescription& description() const override;
+    void prepare() override;
     void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    void complete() override;
 };

@@ -1,27 +1,28 @@
 #include "Histograms/CHistogram_Luma_after_Orv.h"
 
-#include "Utility/Logger.h"
-
 using namespace orvela;
 
-bool CHistogram_Luma_after_Orv::PreApply() {
+const TaskDescription& CHistogram_Luma_after_Orv::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Histograms/CHistogram_Luma_after_Orv",
+        .line = __LINE__,
+        .opening = "CHistogram_Luma_after_Orv is starting.",
+        .matched = "CHistogram_Luma_after_Orv Condition matched.",
+    };
+    return kDescription;
+}
+
+bool CHistogram_Luma_after_Orv::applies() {
     const CSliderParams& sliders = mParams->mSliderParams;
     const bool iterated = sliders.OrvelaLevelEnabled || sliders.OrvelaLevel2Enabled;
-    if (!iterated || !mParams->Normal_Picture || mParams->Under_Exposed_Picture)
-        return false;
-    Log::log(LogLevel::Debug, "CHistogram_Luma_after_Orv is starting.");
-    Log::log(LogLevel::Debug, "CHistogram_Luma_after_Orv Condition matched.");
+    return iterated && mParams->Normal_Picture && !mParams->Under_Exposed_Picture;
+}
+
+void CHistogram_Luma_after_Orv::prepare() {
     prepareSampling();
-    return true;
 }
 
-void CHistogram_Luma_after_Orv::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Histograms/CHistogram_Luma_after_Orv", __LINE__);
-    merge(countSampledRow(row));
-}
-
-bool CHistogram_Luma_after_Orv::PostApply() {
+void CHistogram_Luma_after_Orv::complete() {
     scaleBins();
     storeMeans();
-    return true;
 }

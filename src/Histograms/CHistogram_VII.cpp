@@ -4,27 +4,28 @@
 
 using namespace orvela;
 
-bool CHistogram_VII::PreApply() {
-    Log::log(LogLevel::Debug, "CHistogram_VII is starting.");
+const TaskDescription& CHistogram_VII::description() const {
+    static constexpr TaskDescription kDescription = {
+        .source = "Histograms/CHistogram_VII",
+        .line = __LINE__,
+        .opening = "CHistogram_VII is starting.",
+    };
+    return kDescription;
+}
+
+void CHistogram_VII::prepare() {
     prepareSampling();
-    return true;
 }
 
-void CHistogram_VII::ApplyRow(std::uint32_t row) {
-    beginRow(row, "Histograms/CHistogram_VII", __LINE__);
-    merge(countSampledRow(row));
-}
-
-bool CHistogram_VII::PostApply() {
+void CHistogram_VII::complete() {
     scaleBins();
     storeMeans();
-    testCast(2);
-    testBalance();
-    return true;
+    storeCast(2);
+    storeBalance();
 }
 
 // Holds as soon as one channel mean is above 0: for the largest mean, both others are below 1.4 times it.
-void CHistogram_VII::testBalance() const {
+void CHistogram_VII::storeBalance() {
     const double r = mParams->m_OriginalLumaR;
     const double g = mParams->m_OriginalLumaG;
     const double b = mParams->m_OriginalLumaB;

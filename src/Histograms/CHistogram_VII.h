@@ -8,11 +8,11 @@ public:
     using CLocalHistogram::CLocalHistogram;
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    const orvela::TaskDescription& description() const override;
+    void prepare() override;
+    void complete() override;
     void StoreResults() override;
 
 private:
-    void testBalance() const;
+    void storeBalance();
 };

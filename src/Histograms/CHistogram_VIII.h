@@ -8,7 +8,8 @@ public:
     using CLocalHistogram::CLocalHistogram;
 
 protected:
-    bool PreApply() override;
-    void ApplyRow(std::uint32_t row) override;
-    bool PostApply() override;
+    const orvela::TaskDescription& description() const override;
+    bool applies() override;
+    void prepare() override;
+    void complete() override;
 };

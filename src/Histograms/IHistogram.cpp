@@ -40,10 +40,6 @@ void IHistogram::RowCounts::add(std::uint32_t r, std::uint32_t g, std::uint32_t 
     ++samples;
 }
 
-IHistogram::IHistogram(CUserParams* params, CARGBPlane* inPlane) : mParams(params), mInPlane(inPlane) {
-    mVertEnd = inPlane ? static_cast<std::uint32_t>(inPlane->height()) : 0;
-}
-
 bool IHistogram::Apply() {
     if (!TaskBase::Apply())
         return false;
@@ -58,6 +54,10 @@ void IHistogram::StoreResults() {
     mParams->pHisto_Red = mRed;
     mParams->pHisto_Green = mGreen;
     mParams->pHisto_Blue = mBlue;
+}
+
+void IHistogram::ApplyRow(std::uint32_t row) {
+    merge(countSampledRow(row));
 }
 
 void IHistogram::prepareSampling() {
@@ -111,7 +111,7 @@ void IHistogram::scaleBins() {
         scale(*bins, mHistoFactor);
 }
 
-void IHistogram::storeMeans() const {
+void IHistogram::storeMeans() {
     const auto mean = [this](std::uint32_t sum) {
         const double value = static_cast<double>(static_cast<float>(sum)) * mHistoFactor / pixels();
         return std::trunc(static_cast<float>(value));
@@ -129,7 +129,7 @@ void IHistogram::logMeans() const {
     Log::log(LogLevel::Debug, "m_OriginalLumaB %f", static_cast<double>(mParams->m_OriginalLumaB));
 }
 
-void IHistogram::testCast(float factor) const {
+void IHistogram::storeCast(float factor) {
     const float r = mParams->m_OriginalLumaR;
     const float g = mParams->m_OriginalLumaG;
     const float b = mParams->m_OriginalLumaB;

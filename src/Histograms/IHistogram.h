@@ -11,7 +11,8 @@
 class IHistogram : public TaskBase {
 public:
     /// The pointers are not owned and not checked.
-    IHistogram(CUserParams* params, CARGBPlane* inPlane);
+    IHistogram(const orvela::RunContext& context, CUserParams* params, CARGBPlane* inPlane)
+        : TaskBase(context, params, inPlane) {}
 
     /// The run of TaskBase, then StoreResults().
     bool Apply() override;
@@ -37,10 +38,12 @@ protected:
 
     /// Publishes the bins and the counts of bright and dark grey samples.
     virtual void StoreResults();
+    /// Counts the sampled columns of a row.
+    void ApplyRow(std::uint32_t row) override;
 
     /// Chooses step, weight and row range for a sampled measurement.
     void prepareSampling();
-    /// Counts the sampled columns of a row; every sampled histogram's row operation.
+    /// The counts of a row's sampled columns.
     RowCounts countSampledRow(std::uint32_t row) const;
     /// Adds a row's counts to the measurement; the sums and counters wrap at 2^32.
     /// @param warnNearWrap  log a warning when a sum comes within 256 of wrapping
@@ -50,19 +53,13 @@ protected:
     /// Weighs the bins so that they estimate counts of the whole picture.
     void scaleBins();
     /// Publishes the mean luma and the channel means, truncated.
-    void storeMeans() const;
+    void storeMeans();
     /// Lists the means to the log.
     void logMeans() const;
     /// Sets the colour-cast flag when one channel mean, times `factor`, is below both others. Never clears
     /// it.
-    void testCast(float factor) const;
+    void storeCast(float factor);
 
-    void beginRow(std::uint32_t row, const char* source, int line) const {
-        ::beginRow(*mParams, *mInPlane, row, source, line);
-    }
-
-    CUserParams* mParams;
-    CARGBPlane* mInPlane;
     float mHistoFactor = 1.0F;   ///< weight of one sample
     std::int32_t mHistoStep = 1; ///< distance of the samples in rows and columns
     orvela::Histogram mLuma = {};

@@ -58,12 +58,12 @@ void CSmartAnalyzer_Perceptual_Contrast_Brightness::Analyze() {
     if (!contrast && !sliders.Brightness2Enabled && !sliders.mPerceptual_Brightness_Touch_Enabled)
         return;
     resetMasses(*mParams);
-    analyzeBrightness();
+    storeBrightnessFactors();
     if (contrast)
-        analyzeContrast();
+        storeContrastFactors();
 }
 
-void CSmartAnalyzer_Perceptual_Contrast_Brightness::analyzeBrightness() const {
+void CSmartAnalyzer_Perceptual_Contrast_Brightness::storeBrightnessFactors() {
     CUserParams& params = *mParams;
     const int pixels = mInPlane->pixelCount();
     params.B_H_F_High = static_cast<float>(risingMass(params.pHisto_Luma, kBrightHighlights, kSlope));
@@ -83,7 +83,7 @@ bool CSmartAnalyzer_Perceptual_Contrast_Brightness::lifts() const {
     return slider >= kNeutralSlider;
 }
 
-void CSmartAnalyzer_Perceptual_Contrast_Brightness::analyzeContrast() const {
+void CSmartAnalyzer_Perceptual_Contrast_Brightness::storeContrastFactors() {
     CUserParams& params = *mParams;
     const double up = params.m_B_H_C_F_High;
     const double down = params.m_B_H_C_F_Low;

@@ -13,7 +13,7 @@ protected:
     void Analyze() override;
 
 private:
-    void analyzeBrightness() const;
-    void analyzeContrast() const;
+    void storeBrightnessFactors();
+    void storeContrastFactors();
     bool lifts() const;
 };

@@ -42,14 +42,14 @@ void CSmartAnalyzer_Perceptual_Level_Dark::Analyze() {
     const CSliderParams& sliders = mParams->mSliderParams;
     if (!mParams->Final_Touch_Mode_Enabled) {
         if (sliders.PerceptualDarkEnabled && !sliders.mAbsolute_Dark_Enabled)
-            analyzeMain();
+            storeMainFactors();
     } else if (LevelSwitches::touchPerceptualDark(sliders) && !LevelSwitches::touchDark(sliders)) {
-        analyzeTouch();
+        storeTouchFactors();
     }
     Log::log(LogLevel::Debug, "CSmartAnalyzer_Perceptual_Level_Dark complete.");
 }
 
-int CSmartAnalyzer_Perceptual_Level_Dark::recountCenter() const {
+int CSmartAnalyzer_Perceptual_Level_Dark::recountCenter() {
     recount(*mInPlane, *mParams);
     const int center = leftLimit(*mParams) + kReach;
     Log::log(LogLevel::Debug, "Delta_H: %f", static_cast<double>(kReach));
@@ -57,7 +57,7 @@ int CSmartAnalyzer_Perceptual_Level_Dark::recountCenter() const {
     return center;
 }
 
-void CSmartAnalyzer_Perceptual_Level_Dark::analyzeMain() const {
+void CSmartAnalyzer_Perceptual_Level_Dark::storeMainFactors() {
     Log::log(LogLevel::Debug, "Left_Level_Coef %f", kPull);
     const int center = recountCenter();
     const double mass = darkMass(mParams->pHisto_Luma, center);
@@ -72,12 +72,13 @@ void CSmartAnalyzer_Perceptual_Level_Dark::analyzeMain() const {
     Log::log(LogLevel::Debug, "m_L_H_L_F %f", static_cast<double>(mParams->m_L_H_L_F));
 }
 
-void CSmartAnalyzer_Perceptual_Level_Dark::analyzeTouch() const {
+void CSmartAnalyzer_Perceptual_Level_Dark::storeTouchFactors() {
+    CUserParams& params = *mParams;
     const int center = recountCenter();
     for (const TouchChannel& channel : kTouchChannels) {
         if (!(mParams->mSliderParams.*channel.enabled))
             continue;
-        const double mass = darkMass(mParams->*channel.bins, center);
-        mParams->*channel.coefficient = mass > 0 ? static_cast<float>(mass / pixels() * kTouchGain) : 0.0F;
+        const double mass = darkMass(params.*channel.bins, center);
+        params.*channel.coefficient = mass > 0 ? static_cast<float>(mass / pixels() * kTouchGain) : 0.0F;
     }
 }

@@ -72,14 +72,14 @@ void CSmartAnalyzer_Perceptual_Level_Middle::Analyze() {
     const bool perceptual = LevelSwitches::anyPerceptual(sliders) || sliders.PerceptualGammaEnabled;
     if (!mParams->Final_Touch_Mode_Enabled) {
         if (perceptual && !sliders.GammaCorrectionEnabled && !LevelSwitches::anyAbsolute(sliders))
-            analyzeMain();
+            storeMainFactors();
     } else if (LevelSwitches::touchPerceptualMiddle(sliders)) {
-        analyzeTouch();
+        storeTouchFactors();
     }
     Log::log(LogLevel::Debug, "CSmartAnalyzer_Perceptual_Level_Middle finished..");
 }
 
-void CSmartAnalyzer_Perceptual_Level_Middle::analyzeMain() const {
+void CSmartAnalyzer_Perceptual_Level_Middle::storeMainFactors() {
     Log::log(LogLevel::Debug, "CSmartAnalyzer_Perceptual_Level_Middle Condition matched.");
     CUserParams& params = *mParams;
     logDarkened(params.pHisto_Luma);
@@ -90,7 +90,7 @@ void CSmartAnalyzer_Perceptual_Level_Middle::analyzeMain() const {
     params.m_M_H_H_F = 2 * params.m_M_L_C_F_Hight;
 }
 
-void CSmartAnalyzer_Perceptual_Level_Middle::analyzeTouch() const {
+void CSmartAnalyzer_Perceptual_Level_Middle::storeTouchFactors() {
     Log::log(LogLevel::Debug, "CSmartAnalyzer_Perceptual_Level_Middle_TOUCH  Condition matched.");
     CUserParams& params = *mParams;
     Log::log(LogLevel::Debug, "iImageSize %f", static_cast<double>(mInPlane->pixelCount()));

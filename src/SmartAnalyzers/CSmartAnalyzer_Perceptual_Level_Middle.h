@@ -13,6 +13,6 @@ protected:
     void Analyze() override;
 
 private:
-    void analyzeMain() const;
-    void analyzeTouch() const;
+    void storeMainFactors();
+    void storeTouchFactors();
 };

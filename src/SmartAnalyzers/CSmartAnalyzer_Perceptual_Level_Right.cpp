@@ -47,12 +47,12 @@ double shortShare(const Histogram& bins, int center, int pixels) {
 void CSmartAnalyzer_Perceptual_Level_Right::Analyze() {
     const CSliderParams& sliders = mParams->mSliderParams;
     if (LevelSwitches::anyPerceptual(sliders) && !LevelSwitches::anyAbsolute(sliders))
-        analyzeMain();
+        storeMainFactors();
     if (LevelSwitches::touchPerceptualLight(sliders) && !LevelSwitches::touchLight(sliders))
-        analyzeTouch();
+        storeTouchFactors();
 }
 
-int CSmartAnalyzer_Perceptual_Level_Right::recountLimit() const {
+int CSmartAnalyzer_Perceptual_Level_Right::recountLimit() {
     recount(*mInPlane, *mParams);
     const int limit = rightLimit(*mParams);
     Log::log(LogLevel::Debug, "Delta_H: %f", static_cast<double>(kReach));
@@ -60,7 +60,7 @@ int CSmartAnalyzer_Perceptual_Level_Right::recountLimit() const {
     return limit;
 }
 
-void CSmartAnalyzer_Perceptual_Level_Right::analyzeMain() const {
+void CSmartAnalyzer_Perceptual_Level_Right::storeMainFactors() {
     Log::log(LogLevel::Debug, "HIGHLIGHT HAS STARTED");
     const int limit = recountLimit();
     const double share = shortShare(mParams->pHisto_Luma, limit + kReach, pixels());
@@ -69,12 +69,13 @@ void CSmartAnalyzer_Perceptual_Level_Right::analyzeMain() const {
     Log::log(LogLevel::Debug, "Perceptual Right level: %f", static_cast<double>(mParams->m_R_L_L_F));
 }
 
-void CSmartAnalyzer_Perceptual_Level_Right::analyzeTouch() const {
+void CSmartAnalyzer_Perceptual_Level_Right::storeTouchFactors() {
+    CUserParams& params = *mParams;
     const int center = recountLimit() + kReach;
     for (const TouchChannel& channel : kTouchChannels) {
         if (!(mParams->mSliderParams.*channel.enabled))
             continue;
-        const double share = shortShare(mParams->*channel.bins, center, pixels());
-        mParams->*channel.coefficient = static_cast<float>(share * channel.gain);
+        const double share = shortShare(params.*channel.bins, center, pixels());
+        params.*channel.coefficient = static_cast<float>(share * channel.gain);
     }
 }

@@ -13,7 +13,7 @@ protected:
     void Analyze() override;
 
 private:
-    void analyzeMain() const;
-    void analyzeTouch() const;
-    int recountLimit() const;
+    void storeMainFactors();
+    void storeTouchFactors();
+    int recountLimit();
 };

@@ -9,13 +9,9 @@ namespace {
 constexpr char kSource[] = "SmartAnalyzers/ISmartAnalyzer";
 }
 
-ISmartAnalyzer::ISmartAnalyzer(CUserParams* params, CARGBPlane* inPlane)
-    : mParams(params), mInPlane(inPlane) {
-    mVertEnd = inPlane ? static_cast<std::uint32_t>(inPlane->height()) : 0;
-}
-
 bool ISmartAnalyzer::Apply() {
     RunAnalyzer();
+    setApplied();
     return true;
 }
 
@@ -33,7 +29,7 @@ void ISmartAnalyzer::RunAnalyzer() {
         Analyze();
     } catch (...) {
         Log::log(LogLevel::Error, "An error occured while running a SmartAnalyzer object.");
-        throw CGenericEx(QStringLiteral("An error occured while running a SmartAnalyzer object."), kSource,
-                         40);
+        std::throw_with_nested(CGenericEx(
+            QStringLiteral("An error occured while running a SmartAnalyzer object."), kSource, 40));
     }
 }

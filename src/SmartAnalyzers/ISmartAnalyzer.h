@@ -9,7 +9,8 @@
 class ISmartAnalyzer : public TaskBase {
 public:
     /// The pointers are not owned and not checked here.
-    ISmartAnalyzer(CUserParams* params, CARGBPlane* inPlane);
+    ISmartAnalyzer(const orvela::RunContext& context, CUserParams* params, CARGBPlane* inPlane)
+        : TaskBase(context, params, inPlane) {}
 
     /// RunAnalyzer(), then true.
     bool Apply() override;
@@ -24,7 +25,4 @@ protected:
 
     /// Pixels of the plane that shares are taken over; 1 for an empty one, whose masses are 0.
     int pixels() const { return std::max(1, mInPlane->pixelCount()); }
-
-    CUserParams* mParams;
-    CARGBPlane* mInPlane;
 };

@@ -4,6 +4,7 @@
 #include <cstdarg>
 #include <cstdint>
 #include <mutex>
+#include <utility>
 
 using namespace orvela;
 
@@ -14,11 +15,12 @@ constexpr std::size_t kLineSize = 1024;
 constexpr std::size_t kScopeSize = 1024;
 
 std::mutex gMutex;
-std::unique_ptr<ILogger> gLogger;
+ILogger* gLogger = nullptr; // owned; nothing is destroyed behind the back of a late line
 std::atomic<bool> gInstalled = false;
 std::atomic<int> gThreshold = static_cast<int>(LogLevel::Info);
 std::atomic<bool> gPrefixes = false;
 int gDepth = 0;
+thread_local LogDepth::Binding tDepth = &gDepth;
 
 const char* prefixOf(LogLevel level) {
     static constexpr const char* kPrefixes[] = {"Hgh> ", "Err> ", "Wrn> ", "Ifo> ", "Dbg> ", "Usr> "};
@@ -30,7 +32,7 @@ const char* prefixOf(LogLevel level) {
 void writeLine(LogLevel level, const char* text) {
     if (!gLogger || static_cast<int>(level) > gThreshold.load(std::memory_order_relaxed))
         return;
-    const QByteArray line = QByteArray(gPrefixes ? prefixOf(level) : "") + QByteArray(gDepth, '\t') + text;
+    const QByteArray line = QByteArray(gPrefixes ? prefixOf(level) : "") + QByteArray(*tDepth, '\t') + text;
     gLogger->write(line.left(kLineSize - 1));
 }
 
@@ -40,9 +42,14 @@ void guarded(Action&& action) noexcept {
     try {
         const std::lock_guard lock(gMutex);
         action();
-    } catch (...) {
+    } catch (...) { // NOLINT(bugprone-empty-catch): there is nobody to tell
     }
 }
+
+// Ends logging when the module is unloaded, or the program ends; lines after that are dropped.
+struct LastLogger {
+    ~LastLogger() { Log::install(nullptr); }
+} const gLastLogger;
 
 } // namespace
 
@@ -77,10 +84,8 @@ void scopeEntry(LogLevel level, const char* format, ...) {
     va_start(arguments, format);
     std::vsnprintf(text + 3, sizeof text - 3, format, arguments);
     va_end(arguments);
-    guarded([&] {
-        writeLine(level, text);
-        ++gDepth;
-    });
+    guarded([&] { writeLine(level, text); });
+    guarded([] { ++*tDepth; });
 }
 
 void scopeExit(LogLevel level, const char* format, ...) {
@@ -90,8 +95,8 @@ void scopeExit(LogLevel level, const char* format, ...) {
     std::vsnprintf(text + 3, sizeof text - 3, format, arguments);
     va_end(arguments);
     guarded([&] {
-        if (gDepth > 0)
-            --gDepth;
+        if (*tDepth > 0)
+            --*tDepth;
         writeLine(level, text);
     });
 }
@@ -108,13 +113,14 @@ void install(std::unique_ptr<ILogger> logger) {
     guarded([&] {
         gInstalled = logger != nullptr;
         gDepth = 0;
-        gLogger = std::move(logger);
+        *tDepth = 0;
+        const std::unique_ptr<ILogger> before(std::exchange(gLogger, logger.release()));
     });
 }
 
 const ILogger* current() {
     const std::lock_guard lock(gMutex);
-    return gLogger.get();
+    return gLogger;
 }
 
 bool writes(LogLevel level) {
@@ -126,6 +132,18 @@ bool writes(LogLevel level) {
 
 unsigned logAddress(const void* object) {
     return static_cast<unsigned>(reinterpret_cast<std::uintptr_t>(object));
+}
+
+LogDepth::LogDepth() : mOwn(*tDepth), mBefore(std::exchange(tDepth, &mOwn)) {}
+
+LogDepth::LogDepth(Binding binding) : mBefore(std::exchange(tDepth, binding)) {}
+
+LogDepth::~LogDepth() {
+    tDepth = mBefore;
+}
+
+LogDepth::Binding LogDepth::current() {
+    return tDepth;
 }
 
 } // namespace orvela

@@ -67,6 +67,29 @@ bool writes(LogLevel level);
 
 } // namespace Log
 
+/// While it lives, the lines of its thread are indented by a depth of their own, so that runs on several
+/// threads do not indent each other's. Elsewhere one depth holds for the whole process.
+class LogDepth {
+public:
+    /// Which depth a thread uses.
+    using Binding = int*;
+
+    /// A depth of its own, which starts at the thread's present one.
+    LogDepth();
+    /// The depth that another thread uses.
+    explicit LogDepth(Binding binding);
+    ~LogDepth();
+    LogDepth(const LogDepth&) = delete;
+    LogDepth& operator=(const LogDepth&) = delete;
+
+    /// The calling thread's, to be handed to a thread that works for it.
+    static Binding current();
+
+private:
+    int mOwn = 0;
+    Binding mBefore;
+};
+
 /// The low 32 bits of an address, as log lines show it.
 unsigned logAddress(const void* object);
 

@@ -1,5 +1,7 @@
 #include "Utility/RowScheduler.h"
 
+#include "Utility/Logger.h"
+
 #include <tbb/blocked_range.h>
 #include <tbb/global_control.h>
 #include <tbb/info.h>
@@ -7,12 +9,8 @@
 #include <tbb/partitioner.h>
 #include <tbb/task_arena.h>
 
-#include <atomic>
-
 #if defined(__SANITIZE_THREAD__)
 #include <sanitizer/tsan_interface.h>
-
-using namespace orvela;
 #endif
 
 namespace orvela {
@@ -24,8 +22,6 @@ struct RowScheduler::Impl {
 };
 
 namespace {
-
-std::atomic<RowScheduler::Impl*> gScheduler = nullptr;
 
 // The thread sanitizer does not see the ordering that the uninstrumented TBB library guarantees between the
 // caller of a pass and its bodies; these calls state exactly that guarantee.
@@ -44,19 +40,23 @@ void takeOver(const void*) {}
 } // namespace
 
 RowScheduler::RowScheduler(int threads) : mImpl(std::make_unique<Impl>()) {
-    if (threads >= 1) {
+    // The library keeps to one thread per processor otherwise. The limit holds for the whole process, so a
+    // scheduler with fewer threads must not set it.
+    if (threads > defaultThreads()) {
         mImpl->limit = std::make_unique<tbb::global_control>(tbb::global_control::max_allowed_parallelism,
                                                              static_cast<std::size_t>(threads));
     }
     mImpl->arena.initialize(threads >= 1 ? threads : int(tbb::task_arena::automatic));
-    gScheduler = mImpl.get();
 }
 
 RowScheduler::~RowScheduler() {
-    gScheduler = nullptr;
     mImpl->arena.terminate();
     mImpl->limit.reset();
     tbb::finalize(mImpl->handle, std::nothrow);
+}
+
+void RowScheduler::execute(const std::function<void()>& action) {
+    mImpl->arena.execute(action);
 }
 
 int RowScheduler::defaultThreads() {
@@ -67,22 +67,18 @@ void forEachRange(unsigned begin, unsigned end, unsigned grain,
                   const std::function<void(unsigned, unsigned)>& body) {
     if (end <= begin)
         return;
-    const auto pass = [&] {
-        handOver(&body);
-        tbb::parallel_for(
-            tbb::blocked_range<unsigned>(begin, end, grain),
-            [&](const tbb::blocked_range<unsigned>& piece) {
-                takeOver(&body);
-                body(piece.begin(), piece.end());
-                handOver(&body);
-            },
-            tbb::simple_partitioner());
-        takeOver(&body);
-    };
-    if (RowScheduler::Impl* scheduler = gScheduler)
-        scheduler->arena.execute(pass);
-    else
-        pass();
+    const LogDepth::Binding caller = LogDepth::current();
+    handOver(&body);
+    tbb::parallel_for(
+        tbb::blocked_range<unsigned>(begin, end, grain),
+        [&](const tbb::blocked_range<unsigned>& piece) {
+            takeOver(&body);
+            const LogDepth depth(caller);
+            body(piece.begin(), piece.end());
+            handOver(&body);
+        },
+        tbb::simple_partitioner());
+    takeOver(&body);
 }
 
 } // namespace orvela

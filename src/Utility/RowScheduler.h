@@ -6,8 +6,8 @@
 /// The engine's one door to parallelism.
 namespace orvela {
 
-/// Holds the number of threads that the passes below use while it lives; one at a time. Without one they use
-/// the machine's default.
+/// A number of threads for the passes that run inside execute(). Several can be used side by side, each by a
+/// thread of its own; passes outside of any use the machine's default.
 class RowScheduler {
 public:
     /// @param threads  number of threads, or below 1 for the automatic choice (one per processor)
@@ -17,12 +17,14 @@ public:
     RowScheduler(const RowScheduler&) = delete;
     RowScheduler& operator=(const RowScheduler&) = delete;
 
+    /// Calls `action` on the calling thread; the passes in it use this scheduler's threads.
+    void execute(const std::function<void()>& action);
+
     /// The automatic number of threads on this machine.
     static int defaultThreads();
 
-    struct Impl;
-
 private:
+    struct Impl;
     std::unique_ptr<Impl> mImpl;
 };
 

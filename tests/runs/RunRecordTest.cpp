@@ -57,7 +57,7 @@ std::string runLine(const std::string& photograph, const CARGBPlane& original, c
     std::string tasks;
     std::string before = checksum(in);
     core.setObserver([&](const TaskReport& report) {
-        if (report.kind != TaskKind::Filter || !report.applied)
+        if (report.kind != TaskKind::Filter || report.outcome != TaskOutcome::Applied)
             return;
         const std::string after = checksum(in);
         if (after != before)

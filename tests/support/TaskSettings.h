@@ -79,7 +79,7 @@ inline CUserParamsPhotoshop paramsFor(const std::string& task, float position = 
 inline bool run(const std::string& name, CUserParams& params, CARGBPlane& in, CARGBPlane& out) {
     for (const PipelineTask& task : PipelineTable::allTasks()) {
         if (task.name == name)
-            return task.make(&params, &in, &out)->Apply();
+            return task.make({}, &params, &in, &out)->Apply();
     }
     throw std::invalid_argument("no task named " + name);
 }
@@ -103,7 +103,7 @@ inline void measure(CUserParams& params, CARGBPlane& in, CARGBPlane& out) {
         run(name, params, in, out);
     for (const PipelineTask& task : PipelineTable::allTasks()) {
         if (task.kind == TaskKind::Analyzer)
-            task.make(&params, &in, &out)->Apply();
+            task.make({}, &params, &in, &out)->Apply();
     }
 }
 

@@ -50,9 +50,8 @@ MoveTables::MoveTables(const Levels& levels, const std::function<float(double lu
     }
 }
 
-void MoveTables::applyRow(const ConstRow& in, const Row& out, int width) const {
-    SumValueTable::mapRow({&mTables[mOfChannel[0]], &mTables[mOfChannel[1]], &mTables[mOfChannel[2]]}, in,
-                          out, width);
+void MoveTables::apply(const PixelRow& row) const {
+    SumValueTable::map({&mTables[mOfChannel[0]], &mTables[mOfChannel[1]], &mTables[mOfChannel[2]]}, row);
 }
 
 float sliderToGamma(float position) {

@@ -70,7 +70,7 @@ public:
     /// @param move    darken or brighten
     MoveTables(const Levels& levels, const std::function<float(double luma)>& weight, Move move);
 
-    void applyRow(const ConstRow& in, const Row& out, int width) const;
+    void apply(const PixelRow& row) const;
 
 private:
     std::array<SumValueTable, 3> mTables;       ///< built for each different level

@@ -54,7 +54,7 @@ void scanLuma(const Histogram& luma, double threshold, Limits& limits) {
 
 } // namespace
 
-bool readLumaLimits(CUserParams& params, Limits& limits, double threshold, double hazyThreshold) {
+bool storeHaze(CUserParams& params, Limits& limits, double threshold, double hazyThreshold) {
     scanLuma(params.pHisto_Luma, threshold, limits);
     params.m_Opaco = limits.isHazy();
     if (!params.m_Opaco)

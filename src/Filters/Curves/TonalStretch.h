@@ -39,7 +39,7 @@ std::array<const Histogram*, 3> channelHistograms(const CUserParams& params);
 /// @param threshold      of the first scans
 /// @param hazyThreshold  of the scans of a hazy picture; one that finds nothing keeps the first result
 /// @return whether the picture is hazy
-bool readLumaLimits(CUserParams& params, Limits& limits, double threshold, double hazyThreshold);
+bool storeHaze(CUserParams& params, Limits& limits, double threshold, double hazyThreshold);
 
 /// Linear stretch of a hazy picture in integers, black to 0 and white to 255, clamped. With equal limits the
 /// value is left alone.

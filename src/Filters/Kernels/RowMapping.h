@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/Kernels/PixelMath.h"
-#include "Utility/CARGBPlane.h"
+#include "Filters/Kernels/PixelRow.h"
 
 #include <algorithm>
 #include <array>
@@ -11,7 +11,7 @@
 namespace orvela {
 
 // How filters map the samples of a row: by a function of the pixel, or by curves of one channel value that
-// are worked out for all 256 values beforehand. The rows that a mapping reads and writes may be the same.
+// are worked out for all 256 values beforehand.
 
 /// What a curve makes of each channel value.
 using ChannelTable = std::array<std::uint8_t, 256>;
@@ -32,36 +32,41 @@ Table makeTable(Curve curve) {
     return table;
 }
 
-/// Maps the channels of a row of `width` pixels, each by its own table.
-inline void mapRow(const std::array<const ChannelTable*, 3>& tables, const ConstRow& in, const Row& out,
-                   int width) {
+/// Copies the row.
+inline void copyPixels(const PixelRow& row) {
+    for (std::size_t c = 0; c < 3; ++c)
+        std::copy_n(row.in[c], row.width, row.out[c]);
+}
+
+/// Maps the channels of a row, each by its own table.
+inline void mapChannels(const std::array<const ChannelTable*, 3>& tables, const PixelRow& row) {
     for (std::size_t c = 0; c < 3; ++c) {
         const auto lookUp = [&table = *tables[c]](std::uint8_t value) { return table[value]; };
-        std::transform(in[c], in[c] + width, out[c], lookUp);
+        std::transform(row.in[c], row.in[c] + row.width, row.out[c], lookUp);
     }
 }
 
 /// Maps the three channels of a row by one table.
-inline void mapRow(const ChannelTable& table, const ConstRow& in, const Row& out, int width) {
-    mapRow({&table, &table, &table}, in, out, width);
+inline void mapChannels(const ChannelTable& table, const PixelRow& row) {
+    mapChannels({&table, &table, &table}, row);
 }
 
 /// Maps the pixels of a row.
 /// @param map  red, green and blue to PixelMath::Rgb, whose values fit into samples
 template <typename Map>
-void mapPixels(const ConstRow& in, const Row& out, int width, Map map) {
-    for (int x = 0; x < width; ++x) {
-        const PixelMath::Rgb c = map(in[0][x], in[1][x], in[2][x]);
-        out[0][x] = static_cast<std::uint8_t>(c.r);
-        out[1][x] = static_cast<std::uint8_t>(c.g);
-        out[2][x] = static_cast<std::uint8_t>(c.b);
+void mapPixels(const PixelRow& row, Map map) {
+    for (int x = 0; x < row.width; ++x) {
+        const PixelMath::Rgb c = map(row.in[0][x], row.in[1][x], row.in[2][x]);
+        row.out[0][x] = static_cast<std::uint8_t>(c.r);
+        row.out[1][x] = static_cast<std::uint8_t>(c.g);
+        row.out[2][x] = static_cast<std::uint8_t>(c.b);
     }
 }
 
 /// Maps the channels of a row, each by its own table; a pixel that exceeds 255 is scaled down as a whole
 /// (PixelMath::keepHue).
-inline void mapKeepingHue(const WideTables& tables, const ConstRow& in, const Row& out, int width) {
-    mapPixels(in, out, width, [&](std::uint8_t r, std::uint8_t g, std::uint8_t b) {
+inline void mapKeepingHue(const WideTables& tables, const PixelRow& row) {
+    mapPixels(row, [&](std::uint8_t r, std::uint8_t g, std::uint8_t b) {
         return PixelMath::keepHue({tables[0][r], tables[1][g], tables[2][b]});
     });
 }

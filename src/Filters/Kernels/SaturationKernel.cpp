@@ -1,5 +1,6 @@
 #include "Filters/Kernels/SaturationKernel.h"
 
+#include "Filters/Kernels/RowMapping.h"
 #include "Filters/Kernels/Simd.h"
 
 #include <algorithm>
@@ -128,25 +129,20 @@ SaturationKernel::SaturationKernel(Change change, float alfa) : mSaturations(256
     }
 }
 
-void SaturationKernel::applyRow(const ConstRow& in, const Row& out, int width) const {
+void SaturationKernel::applyRow(const PixelRow& row) const {
     Tile tile;
-    for (int first = 0; first < width; first += kTileWidth) {
-        const int count = std::min(kTileWidth, width - first);
-        loadTile(in, first, count, tile);
+    for (int first = 0; first < row.width; first += kTileWidth) {
+        const int count = std::min(kTileWidth, row.width - first);
+        loadTile(row.in, first, count, tile);
         for (int i = 0; i < count; ++i)
             tile.saturation[i] = mSaturations[static_cast<std::size_t>(tile.place[i])];
         convertTile(tile, count);
-        storeTile(tile, out, first, count);
+        storeTile(tile, row.out, first, count);
     }
 }
 
-void SaturationKernel::applyRowPlain(const ConstRow& in, const Row& out, int width) const {
-    for (int x = 0; x < width; ++x) {
-        const PixelMath::Rgb c = resaturate(in[0][x], in[1][x], in[2][x]);
-        out[0][x] = static_cast<std::uint8_t>(c.r);
-        out[1][x] = static_cast<std::uint8_t>(c.g);
-        out[2][x] = static_cast<std::uint8_t>(c.b);
-    }
+void SaturationKernel::applyRowPlain(const PixelRow& row) const {
+    mapPixels(row, [this](int r, int g, int b) { return resaturate(r, g, b); });
 }
 
 PixelMath::Rgb SaturationKernel::resaturate(int r, int g, int b) const {

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Filters/Kernels/PixelMath.h"
-#include "Utility/CARGBPlane.h"
+#include "Filters/Kernels/PixelRow.h"
 
 #include <vector>
 
@@ -21,10 +21,10 @@ public:
     SaturationKernel(Change change, float alfa);
 
     /// Maps a row of `width` pixels.
-    void applyRow(const ConstRow& in, const Row& out, int width) const;
+    void applyRow(const PixelRow& row) const;
 
     /// The plain form of applyRow, pixel by pixel. Same results.
-    void applyRowPlain(const ConstRow& in, const Row& out, int width) const;
+    void applyRowPlain(const PixelRow& row) const;
 
 private:
     PixelMath::Rgb resaturate(int r, int g, int b) const;

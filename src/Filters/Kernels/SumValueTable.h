@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Utility/CARGBPlane.h"
+#include "Filters/Kernels/PixelRow.h"
 
 #include <algorithm>
 #include <array>
@@ -31,24 +31,21 @@ public:
     }
 
     /// Maps the three channels of a row.
-    void mapRow(const ConstRow& in, const Row& out, int width) const {
-        mapRow({this, this, this}, in, out, width);
-    }
+    void map(const PixelRow& row) const { map({this, this, this}, row); }
 
     /// Maps the channels of a row, each by its own table.
-    static void mapRow(const std::array<const SumValueTable*, 3>& tables, const ConstRow& in, const Row& out,
-                       int width) {
+    static void map(const std::array<const SumValueTable*, 3>& tables, const PixelRow& row) {
         const std::uint8_t* const red = tables[0]->mValues.data();
         const std::uint8_t* const green = tables[1]->mValues.data();
         const std::uint8_t* const blue = tables[2]->mValues.data();
-        for (int x = 0; x < width; ++x) {
-            const int r = in[0][x];
-            const int g = in[1][x];
-            const int b = in[2][x];
+        for (int x = 0; x < row.width; ++x) {
+            const int r = row.in[0][x];
+            const int g = row.in[1][x];
+            const int b = row.in[2][x];
             const int line = (r + g + b) * 256;
-            out[0][x] = red[line + r];
-            out[1][x] = green[line + g];
-            out[2][x] = blue[line + b];
+            row.out[0][x] = red[line + r];
+            row.out[1][x] = green[line + g];
+            row.out[2][x] = blue[line + b];
         }
     }
 

@@ -128,8 +128,9 @@ TEST(CThreadedCore, FailureIsAnnouncedAndForgotten) {
 }
 
 TEST(CThreadedCore, ProgressComesOnTheRunsThreadAndItsHandlersCanStop) {
-    const orvela::RowScheduler scheduler(2);
+    RowScheduler scheduler(2);
     Session<> session(testplanes::noise(900, 2400), Mode_LandscapePro);
+    session.core.setContext({.scheduler = &scheduler});
     int onOtherThread = 0;
     QObject::connect(&session.core, &CThreadedCore::percentDone, &session.core, [&](int percent) {
         onOtherThread += QThread::currentThread() != session.core.thread();
@@ -137,7 +138,8 @@ TEST(CThreadedCore, ProgressComesOnTheRunsThreadAndItsHandlersCanStop) {
             session.core.stop();
     });
     int applied = 0;
-    session.core.setObserver([&](const TaskReport& report) { applied += report.applied; });
+    session.core.setObserver(
+        [&](const TaskReport& report) { applied += report.outcome == TaskOutcome::Applied; });
     session.core.run();
     EXPECT_EQ(onOtherThread, 0);
     EXPECT_TRUE(session.core.params().mCancelRequested) << "a percentage arrived while rows were worked on";

@@ -29,6 +29,7 @@ Pixel balanced(Pixel pixel, std::array<float, 3> before, std::array<float, 3> af
 } // namespace
 
 TEST(CAuto_Contrast_I, FollowsTheIterations) {
+    const CARGBPlaneProxyDirect host(*uniform(1, 1, {0, 0, 0}));
     const auto runs = [](bool P::*flag, std::initializer_list<bool U::*> changed) {
         U params = with({flag});
         for (bool U::*each : changed)

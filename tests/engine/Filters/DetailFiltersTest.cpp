@@ -82,7 +82,7 @@ TEST(CBilinear, MissingMemoryIsReportedAndEndsTheFilter) {
     const auto plane = testplanes::noise(5, 5);
     for (const std::string table : {"4 floats array (m_cBilinear)", "195076 floats array (m_sBilinear)"}) {
         const LogCapture log;
-        StarvedBilinear filter(&params, plane.get(), plane.get());
+        StarvedBilinear filter({}, &params, plane.get(), plane.get());
         filter.largest = table[0] == '4' ? 3 : 195075;
         EXPECT_FALSE(filter.Apply());
         EXPECT_TRUE(log.has("Bilinear filter was unable to declare the " + table + "."));

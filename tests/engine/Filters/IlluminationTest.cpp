@@ -19,7 +19,7 @@ using testplanes::Pixel;
 template <typename Filter>
 bool apply(CUserParams& params, CARGBPlane& plane) {
     CARGBPlane out(plane, QStringLiteral("out"));
-    return Filter(&params, &plane, &out).Apply();
+    return Filter({}, &params, &plane, &out).Apply();
 }
 
 // Only an iteration, by the name of its slider, is on.

@@ -117,10 +117,12 @@ TEST(KernelForms, Saturation) {
                                            {Change::Raise, 1.2F}}) {
             SCOPED_TRACE(alfa);
             const SaturationKernel kernel(change, alfa);
-            const auto from = [&in](int y) { return std::as_const(*in).row(y); };
+            const auto row = [&in](CARGBPlane& out, int y) {
+                return PixelRow{y, in->width(), std::as_const(*in).row(y), out.row(y)};
+            };
             formsChange(
-                *in, [&](CARGBPlane& out, int y) { kernel.applyRow(from(y), out.row(y), in->width()); },
-                [&](CARGBPlane& out, int y) { kernel.applyRowPlain(from(y), out.row(y), in->width()); });
+                *in, [&](CARGBPlane& out, int y) { kernel.applyRow(row(out, y)); },
+                [&](CARGBPlane& out, int y) { kernel.applyRowPlain(row(out, y)); });
         }
     }
 }

@@ -68,8 +68,8 @@ TEST(LevelFilters, MapPixelsAsWorkedOutIndependently) {
         EXPECT_EQ(tasksettings::run(each.filter, params, *in, out), applies);
         const std::string after = applies ? each.expected : before;
         const bool leavesLastRow = std::string(each.filter) == "CLevel_Dark_Left_Perceptual";
-        EXPECT_EQ(row(out, 0), after);
-        EXPECT_EQ(row(out, 1), leavesLastRow ? before : after);
+        EXPECT_EQ(row(*in, 0), after);
+        EXPECT_EQ(row(*in, 1), leavesLastRow ? before : after);
     }
 }
 
@@ -81,7 +81,7 @@ TEST(LevelFilters, TablesEqualThePlainOperations) {
         const LevelMath::MoveTables tables(levels, weight, move);
         const auto out = testplanes::make(400, 1, [](int, int) { return Pixel{}; });
         for (int y = 0; y < 50; ++y) {
-            tables.applyRow(std::as_const(*in).row(y), out->row(0), 400);
+            tables.apply({y, 400, std::as_const(*in).row(y), out->row(0)});
             for (int x = 0; x < 400; ++x) {
                 const Pixel p = at(*in, x, y);
                 const float k = weight((p[0] + p[1] + p[2]) / 3.0);
@@ -95,7 +95,7 @@ TEST(LevelFilters, TablesEqualThePlainOperations) {
 TEST(LevelFilters, OverflowingMidtonesKeepTheHue) {
     const WideTables maps = LevelMath::factorMaps(300 / 255.0F, {1, 1, 1});
     const auto in = testplanes::uniform(1, 1, {255, 255, 200}); // 300, 300, 235
-    mapKeepingHue(maps, std::as_const(*in).row(0), in->row(0), 1);
+    mapKeepingHue(maps, {0, 1, std::as_const(*in).row(0), in->row(0)});
     EXPECT_EQ(at(*in, 0, 0), (Pixel{254, 254, 198})); // 235 * 254 / 300 = 198.97
 }
 

@@ -35,7 +35,7 @@ inline U with(std::initializer_list<bool P::*> flags) {
 template <typename Filter>
 bool apply(U& params, CARGBPlane& plane) {
     CARGBPlane out(plane, QStringLiteral("out"));
-    return Filter(&params, &plane, &out).Apply();
+    return Filter({}, &params, &plane, &out).Apply();
 }
 
 /// A picture, a setting and the bytes they lead to, worked out by data/automatic_contrast.py.

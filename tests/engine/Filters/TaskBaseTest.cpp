@@ -7,15 +7,16 @@
 #include "support/TestPlanes.h"
 
 #include <QDir>
-#include <QSettings>
 #include <QStringList>
 #include <QTemporaryDir>
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <functional>
 #include <mutex>
 #include <set>
+#include <stdexcept>
 
 using namespace orvela;
 
@@ -26,11 +27,11 @@ using testing::ElementsAre;
 // A filter whose phases do as told and that writes 200 to every sample of its rows.
 class ScriptedFilter final : public IFilter {
 public:
-    ScriptedFilter(CUserParams* params, CARGBPlane* in, CARGBPlane* out) : IFilter(params, in, out) {
-        mName = "Scripted";
-    }
+    ScriptedFilter(CUserParams* params, CARGBPlane* in, CARGBPlane* out, const RunContext& context = {})
+        : IFilter(context, params, in, out) {}
 
     using IFilter::GetRGBFromHost;
+    using IFilter::useHostPicture;
 
     bool pre = true;
     bool post = true;
@@ -42,17 +43,23 @@ public:
     std::vector<std::string> phases;
 
 protected:
-    bool PreApply() override {
+    const TaskDescription& description() const override {
+        static constexpr TaskDescription kDescription = {
+            .source = "Filters/Scripted", .line = 7, .dumpName = "Scripted", .writes = Writes::SomePixels};
+        return kDescription;
+    }
+    bool applies() override {
         phases.emplace_back("pre");
+        return pre;
+    }
+    void prepare() override {
         if (end != 0) {
             mVertStart = start;
             mVertEnd = end;
             mVertStep = step;
         }
-        return pre;
     }
     void ApplyRow(std::uint32_t row) override {
-        beginRow(row, "Filters/Scripted", 7);
         const Row out = mOutPlane->row(static_cast<int>(row));
         for (std::uint8_t* channel : out)
             std::fill_n(channel, mOutPlane->width(), std::uint8_t{200});
@@ -61,7 +68,7 @@ protected:
             rows.insert(row);
         }
         if (static_cast<int>(row) == throwAtRow)
-            throw 5;
+            throw std::runtime_error("row 3 is broken");
     }
     bool PostApply() override {
         phases.emplace_back("post");
@@ -75,6 +82,25 @@ protected:
 private:
     std::mutex mMutex;
 };
+
+// A broken promise ends builds with assertions; elsewhere it is an exception.
+void expectBroken(const std::function<void()>& action, const std::string& where, const std::string& what,
+                  const std::string& file, int line) {
+#if defined(QT_NO_DEBUG) && !defined(QT_FORCE_ASSERTS)
+    static_cast<void>(where);
+    try {
+        action();
+        ADD_FAILURE() << "nothing was thrown";
+    } catch (const CGenericEx& failure) {
+        EXPECT_EQ(failure.message().toStdString(), what);
+        EXPECT_EQ(failure.sourceFile().toStdString() + std::to_string(failure.line()),
+                  file + std::to_string(line));
+    }
+    ExceptionStack::clear();
+#else
+    EXPECT_DEATH(action(), where + ": \"" + what + "\", file " + file + ", line " + std::to_string(line));
+#endif
+}
 
 struct TaskTest : testing::Test {
     CUserParams params;
@@ -98,6 +124,7 @@ TEST_F(TaskTest, QuietStopsSkipTheLaterPhases) {
     filter.pre = false;
     EXPECT_FALSE(filter.Apply());
     EXPECT_TRUE(filter.rows.empty());
+    EXPECT_EQ(filter.outcome(), TaskOutcome::Skipped);
     EXPECT_TRUE(log.has("<- Task canceled in PreApply."));
     ScriptedFilter late(&params, in.get(), out.get());
     late.post = false;
@@ -130,14 +157,46 @@ TEST_F(TaskTest, RowRangesOfStartEndAndStep) {
     }
 }
 
+TEST_F(TaskTest, RowsThatAreNotVisitedComeFromTheInput) {
+    for (const auto& [start, end, step] : {std::tuple{2U, 5U, 1U}, {0U, 6U, 2U}, {3U, 2U, 1U}}) {
+        const auto plane = testplanes::uniform(4, 7, {10, 20, 30});
+        const auto garbage = testplanes::noise(4, 7);
+        ScriptedFilter some(&params, plane.get(), garbage.get());
+        some.start = start;
+        some.end = end;
+        some.step = step;
+        EXPECT_TRUE(some.Apply());
+        for (std::uint32_t y = 0; y < 7; ++y) {
+            const testplanes::Pixel expected =
+                some.rows.count(y) ? testplanes::Pixel{200, 200, 200} : testplanes::Pixel{10, 20, 30};
+            EXPECT_EQ(testplanes::at(*plane, 3, static_cast<int>(y)), expected) << y;
+        }
+    }
+}
+
+TEST_F(TaskTest, AStepOfNoRowsIsABrokenPromise) {
+    filter.end = 5;
+    filter.step = 0;
+#if defined(QT_NO_DEBUG) && !defined(QT_FORCE_ASSERTS)
+    EXPECT_FALSE(filter.Apply());
+    EXPECT_EQ(filter.failure().cause, "mVertStep");
+    ExceptionStack::clear();
+#else
+    EXPECT_DEATH(filter.Apply(),
+                 "TaskBase::DoApplyParallel\\(\\): \"mVertStep\", file Filters/TaskBase, line 100");
+#endif
+}
+
 TEST_F(TaskTest, FailuresOnWorkersEndThePassAndLeaveBothPlanesAsTheyWere) {
     for (const int threads : {1, 2, 7}) {
-        const orvela::RowScheduler scheduler(threads);
+        RowScheduler scheduler(threads);
         LogCapture log;
         ScriptedFilter failing(&params, in.get(), out.get());
         failing.throwAtRow = 3;
-        EXPECT_FALSE(failing.Apply());
+        scheduler.execute([&] { EXPECT_FALSE(failing.Apply()); });
         EXPECT_THAT(failing.phases, ElementsAre("pre"));
+        EXPECT_EQ(failing.outcome(), TaskOutcome::Failed);
+        EXPECT_EQ(failing.failure().cause, "row 3 is broken");
         EXPECT_TRUE(log.has("<- Unable to complete filter block."));
         EXPECT_EQ(testplanes::bytes(*in), testplanes::bytes(*testplanes::uniform(4, 7, {10, 20, 30})));
         EXPECT_EQ(testplanes::bytes(*out), testplanes::bytes(*in));
@@ -147,9 +206,10 @@ TEST_F(TaskTest, FailuresOnWorkersEndThePassAndLeaveBothPlanesAsTheyWere) {
 TEST_F(TaskTest, StopRequestEndsThePassBeforeAnyLaterRow) {
     ExceptionStack::clear();
     params.mProgressCallback = [this](int) { params.mCancelRequested = true; };
-    const orvela::RowScheduler scheduler(1);
-    EXPECT_FALSE(filter.Apply());
+    RowScheduler scheduler(1);
+    scheduler.execute([&] { EXPECT_FALSE(filter.Apply()); });
     EXPECT_EQ(filter.rows.size(), 1U);
+    EXPECT_EQ(filter.outcome(), TaskOutcome::Cancelled);
     EXPECT_TRUE(ExceptionStack::entries()[0].startsWith("Filters/Scripted:7 CGenericEx User canceled."));
     EXPECT_EQ(testplanes::at(*out, 0, 0), (testplanes::Pixel{10, 20, 30}));
     ExceptionStack::clear();
@@ -158,8 +218,8 @@ TEST_F(TaskTest, StopRequestEndsThePassBeforeAnyLaterRow) {
 TEST_F(TaskTest, RowsReportTheirPercentage) {
     std::set<int> percents;
     params.mProgressCallback = [&percents](int percent) { percents.insert(percent); };
-    const orvela::RowScheduler scheduler(1);
-    EXPECT_TRUE(filter.Apply());
+    RowScheduler scheduler(1);
+    scheduler.execute([&] { EXPECT_TRUE(filter.Apply()); });
     // 100 / 7 = 14.2857 in single precision, times 1 to 7.
     EXPECT_THAT(percents, ElementsAre(14, 28, 42, 57, 71, 85, 100));
 }
@@ -167,10 +227,9 @@ TEST_F(TaskTest, RowsReportTheirPercentage) {
 TEST_F(TaskTest, DumpsAreNumberedInTheirOrder) {
     const QTemporaryDir folder;
     qputenv("TEMP", folder.path().toLocal8Bit());
-    QSettings().setValue("2000/GUI/dumpImageAfterFile", 1);
+    EXPECT_TRUE(ScriptedFilter(&params, in.get(), out.get(), {.dumpsPictures = true}).Apply());
     EXPECT_TRUE(filter.Apply());
-    EXPECT_TRUE(ScriptedFilter(&params, in.get(), out.get()).Apply());
-    QSettings().remove("2000/GUI/dumpImageAfterFile");
+    EXPECT_TRUE(ScriptedFilter(&params, in.get(), out.get(), {.dumpsPictures = true}).Apply());
     qunsetenv("TEMP");
     const QStringList files = QDir(folder.path()).entryList(QDir::Files, QDir::Name);
     EXPECT_EQ(files, QStringList({"image_after_Scripted_0_4x7.raw", "image_after_Scripted_1_4x7.raw"}));
@@ -189,13 +248,17 @@ TEST_F(TaskTest, HostPixelsNeedTheDirectProxyAndComeFromItsCopy) {
     std::uint32_t r = 0;
     std::uint32_t g = 0;
     std::uint32_t b = 0;
-    EXPECT_DEATH(ScriptedFilter::GetRGBFromHost(0, 0, r, g, b),
-                 "IFilter::GetRGBFromHost: \"This version of GetRGBFromHost requires direct proxy.\", file "
-                 "Filters/IFilter, line 89");
-    CARGBPlaneProxyDirect proxy(*testplanes::noise(4, 7));
-    ScriptedFilter::GetRGBFromHost(3, 5, r, g, b);
-    const testplanes::Pixel expected = testplanes::at(*testplanes::noise(4, 7), 3, 5);
-    EXPECT_THAT((std::array{r, g, b}), ElementsAre(expected[0], expected[1], expected[2]));
+    expectBroken([this] { filter.useHostPicture(); }, "IFilter::GetRGBFromHost",
+                 "This version of GetRGBFromHost requires direct proxy.", "Filters/IFilter", 89);
+    const CARGBPlaneProxyDirect own(*testplanes::noise(4, 7));
+    CARGBPlaneProxyDirect proxy(*testplanes::noise(4, 7, 2)); // the process-wide one
+    ScriptedFilter withOwn(&params, in.get(), out.get(), {.proxy = &own});
+    for (const auto& [each, seed] : {std::pair{&filter, 2U}, {&withOwn, 1U}}) {
+        each->useHostPicture();
+        each->GetRGBFromHost(3, 5, r, g, b);
+        const testplanes::Pixel expected = testplanes::at(*testplanes::noise(4, 7, seed), 3, 5);
+        EXPECT_THAT((std::array{r, g, b}), ElementsAre(expected[0], expected[1], expected[2]));
+    }
     EXPECT_DEATH(proxy.getPixels(0, 0, 1, 1, nullptr, 0),
                  "\"Do not use this method for CARGBPlaneProxyDirect!\"");
 }
@@ -212,7 +275,7 @@ protected:
 TEST_F(TaskTest, AnalyzerFailuresReachTheCaller) {
     const auto messageOf = [](CUserParams* p, CARGBPlane* plane) {
         try {
-            FailingAnalyzer(p, plane).Apply();
+            FailingAnalyzer({}, p, plane).Apply();
         } catch (const CGenericEx& failure) {
             return failure.message().toStdString() + "@" + std::to_string(failure.line());
         }
@@ -227,7 +290,7 @@ TEST_F(TaskTest, AnalyzerFailuresReachTheCaller) {
 TEST(RowScheduler, PiecesHalveDownToTheGrainAndCoverTheRange) {
     std::mutex mutex;
     std::set<std::pair<unsigned, unsigned>> pieces;
-    orvela::forEachRange(0, 202, 200, [&](unsigned begin, unsigned end) {
+    forEachRange(0, 202, 200, [&](unsigned begin, unsigned end) {
         const std::lock_guard lock(mutex);
         pieces.insert({begin, end});
     });

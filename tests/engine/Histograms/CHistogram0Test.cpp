@@ -18,7 +18,7 @@ CUserParams measure(const std::vector<Pixel>& pixels) {
         return x < count ? pixels[static_cast<std::size_t>(x)] : Pixel{7, 7, 7};
     });
     CUserParams params;
-    EXPECT_TRUE(CHistogram0(&params, plane.get()).Apply());
+    EXPECT_TRUE(CHistogram0({}, &params, plane.get()).Apply());
     return params;
 }
 
@@ -40,7 +40,7 @@ float highlightFlag(int red, int green, int blue, std::uint8_t level = 220) {
     CUserParams params;
     params.mSliderParams.DigitalFlashEnabled = true;
     params.m_Histo_Light_Exception = -7;
-    EXPECT_TRUE(Task(&params, plane.get()).Apply());
+    EXPECT_TRUE(Task({}, &params, plane.get()).Apply());
     return params.m_Histo_Light_Exception;
 }
 

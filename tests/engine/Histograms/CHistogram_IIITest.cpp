@@ -16,7 +16,7 @@ CUserParams measure(CARGBPlane& plane, bool bicromic = false) {
     CUserParams params;
     params.mSliderParams.mAuto_Color_Enabled = true;
     params.Bicromic = bicromic;
-    EXPECT_TRUE(Task(&params, &plane).Apply());
+    EXPECT_TRUE(Task({}, &params, &plane).Apply());
     return params;
 }
 
