@@ -6,6 +6,7 @@
 
 #include <deque>
 #include <mutex>
+#include <new>
 
 using namespace orvela;
 
@@ -24,11 +25,30 @@ struct Record {
     }
 };
 
+// A failure may still be raised when static objects are gone: the mutex has no destructor to run, and the
+// records are made anew when that is needed.
 std::mutex gMutex;
+std::deque<Record>* gRecords = nullptr;
 
-std::deque<Record>& records() {
-    static std::deque<Record> stack;
-    return stack;
+// The caller holds gMutex.
+void dropRecords() {
+    delete gRecords;
+    gRecords = nullptr;
+}
+
+struct RecordsGuard {
+    ~RecordsGuard() {
+        const std::lock_guard lock(gMutex);
+        dropRecords();
+    }
+};
+const RecordsGuard gGuard;
+
+void record(Record entry) {
+    const std::lock_guard lock(gMutex);
+    if (gRecords == nullptr)
+        gRecords = new std::deque<Record>;
+    gRecords->push_front(std::move(entry));
 }
 
 QByteArray afterLastBackslash(const char* path) {
@@ -36,12 +56,28 @@ QByteArray afterLastBackslash(const char* path) {
     return text.mid(text.lastIndexOf('\\') + 1);
 }
 
+// Visits the failure and then those nested in it, the innermost last; one that is no std::exception ends the
+// chain.
+template <typename Visit>
+void visitChain(const std::exception& failure, Visit visit) {
+    visit(failure);
+    const auto* nested = dynamic_cast<const std::nested_exception*>(&failure);
+    if (nested == nullptr || nested->nested_ptr() == nullptr)
+        return;
+    try {
+        nested->rethrow_nested();
+    } catch (const std::exception& inner) {
+        visitChain(inner, visit);
+    } catch (...) {
+    }
+}
+
 } // namespace
 
 CGenericEx::CGenericEx(const QString& message, const char* sourceFile, int line, const char* className)
-    : mClassName(className), mMessage(message), mSourceFile(afterLastBackslash(sourceFile)), mLine(line) {
-    const std::lock_guard lock(gMutex);
-    records().push_front({mMessage, mSourceFile, mLine, mClassName});
+    : mClassName(className), mMessage(message), mUtf8(message.toUtf8()),
+      mSourceFile(afterLastBackslash(sourceFile)), mLine(line) {
+    record({mMessage, mSourceFile, mLine, mClassName});
 }
 
 CGenericEx::CGenericEx(const CGenericEx& other) = default;
@@ -54,6 +90,21 @@ CBadPtrEx::CBadPtrEx(const QString& message, const char* sourceFile, int line)
     : CGenericEx(message, sourceFile, line, "CBadPtrEx") {}
 
 namespace orvela {
+
+QString innermostMessage(const std::exception& failure) {
+    QString message;
+    visitChain(failure, [&](const std::exception& each) { message = QString::fromUtf8(each.what()); });
+    return message;
+}
+
+bool isOutOfMemory(const std::exception& failure) {
+    bool found = false;
+    visitChain(failure, [&](const std::exception& each) {
+        found = found || dynamic_cast<const std::bad_alloc*>(&each) != nullptr ||
+                dynamic_cast<const COutOfMemoryEx*>(&each) != nullptr;
+    });
+    return found;
+}
 
 namespace ExceptionStack {
 
@@ -68,19 +119,20 @@ void writeToLog(bool clearAfterwards) {
 
 void clear() {
     const std::lock_guard lock(gMutex);
-    records().clear();
+    dropRecords();
 }
 
 QString oldestMessage() {
     const std::lock_guard lock(gMutex);
-    return records().empty() ? QString() : records().back().message;
+    return gRecords == nullptr ? QString() : gRecords->back().message;
 }
 
 QStringList entries() {
     const std::lock_guard lock(gMutex);
     QStringList texts;
-    for (const Record& record : records())
-        texts << record.text();
+    if (gRecords != nullptr)
+        for (const Record& entry : *gRecords)
+            texts << entry.text();
     return texts;
 }
 
