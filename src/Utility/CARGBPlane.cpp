@@ -8,6 +8,7 @@
 #include <cstdio>
 #include <cstring>
 #include <new>
+#include <utility>
 #include <vector>
 
 using namespace orvela;
@@ -26,18 +27,19 @@ std::int32_t countPixels(std::int32_t width, std::int32_t height) {
     return count;
 }
 
+// To be called while the cause is being handled.
+[[noreturn]] void failCreation(int line) {
+    std::throw_with_nested(CGenericEx(QStringLiteral("Unable to complete plane creation."), kSource, line));
+}
+
 } // namespace
 
 CARGBPlane::CARGBPlane(std::int32_t width, std::int32_t height, const QString& name) : mName(name) {
     Log::log(LogLevel::Debug, "CARGBPlane ctor ptr=0x%x source=%s", logAddress(this), qUtf8Printable(name));
     try {
-        mWidth = width;
-        mHeight = height;
-        mPixelCount = countPixels(width, height);
-        if (mPixelCount != 0)
-            allocate();
+        resize(width, height);
     } catch (...) {
-        throw CGenericEx(QStringLiteral("Unable to complete plane creation."), kSource, __LINE__);
+        failCreation(__LINE__);
     }
 }
 
@@ -47,7 +49,7 @@ CARGBPlane::CARGBPlane(const CARGBPlane& source, const QString& name) : mName(na
     try {
         copyFrom(source);
     } catch (...) {
-        throw CGenericEx(QStringLiteral("Unable to complete plane creation."), kSource, __LINE__);
+        failCreation(__LINE__);
     }
 }
 
@@ -61,7 +63,8 @@ void CARGBPlane::copyFrom(const CARGBPlane& source) {
         try {
             resize(source.mWidth, source.mHeight);
         } catch (...) {
-            throw CBadPtrEx(QStringLiteral("Unable to allocate memory to copy a plane."), kSource, __LINE__);
+            std::throw_with_nested(
+                CBadPtrEx(QStringLiteral("Unable to allocate memory to copy a plane."), kSource, __LINE__));
         }
     }
     const auto count = static_cast<unsigned>(mPixelCount);
@@ -72,6 +75,14 @@ void CARGBPlane::copyFrom(const CARGBPlane& source) {
             std::memcpy(samples(channel) + offset, source.samples(channel) + offset, size);
     });
     mColorMode = source.mColorMode;
+}
+
+void CARGBPlane::swapSamples(CARGBPlane& other) {
+    if (other.mWidth != mWidth || other.mHeight != mHeight)
+        throw CBadPtrEx(QStringLiteral("Only planes of the same size can exchange their samples."), kSource,
+                        __LINE__);
+    mSamples.swap(other.mSamples);
+    std::swap(mColorMode, other.mColorMode);
 }
 
 Row CARGBPlane::row(int y) {
@@ -106,26 +117,27 @@ void CARGBPlane::dumpToRaw(const QByteArray& path) const {
 
 void CARGBPlane::resize(std::int32_t width, std::int32_t height) {
     release();
-    mPixelCount = countPixels(width, height);
+    mWidth = mHeight = mPixelCount = 0; // what a failure leaves behind
+    const std::int32_t count = countPixels(width, height);
+    if (count != 0)
+        allocate(count);
     mWidth = width;
     mHeight = height;
-    if (mPixelCount != 0)
-        allocate();
+    mPixelCount = count;
 }
 
-void CARGBPlane::allocate() {
+void CARGBPlane::allocate(std::int32_t count) {
     try {
-        release();
         for (Samples& channel : mSamples)
-            channel.reset(new (std::nothrow) std::uint8_t[static_cast<std::size_t>(mPixelCount)]);
-        const long long bytes = 3LL * mPixelCount;
+            channel.reset(new (std::nothrow) std::uint8_t[static_cast<std::size_t>(count)]);
+        const long long bytes = 3LL * count;
         Log::log(LogLevel::Error, "CARGBPlane allocated %lld bytes (%lld MB) for this (0x%x) image.", bytes,
                  bytes / 1048576, logAddress(this));
         mAllocated = true;
     } catch (...) {
         release();
-        throw COutOfMemoryEx(QStringLiteral("Unable to allocate Planes Memory (Direct error)."), kSource,
-                             __LINE__);
+        std::throw_with_nested(COutOfMemoryEx(
+            QStringLiteral("Unable to allocate Planes Memory (Direct error)."), kSource, __LINE__));
     }
     if (!mSamples[0] || !mSamples[1] || !mSamples[2]) {
         release();

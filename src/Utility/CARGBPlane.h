@@ -44,8 +44,13 @@ public:
 
     /// Copies samples and colour mode. Takes the source's size, reallocating, only when the pixel counts
     /// differ.
-    /// @throws CBadPtrEx when the memory cannot be had
+    /// @throws CBadPtrEx when the memory cannot be had; the plane is empty then
     void copyFrom(const CARGBPlane& source);
+
+    /// Exchanges samples and colour mode with another plane of the same width and height by exchanging the
+    /// arrays, whatever the size; pointers into them stay valid and belong to the other plane from then on.
+    /// @throws CBadPtrEx when the sizes differ
+    void swapSamples(CARGBPlane& other);
 
     std::int32_t width() const { return mWidth; }
     std::int32_t height() const { return mHeight; }
@@ -78,14 +83,14 @@ public:
 
 protected:
     /// Releases any samples, takes the size and allocates.
-    /// @throws COutOfMemoryEx when the memory cannot be had
+    /// @throws COutOfMemoryEx when the memory cannot be had; the plane is empty then
     void resize(std::int32_t width, std::int32_t height);
 
 private:
     std::size_t index(int x, int y) const {
         return static_cast<std::size_t>(y) * static_cast<std::size_t>(mWidth) + static_cast<std::size_t>(x);
     }
-    void allocate();
+    void allocate(std::int32_t count);
     void release();
 
     using Samples = std::unique_ptr<std::uint8_t[]>;
