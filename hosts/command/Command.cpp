@@ -1,6 +1,7 @@
 #include "command/Command.h"
 
 #include "Settings/PresetFile.h"
+#include "Utility/CGenericEx.h"
 #include "command/EnhanceCommand.h"
 #include "command/ModesCommand.h"
 #include "command/PresetsCommand.h"
@@ -39,24 +40,22 @@ void addPresets(CLI::App& program, Action& action) {
     options->declare(*command, [&action, options](Action chosen) { action = std::move(chosen); });
 }
 
-ExitStatus refuse(const char* text) {
+ExitStatus refuse(ExitStatus status, const std::string& text) {
     std::cerr << "orvela: " << text << std::endl;
-    return ExitStatus::WrongUsage;
+    return status;
 }
 
 ExitStatus perform(const Action& action) {
     try {
         return action();
     } catch (const UsageError& error) {
-        return refuse(error.what());
+        return refuse(ExitStatus::WrongUsage, error.what());
     } catch (const PresetError& error) {
-        return refuse(error.what());
+        return refuse(ExitStatus::WrongUsage, error.what());
     }
 }
 
-} // namespace
-
-int runCommand(int argc, char** argv) {
+int runProgram(int argc, char** argv) {
     StopSignals signals;
     QCoreApplication application(argc, argv);
     QCoreApplication::setOrganizationName(QStringLiteral("Kestrand"));
@@ -77,6 +76,26 @@ int runCommand(int argc, char** argv) {
     }
     const ExitStatus status = perform(action);
     return signals.received() ? kSignalBase + signals.received() : static_cast<int>(status);
+}
+
+// For whatever nothing deeper had a message for.
+ExitStatus fail(const std::exception& failure) {
+    if (isOutOfMemory(failure))
+        return refuse(ExitStatus::OutOfMemory, "not enough memory; close other programs");
+    return refuse(ExitStatus::PhotographFailed, innermostMessage(failure).toStdString());
+}
+
+} // namespace
+
+int runCommand(int argc, char** argv) {
+    try {
+        return runProgram(argc, argv);
+    } catch (const std::exception& failure) {
+        return static_cast<int>(fail(failure));
+    } catch (...) {
+        return static_cast<int>(
+            refuse(ExitStatus::PhotographFailed, "failed for an unknown reason; report this"));
+    }
 }
 
 } // namespace orvela

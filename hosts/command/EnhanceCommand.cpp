@@ -1,5 +1,6 @@
 #include "command/EnhanceCommand.h"
 
+#include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
 #include "Utility/RowScheduler.h"
 #include "command/Enhancement.h"
@@ -11,13 +12,14 @@
 
 #include <algorithm>
 #include <iostream>
-#include <new>
 
 namespace orvela {
 
 namespace fs = std::filesystem;
 
 namespace {
+
+constexpr char kMemoryAdvice[] = "; close other programs or use a smaller photograph";
 
 // The work on all photographs of one command.
 class Batch {
@@ -63,6 +65,7 @@ void Batch::note(const std::string& text) {
 }
 
 ExitStatus Batch::runGuarded(const Job& job) {
+    const std::string name = job.source.string() + ": ";
     try {
         runJob(job);
         return ExitStatus::Done;
@@ -73,12 +76,13 @@ ExitStatus Batch::runGuarded(const Job& job) {
     } catch (const PhotographError& error) {
         return failed(ExitStatus::PhotographFailed, error.what());
     } catch (const EngineFailure& error) {
-        return failed(ExitStatus::TargetTrouble, job.source.string() + ": " + error.what() +
-                                                     "; close other programs or use a smaller photograph");
-    } catch (const std::bad_alloc&) {
-        return failed(ExitStatus::TargetTrouble,
-                      job.source.string() + ": not enough memory; close other programs or use a smaller "
-                                            "photograph");
+        return failed(ExitStatus::OutOfMemory, name + error.what() + kMemoryAdvice);
+    } catch (const std::exception& error) {
+        if (isOutOfMemory(error))
+            return failed(ExitStatus::OutOfMemory, name + "not enough memory" + kMemoryAdvice);
+        return failed(ExitStatus::PhotographFailed, name + innermostMessage(error).toStdString());
+    } catch (...) {
+        return failed(ExitStatus::PhotographFailed, name + "failed for an unknown reason; report this");
     }
 }
 

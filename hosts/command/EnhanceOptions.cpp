@@ -89,7 +89,7 @@ void EnhanceOptions::declare(CLI::App& app) {
     app.footer(
         "The result stands beside its photograph as NAME-enhanced.EXT unless -o or -d is given.\n"
         "Exit status: 0 done, 1 a photograph failed, 2 wrong usage, 3 nothing matched, 4 a target that\n"
-        "cannot be written or no memory, 128+n ended by signal n.");
+        "cannot be written, 5 not enough memory, 128+n ended by signal n; the highest of all photographs.");
 }
 
 } // namespace orvela

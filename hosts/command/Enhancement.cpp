@@ -18,8 +18,10 @@ namespace {
 // The planes of one photograph and what watches the runs over them.
 class Run {
 public:
-    Run(ImageHost& host, StopSignals& signals, ProgressLine& progress)
-        : mHost(host), mSignals(signals), mProgress(progress), mInput(0, 0, QStringLiteral("Input")) {
+    // `result` is the host's result cell.
+    Run(ImageHost& host, std::int16_t& result, StopSignals& signals, ProgressLine& progress)
+        : mHost(host), mResult(result), mSignals(signals), mProgress(progress),
+          mInput(0, 0, QStringLiteral("Input")) {
         const StopAction leave(mSignals, [this] { mSignals.leave(); });
         mInput.FillFrom_Photoshop_Data(&mHost.record(), &mResult);
         mOriginal.emplace(mInput);
@@ -46,7 +48,7 @@ private:
     void connect(CThreadedCore& core);
 
     ImageHost& mHost;
-    std::int16_t mResult = 0;
+    std::int16_t& mResult;
     StopSignals& mSignals;
     ProgressLine& mProgress;
     CARGBPlanePhotoshop mInput;
@@ -103,16 +105,20 @@ bool Run::execute(CThreadedCore& core, const CUserParamsPhotoshop& params) {
 std::optional<Photograph> enhance(Photograph photograph, const RunSettings& settings,
                                   const std::optional<TraceOptions>& trace, StopSignals& signals,
                                   ProgressLine& progress) {
+    std::int16_t result = 0;
     try {
         ImageHost host(std::move(photograph));
-        Run run(host, signals, progress);
+        Run run(host, result, signals, progress);
         if (trace)
             run.traceTo(*trace);
         if (!run.enhance(settings))
             return std::nullopt;
         return std::move(host.photograph());
-    } catch (const CGenericEx& failure) {
-        throw EngineFailure(failure.message().toStdString());
+    } catch (const CGenericEx&) {
+        // The failure itself tells only that the host refused a request.
+        if (result == host::MemFullErr)
+            throw EngineFailure("not enough memory");
+        throw;
     }
 }
 

@@ -24,7 +24,7 @@ struct TraceOptions {
 
 /// Runs the pipelines over a photograph in memory the way a host does: through a filter record.
 /// @return the result; none when a signal stopped the run
-/// @throws EngineFailure, TargetError (the trace cannot be written)
+/// @throws EngineFailure, CGenericEx, TargetError (the trace cannot be written)
 std::optional<Photograph> enhance(Photograph photograph, const RunSettings& settings,
                                   const std::optional<TraceOptions>& trace, StopSignals& signals,
                                   ProgressLine& progress);

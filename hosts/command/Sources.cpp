@@ -51,11 +51,9 @@ Sources findSources(const std::vector<std::string>& arguments) {
         const std::vector<fs::path> found = expand(argument);
         if (found.empty())
             sources.unmatched.push_back(argument);
-        for (const fs::path& photograph : found) {
-            std::error_code error;
-            if (known.insert(fs::weakly_canonical(photograph, error)).second)
+        for (const fs::path& photograph : found)
+            if (known.insert(realPath(photograph)).second)
                 sources.photographs.push_back(photograph);
-        }
     }
     return sources;
 }

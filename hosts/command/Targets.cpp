@@ -37,12 +37,6 @@ fs::path targetOf(const fs::path& source, const TargetOptions& options) {
     return *options.folder / (name += beside.extension());
 }
 
-fs::path realPath(const fs::path& path) {
-    std::error_code error;
-    const fs::path real = fs::weakly_canonical(fs::absolute(path, error), error);
-    return error ? path : real;
-}
-
 void refuseSources(const Job& job, const std::vector<fs::path>& sources) {
     for (const fs::path& source : sources)
         if (isSameFile(job.target, source))
@@ -73,6 +67,13 @@ std::vector<Job> planTargets(const std::vector<fs::path>& sources, const TargetO
 
 bool isEarlierResult(const fs::path& file) {
     return file.stem().string().ends_with(kSuffix);
+}
+
+fs::path realPath(const fs::path& path) {
+    std::error_code error;
+    const fs::path absolute = fs::absolute(path, error);
+    const fs::path real = fs::weakly_canonical(absolute, error);
+    return error ? absolute.lexically_normal() : real;
 }
 
 bool isSameFile(const fs::path& a, const fs::path& b) {

@@ -26,6 +26,9 @@ std::vector<Job> planTargets(const std::vector<std::filesystem::path>& sources, 
 /// True for a file that a run without a target of its own wrote.
 bool isEarlierResult(const std::filesystem::path& file);
 
+/// The absolute path without links, "." and ".."; with the links where they lead nowhere.
+std::filesystem::path realPath(const std::filesystem::path& path);
+
 /// True when both name the same existing file, or would.
 bool isSameFile(const std::filesystem::path& a, const std::filesystem::path& b);
 

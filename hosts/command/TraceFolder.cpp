@@ -53,9 +53,15 @@ TraceFolder::TraceFolder(fs::path folder, bool overwrite, const CARGBPlane& orig
     : mFolder(std::move(folder)), mOverwrite(overwrite), mLast(original, QStringLiteral("Trace")) {
     std::error_code error;
     fs::create_directories(mFolder, error);
-    if (!fs::is_directory(mFolder))
-        throw TargetError(mFolder.string() + ": the folder cannot be made (" + error.message() + ")");
-    if (!overwrite && !fs::is_empty(mFolder, error))
+    std::error_code unused;
+    if (!fs::is_directory(mFolder, unused))
+        throw TargetError(mFolder.string() + ": the folder cannot be made (" + error.message() +
+                          "); name another folder for the trace");
+    const bool holdsFiles = !fs::is_empty(mFolder, error);
+    if (error)
+        throw TargetError(mFolder.string() + ": the folder cannot be read (" + error.message() +
+                          "); name another folder for the trace");
+    if (!overwrite && holdsFiles)
         throw TargetError(mFolder.string() + ": holds files already; name an empty folder or use --force");
 }
 

@@ -47,13 +47,6 @@ MetadataBlocks blocksOf(VipsImage* image) {
 
 } // namespace
 
-MetadataBlocks heifMetadata(const std::filesystem::path& path) {
-    startVips();
-    VipsImage* image = nullptr;
-    vips_heifload(path.c_str(), &image, nullptr);
-    return blocksOf(image);
-}
-
 MetadataBlocks heifMetadata(ByteView file) {
     startVips();
     VipsImage* image = nullptr;

@@ -1,27 +1,16 @@
 #include "common/Metadata.h"
 
-#include "common/HeifMetadata.h"
+#include "common/MetadataTags.h"
 #include "common/TiffDirectory.h"
 
 #include <algorithm>
 #include <array>
-#include <exiv2/exiv2.hpp>
 #include <map>
-#include <mutex>
-#include <regex>
 #include <set>
 
 namespace orvela {
 
 namespace {
-
-/// What is carried over.
-struct Tags {
-    Exiv2::ExifData exif;
-    Exiv2::IptcData iptc;
-    std::string xmp;
-    std::string comment;
-};
 
 using Warnings = std::vector<std::string>;
 
@@ -37,7 +26,7 @@ constexpr std::array<std::uint16_t, 3> kResolution = {0x011A, 0x011B, 0x0128};
 // Transfer function, white point and primaries, which the metadata library leaves out of a TIFF.
 constexpr std::array<std::uint16_t, 3> kColorimetry = {0x012D, 0x013E, 0x013F};
 
-constexpr std::array<std::uint16_t, 1> kXmp = {0x02BC};
+constexpr std::uint16_t kXmp = 0x02BC;
 
 template <std::size_t count>
 bool isImageTag(const Exiv2::Exifdatum& datum, const std::array<std::uint16_t, count>& tags) {
@@ -65,61 +54,8 @@ bool isPlacement(const Exiv2::Exifdatum& datum) {
     return keys.count(datum.key()) != 0;
 }
 
-void lockXmp(void* mutex, bool lock) {
-    auto* held = static_cast<std::recursive_mutex*>(mutex);
-    if (lock)
-        held->lock();
-    else
-        held->unlock();
-}
-
-void prepareLibrary() {
-    static std::recursive_mutex mutex;
-    static const bool ready = [] {
-        Exiv2::XmpParser::initialize(lockXmp, &mutex);
-        Exiv2::LogMsg::setLevel(Exiv2::LogMsg::mute);
-        return true;
-    }();
-    static_cast<void>(ready);
-}
-
 bool isTiff(FileFormat format) {
     return format == FileFormat::Tiff || format == FileFormat::Psd;
-}
-
-// The packet as it stands in the file: asked of a constant image it is not made anew, and of a TIFF it is a
-// tag.
-std::string packetOf(const Exiv2::Image& image) {
-    if (!image.xmpPacket().empty())
-        return image.xmpPacket();
-    for (const Exiv2::Exifdatum& datum : image.exifData())
-        if (isImageTag(datum, kXmp)) {
-            std::string packet(static_cast<std::size_t>(datum.size()), 0);
-            datum.copy(reinterpret_cast<Exiv2::byte*>(packet.data()), Exiv2::littleEndian);
-            return packet;
-        }
-    return {};
-}
-
-Tags tagsOf(Exiv2::Image& image) {
-    image.readMetadata();
-    return {image.exifData(), image.iptcData(), packetOf(image), image.comment()};
-}
-
-Tags tagsOf(const MetadataBlocks& blocks) {
-    Tags tags;
-    if (!blocks.exif.empty())
-        Exiv2::ExifParser::decode(tags.exif, blocks.exif.data(),
-                                  static_cast<std::uint32_t>(blocks.exif.size()));
-    tags.xmp.assign(blocks.xmp.begin(), blocks.xmp.end());
-    return tags;
-}
-
-template <typename Number>
-void setIfPresent(Exiv2::ExifData& exif, const char* key, Number value) {
-    const auto found = exif.findKey(Exiv2::ExifKey(key));
-    if (found != exif.end())
-        *found = value;
 }
 
 // The library's XMP reader drops what it cannot parse; the packet itself is kept all the same.
@@ -132,40 +68,26 @@ bool isWellFormed(const std::string& packet) {
     }
 }
 
-void makeUpright(Tags& tags) {
-    setIfPresent(tags.exif, "Exif.Image.Orientation", std::uint16_t{1});
-    static const std::regex property("(tiff:Orientation(?:=[\"']|>))[2-8]");
-    tags.xmp = std::regex_replace(tags.xmp, property, "$011");
-}
-
-Tags readSource(const Photograph& photograph) {
-    prepareLibrary();
-    Tags tags;
-    if (photograph.encoding.format == FileFormat::Heif) {
-        tags = tagsOf(heifMetadata(photograph.source));
-        makeUpright(tags);
-    } else {
-        tags = tagsOf(*Exiv2::ImageFactory::open(photograph.source.string()));
-    }
-    setIfPresent(tags.exif, "Exif.Photo.PixelXDimension", static_cast<std::uint32_t>(photograph.width));
-    setIfPresent(tags.exif, "Exif.Photo.PixelYDimension", static_cast<std::uint32_t>(photograph.height));
-    return tags;
-}
-
-// The source's tags that belong into a target of that format.
-Exiv2::ExifData exifFor(const Tags& tags, FileFormat source, FileFormat target) {
+// The tags that belong into a target of that format.
+Exiv2::ExifData exifFor(const Metadata& metadata, FileFormat target) {
     Exiv2::ExifData exif;
-    const bool stored = isTiff(source) || isTiff(target);
-    for (const Exiv2::Exifdatum& datum : tags.exif)
+    const bool stored = isTiff(metadata.format) || isTiff(target);
+    for (const Exiv2::Exifdatum& datum : metadata.tags.exif)
         if (!(stored && (isImageTag(datum, kStructure) || isOtherPicture(datum))) &&
             !(target == FileFormat::Tiff && isImageTag(datum, kResolution)))
             exif.add(datum);
     return exif;
 }
 
-std::unique_ptr<Exiv2::Image> openBytes(const Bytes& bytes) {
-    return std::unique_ptr<Exiv2::Image>(
-        Exiv2::ImageFactory::open(bytes.data(), static_cast<long>(bytes.size())).release());
+// The photograph's metadata as a target of that format is to have it.
+Tags tagsFor(const Photograph& photograph, FileFormat target) {
+    const Metadata& metadata = *photograph.metadata;
+    if (metadata.failure)
+        std::rethrow_exception(metadata.failure);
+    Tags tags{exifFor(metadata, target), metadata.tags.iptc, metadata.tags.xmp, metadata.tags.comment};
+    setIfPresent(tags.exif, "Exif.Photo.PixelXDimension", static_cast<std::uint32_t>(photograph.width));
+    setIfPresent(tags.exif, "Exif.Photo.PixelYDimension", static_cast<std::uint32_t>(photograph.height));
+    return tags;
 }
 
 // The colorimetry among the tags, in the byte order of the encoder's files.
@@ -185,7 +107,7 @@ std::vector<TiffEntry> colorimetryOf(const Exiv2::ExifData& exif) {
 
 // The encoded picture with the tags, except the kinds that the format has no place for.
 Bytes withTags(const Bytes& encoded, FileFormat target, const Tags& tags) {
-    const auto image = openBytes(encoded);
+    const auto image = openImage(encoded);
     image->readMetadata();
     Exiv2::ExifData exif;
     if (target == FileFormat::Tiff)
@@ -212,7 +134,7 @@ Bytes withTags(const Bytes& encoded, FileFormat target, const Tags& tags) {
     Bytes result(data, data + io.size());
     io.munmap();
     if (target == FileFormat::Tiff && !tags.xmp.empty())
-        addTiffEntries(result, {{kXmp[0], Exiv2::unsignedByte, static_cast<std::uint32_t>(tags.xmp.size()),
+        addTiffEntries(result, {{kXmp, Exiv2::unsignedByte, static_cast<std::uint32_t>(tags.xmp.size()),
                                  Bytes(tags.xmp.begin(), tags.xmp.end())}});
     return result;
 }
@@ -246,8 +168,7 @@ std::string missing(const Data& wanted, const Data& found,
 }
 
 Warnings compare(const Tags& wanted, const Bytes& encoded, FileFormat target) {
-    const Tags found =
-        target == FileFormat::Heif ? tagsOf(heifMetadata(encoded)) : tagsOf(*openBytes(encoded));
+    const Tags found = readTags(encoded, target);
     const std::string into = std::string(" did not go into the ") + formatName(target) + " file";
     Warnings warnings;
     const std::string exif = missing<Exiv2::ExifData>(wanted.exif, found.exif, isPlacement);
@@ -268,29 +189,27 @@ Warnings compare(const Tags& wanted, const Bytes& encoded, FileFormat target) {
 
 MetadataBlocks metadataBlocks(const Photograph& photograph) {
     MetadataBlocks blocks;
-    if (photograph.source.empty())
+    if (!photograph.metadata)
         return blocks;
     try {
-        const Tags tags = readSource(photograph);
-        const Exiv2::ExifData exif = exifFor(tags, photograph.encoding.format, FileFormat::Heif);
+        const Tags tags = tagsFor(photograph, FileFormat::Heif);
         Exiv2::Blob encoded;
-        Exiv2::ExifParser::encode(encoded, Exiv2::littleEndian, exif);
+        Exiv2::ExifParser::encode(encoded, Exiv2::littleEndian, tags.exif);
         blocks.exif.assign(encoded.begin(), encoded.end());
         blocks.xmp.assign(tags.xmp.begin(), tags.xmp.end());
     } catch (const std::exception&) {
-        // copyMetadata reads the same source and reports it.
+        // copyMetadata meets the same failure and reports it.
         return {};
     }
     return blocks;
 }
 
 std::vector<std::string> copyMetadata(const Photograph& photograph, FileFormat target, Bytes& encoded) {
-    if (photograph.source.empty())
+    if (!photograph.metadata)
         return {};
     Warnings warnings;
     try {
-        Tags tags = readSource(photograph);
-        tags.exif = exifFor(tags, photograph.encoding.format, target);
+        const Tags tags = tagsFor(photograph, target);
         if (!tags.xmp.empty() && !isWellFormed(tags.xmp))
             warnings.push_back("the XMP data is malformed and was carried over as it stands");
         if (target == FileFormat::Tiff)

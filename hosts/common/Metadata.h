@@ -2,6 +2,7 @@
 
 #include "common/FileFormat.h"
 
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -13,12 +14,14 @@ struct MetadataBlocks {
     Bytes xmp;
 };
 
-/// Both from the photograph's source, for a format whose encoder embeds them; empty where it has none or
-/// cannot be read.
+/// Takes the metadata out of a file, to travel with its picture. When it cannot be read, copyMetadata tells.
+std::shared_ptr<const Metadata> readMetadata(ByteView file, FileFormat format);
+
+/// Both out of the photograph's metadata, for a format whose encoder embeds them; empty where it has none.
 MetadataBlocks metadataBlocks(const Photograph& photograph);
 
-/// Gives an encoded picture the Exif (with MakerNote), XMP, IPTC and comment of the photograph's source, and
-/// reads them back. Tags that describe how the samples are stored stay those of the encoded picture, further
+/// Gives an encoded picture the photograph's metadata, Exif (with MakerNote), XMP, IPTC and comment, and
+/// reads it back. Tags that describe how the samples are stored stay those of the encoded picture, further
 /// pages of a TIFF are not carried over, and the dimensions are the picture's. XMP goes over as it stands,
 /// well-formed or not. The orientation is kept, except that it is upright for a HEIF source, whose decoding
 /// turns the pixels.

@@ -2,6 +2,7 @@
 
 #include <cstdint>
 #include <filesystem>
+#include <memory>
 #include <stdexcept>
 #include <string>
 #include <vector>
@@ -55,6 +56,9 @@ struct Encoding {
     int bitDepth = 0;             ///< HEIF: bits per sample in the file (8, 10 or 12); 0 when unknown
 };
 
+/// What a file holds beside its picture: Exif, XMP, IPTC, comment. See Metadata.h.
+struct Metadata;
+
 /// A photograph in memory: interleaved samples, rows from the top without padding, 8 bits or native 16 bits
 /// each. CMYK samples are raw ink values, 0 without ink; where a format stores them inverted, the inversion
 /// is undone on reading and done again on writing.
@@ -70,7 +74,8 @@ struct Photograph {
     std::string resolutionUnit;           ///< unit in which the file gives them: "in", "cm" or empty
     int pages = 1;                        ///< pages or animation frames of the file; only the first is held
     Encoding encoding;
-    std::filesystem::path source; ///< the file it was read from; its metadata is copied from there on writing
+    std::shared_ptr<const Metadata> metadata; ///< of the file it was read from; null when it comes from none
+    std::filesystem::path source;             ///< that file, for messages and so that it is never overwritten
 };
 
 } // namespace orvela

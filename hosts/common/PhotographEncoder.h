@@ -5,7 +5,7 @@
 namespace orvela {
 
 /// The picture as the bytes of a file of that format, with its ICC profile and resolution. Only HEIF, to
-/// which nothing can be added afterwards, carries the source's Exif and XMP already.
+/// which nothing can be added afterwards, carries its Exif and XMP already.
 /// @param target  for messages; .avif asks for AV1 compression
 /// @throws PhotographError when the picture cannot be encoded or a setting is unknown
 /// @throws StoppedError when `options.stop` was set

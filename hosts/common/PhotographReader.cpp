@@ -1,6 +1,7 @@
 #include "common/PhotographReader.h"
 
 #include "common/EncodingProbe.h"
+#include "common/Metadata.h"
 #include "common/PsdFile.h"
 #include "common/Vips.h"
 
@@ -217,6 +218,23 @@ void takeSamples(Photograph& photograph, const fs::path& path, VipsImage* image)
         fillLowBits(photograph);
 }
 
+Photograph decode(const Bytes& file, FileFormat format, const fs::path& path) {
+    const VipsHandle image = open(path, file, format);
+    Photograph photograph;
+    photograph.source = path;
+    photograph.width = vips_image_get_width(image.get());
+    photograph.height = vips_image_get_height(image.get());
+    photograph.model = modelOf(path, image.get());
+    photograph.depth = depthOf(path, image.get());
+    checkEdges(photograph.width, photograph.height, path);
+    photograph.encoding = encodingOf(file, format, image.get());
+    photograph.pages = std::max(1, numberField(image.get(), VIPS_META_N_PAGES));
+    takeResolution(photograph, image.get());
+    takeProfile(photograph, image.get());
+    takeSamples(photograph, path, image.get());
+    return photograph;
+}
+
 } // namespace
 
 Photograph readPhotograph(const fs::path& path) {
@@ -225,22 +243,8 @@ Photograph readPhotograph(const fs::path& path) {
     if (!format)
         refuse(path, "is not a picture of a known kind",
                "JPEG, PNG, TIFF, WebP, PSD and HEIF files can be read");
-    if (*format == FileFormat::Psd)
-        return readPsd(file, path);
-
-    const VipsHandle image = open(path, file, *format);
-    Photograph photograph;
-    photograph.source = path;
-    photograph.width = vips_image_get_width(image.get());
-    photograph.height = vips_image_get_height(image.get());
-    photograph.model = modelOf(path, image.get());
-    photograph.depth = depthOf(path, image.get());
-    checkEdges(photograph.width, photograph.height, path);
-    photograph.encoding = encodingOf(file, *format, image.get());
-    photograph.pages = std::max(1, numberField(image.get(), VIPS_META_N_PAGES));
-    takeResolution(photograph, image.get());
-    takeProfile(photograph, image.get());
-    takeSamples(photograph, path, image.get());
+    Photograph photograph = *format == FileFormat::Psd ? readPsd(file, path) : decode(file, *format, path);
+    photograph.metadata = readMetadata(file, *format);
     return photograph;
 }
 

@@ -29,7 +29,7 @@ struct WriteOptions {
 void checkTarget(const Photograph& photograph, const std::filesystem::path& target,
                  const WriteOptions& options);
 
-/// Writes the photograph in the format that the target's extension names, with the metadata of its source.
+/// Writes the photograph in the format that the target's extension names, with its metadata.
 /// The target appears whole or not at all: the bytes go to a temporary name in its folder, which is removed
 /// on every failure, and take the final name once they are on the disk. Without `overwrite` a file that
 /// appears under the final name meanwhile is left alone.

@@ -3,7 +3,7 @@
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
 
-#include <cstring>
+#include <algorithm>
 #include <vector>
 
 using namespace orvela;
@@ -41,6 +41,25 @@ void CARGBPlanePhotoshop::FillFrom_Photoshop_Data(host::FilterRecord* record, st
     requestPlane(record, 0);
     advance(record, result, "Error.", __LINE__);
 
+    takeShape(record);
+    const bool verbose = qEnvironmentVariableIsSet("ORVELA_DEBUG_CARGBPLANE");
+    for (int c = 0; c < 3 && c < record->planes; ++c) {
+        Log::log(LogLevel::Debug, "CARGBPlanePhotoshop::FillFrom_Photoshop_Data iPlaneID:%d", c);
+        requestPlane(record, c);
+        advance(record, result, "Error advancing state in FillFrom_Photoshop_Data.", __LINE__);
+        if (verbose)
+            Log::log(LogLevel::Debug, "CARGBPlane FillFrom_Photoshop_Data plane=%d bpp=%d ", c,
+                     record->depth);
+        copyFromInput(record, samples(kChannels[static_cast<std::size_t>(c)]));
+    }
+    if (colorMode() == Grayscale) {
+        Log::log(LogLevel::Debug, "Grayscale mode.");
+        std::copy_n(samples(Channel::Red), pixelCount(), samples(Channel::Blue));
+        std::copy_n(samples(Channel::Red), pixelCount(), samples(Channel::Green));
+    }
+}
+
+void CARGBPlanePhotoshop::takeShape(const host::FilterRecord* record) {
     const host::Rect area = record->filterRect;
     const std::int32_t w = area.right - area.left;
     const std::int32_t h = area.bottom - area.top;
@@ -53,23 +72,6 @@ void CARGBPlanePhotoshop::FillFrom_Photoshop_Data(host::FilterRecord* record, st
     else if (record->planes == 1 || record->planes == 2)
         setColorMode(Grayscale);
     resize(w, h);
-
-    const bool verbose = qEnvironmentVariableIsSet("ORVELA_DEBUG_CARGBPLANE");
-    for (int c = 0; c < 3 && c < record->planes; ++c) {
-        Log::log(LogLevel::Debug, "CARGBPlanePhotoshop::FillFrom_Photoshop_Data iPlaneID:%d", c);
-        requestPlane(record, c);
-        advance(record, result, "Error advancing state in FillFrom_Photoshop_Data.", __LINE__);
-        if (verbose)
-            Log::log(LogLevel::Debug, "CARGBPlane FillFrom_Photoshop_Data plane=%d bpp=%d ", c,
-                     record->depth);
-        copyFromInput(record, samples(kChannels[static_cast<std::size_t>(c)]));
-    }
-    if (colorMode() == Grayscale && isAllocated()) {
-        Log::log(LogLevel::Debug, "Grayscale mode.");
-        const auto count = static_cast<std::size_t>(pixelCount());
-        std::memcpy(samples(Channel::Blue), samples(Channel::Red), count);
-        std::memcpy(samples(Channel::Green), samples(Channel::Red), count);
-    }
 }
 
 void CARGBPlanePhotoshop::copyFromInput(const host::FilterRecord* record, std::uint8_t* samples) const {
@@ -77,11 +79,12 @@ void CARGBPlanePhotoshop::copyFromInput(const host::FilterRecord* record, std::u
     for (int y = 0; y < height(); ++y, samples += w) {
         const std::uint8_t* in = rowOf(record->inData, record->inRowBytes, y);
         if (record->depth == 8) {
-            std::memcpy(samples, in, w);
+            std::copy_n(in, w, samples);
         } else if (record->depth == 16) {
             const auto* in16 = reinterpret_cast<const std::uint16_t*>(in);
             for (std::size_t x = 0; x < w; ++x)
-                samples[x] = static_cast<std::uint8_t>(static_cast<float>(in16[x]) * kFrom16);
+                samples[x] =
+                    static_cast<std::uint8_t>(std::min(static_cast<float>(in16[x]) * kFrom16, 255.0F));
         }
     }
 }
@@ -132,7 +135,7 @@ void CARGBPlanePhotoshop::copyToOutput(host::FilterRecord* record, const std::ui
     const auto w = static_cast<std::size_t>(width());
     for (int y = 0; y < height(); ++y, samples += w) {
         if (record->depth == 8) {
-            std::memcpy(rowOf(record->outData, record->outRowBytes, y), samples, w);
+            std::copy_n(samples, w, rowOf(record->outData, record->outRowBytes, y));
         } else if (record->depth == 16) {
             // Whole 16-bit cells per row, whatever the stride in bytes.
             auto* out = static_cast<std::uint16_t*>(record->outData) +

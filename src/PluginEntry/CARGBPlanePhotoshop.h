@@ -11,8 +11,9 @@ class CARGBPlanePhotoshop final : public CARGBPlane {
 public:
     using CARGBPlane::CARGBPlane;
 
-    /// Takes the size of the filter rectangle and reads up to three channels. 16-bit samples (0 to 32768)
-    /// become floor(s * 255 / 32768); depths other than 8 and 16 transfer no samples.
+    /// Takes the size of the filter rectangle and reads up to three channels. 16-bit samples (0 to 32768,
+    /// larger ones count as 32768) become floor(s * 255 / 32768); depths other than 8 and 16 transfer no
+    /// samples.
     /// @param result  the host's result cell; receives every code that the host returns
     /// @throws CGenericEx when the host refuses a request
     void FillFrom_Photoshop_Data(orvela::host::FilterRecord* record, std::int16_t* result);
@@ -23,6 +24,7 @@ public:
     void copyPlaneToPS(orvela::host::FilterRecord* record, std::int16_t* result);
 
 private:
+    void takeShape(const orvela::host::FilterRecord* record);
     void writeChannel(int channel, const std::uint8_t* samples, orvela::host::FilterRecord* record,
                       std::int16_t* result);
     void copyToOutput(orvela::host::FilterRecord* record, const std::uint8_t* samples) const;

@@ -1,6 +1,7 @@
 #include "PluginEntry/CARGBPlanePhotoshop.h"
 
 #include "Utility/CGenericEx.h"
+#include "support/LogCapture.h"
 
 #include <gtest/gtest.h>
 
@@ -55,12 +56,14 @@ Bytes channel(CARGBPlanePhotoshop& plane, Channel which) {
 }
 
 TEST(CARGBPlanePhotoshop, MapsSixteenBitsDownByTheFloorAndUpToFullScale) {
-    PlaneHost<std::uint16_t> host(4, 1, {{0, 128, 32767, 32768}, {129, 257, 16384, 1}, Words(4)});
+    PlaneHost<std::uint16_t> host(
+        4, 1, {{0, 128, 32767, 32768}, {129, 257, 16384, 1}, {32769, 32896, 32897, 65535}});
     CARGBPlanePhotoshop plane(0, 0, QStringLiteral("plane"));
     host.fill(plane);
     EXPECT_EQ(channel(plane, Channel::Red), (Bytes{0, 0, 254, 255}));
     EXPECT_EQ(channel(plane, Channel::Green),
               (Bytes{1, 1, 127, 0})); // 129 * 255 / 32768 = 1.004, 257 gives 1.99
+    EXPECT_EQ(channel(plane, Channel::Blue), Bytes(4, 255)) << "above full scale";
     const Bytes out = {0, 1, 128, 255};
     std::copy(out.begin(), out.end(), plane.samples(Channel::Blue));
     host.write(plane);
@@ -85,6 +88,19 @@ TEST(CARGBPlanePhotoshop, TakesGreyFromRedAndMakesTransparencyOpaque) {
     plane.samples(Channel::Blue)[0] = 3;
     single.write(plane);
     EXPECT_EQ(single.planes[0], (Bytes{1, 20}));
+}
+
+TEST(CARGBPlanePhotoshop, TakesAndReturnsAnEmptyRectangle) {
+    for (const std::int16_t height : {0, 5}) {
+        PlaneHost<std::uint8_t> host(0, height, {{}});
+        CARGBPlanePhotoshop plane(3, 3, QStringLiteral("plane"));
+        LogCapture log;
+        host.fill(plane);
+        EXPECT_TRUE(log.has("Grayscale mode."));
+        EXPECT_EQ(plane.pixelCount(), 0);
+        host.write(plane);
+        EXPECT_EQ(host.result, 0);
+    }
 }
 
 // Transparency or black: neither read nor written. Two rows of three, of which a rectangle of two pixels.

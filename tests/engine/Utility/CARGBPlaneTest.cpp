@@ -11,7 +11,25 @@
 
 #include <gtest/gtest.h>
 
+#include <new>
+
 using namespace orvela;
+
+namespace {
+int gArraysLeft = -1; // how many arrays can still be had; negative: any number
+}
+
+// The form of allocation that reports a failure as null.
+void* operator new[](std::size_t size, const std::nothrow_t&) noexcept {
+    if (gArraysLeft == 0)
+        return nullptr;
+    gArraysLeft -= gArraysLeft > 0 ? 1 : 0;
+    try {
+        return ::operator new[](size);
+    } catch (const std::bad_alloc&) {
+        return nullptr;
+    }
+}
 
 namespace {
 
@@ -37,11 +55,56 @@ TEST(CARGBPlane, ParallelCopyIsWholeAcrossBlocks) {
 
 TEST(CARGBPlane, ImpossibleSizesAreOutOfMemory) {
     ExceptionStack::clear();
-    EXPECT_THROW(CARGBPlane(70000, 70000, QStringLiteral("huge")), CGenericEx);
+    try {
+        const CARGBPlane huge(46341, 46341, QStringLiteral("huge")); // one pixel more than 32 bits count
+        ADD_FAILURE();
+    } catch (const CGenericEx& failure) {
+        EXPECT_TRUE(isOutOfMemory(failure));
+    }
     const QStringList entries = ExceptionStack::entries();
     ASSERT_EQ(entries.size(), 2);
     EXPECT_TRUE(entries[0].endsWith("CGenericEx Unable to complete plane creation."));
     EXPECT_TRUE(entries[1].endsWith("COutOfMemoryEx Unable to allocate Planes Memory (Direct error)."));
+    ExceptionStack::clear();
+}
+
+TEST(CARGBPlane, AFailedCopyLeavesAnEmptyPlaneThatTakesTheNextOne) {
+    const auto source = testplanes::noise(16, 9);
+    for (const int arrays : {0, 1, 2}) {
+        CARGBPlane plane(4, 4, QStringLiteral("plane"));
+        gArraysLeft = arrays;
+        try {
+            plane.copyFrom(*source);
+            ADD_FAILURE();
+        } catch (const CBadPtrEx& failure) {
+            EXPECT_TRUE(isOutOfMemory(failure));
+            EXPECT_EQ(innermostMessage(failure), "Unable to allocate plane memory (Indirect error).");
+        }
+        gArraysLeft = -1;
+        EXPECT_FALSE(plane.isAllocated());
+        EXPECT_EQ(plane.width() + plane.height() + plane.pixelCount(), 0);
+        EXPECT_EQ(plane.samples(Channel::Red), nullptr);
+        plane.copyFrom(*source);
+        EXPECT_EQ(testplanes::bytes(plane), testplanes::bytes(*source));
+    }
+    ExceptionStack::clear();
+}
+
+TEST(CARGBPlane, PlanesOfOneSizeExchangeTheirArraysAndMode) {
+    const auto noise = testplanes::noise(6, 4);
+    const auto before = testplanes::bytes(*noise);
+    const std::uint8_t* const array = noise->samples(Channel::Green);
+    noise->setColorMode(CARGBPlane::Grayscale);
+    const auto flat = testplanes::uniform(6, 4, {1, 2, 3});
+    noise->swapSamples(*flat);
+    EXPECT_EQ(testplanes::bytes(*flat), before);
+    EXPECT_EQ(flat->samples(Channel::Green), array);
+    EXPECT_EQ(flat->colorMode(), CARGBPlane::Grayscale);
+    EXPECT_EQ(testplanes::at(*noise, 5, 3), (testplanes::Pixel{1, 2, 3}));
+    EXPECT_EQ(noise->colorMode(), CARGBPlane::ColorUnset);
+    const auto turned = testplanes::uniform(4, 6, {0, 0, 0}); // as many pixels
+    EXPECT_THROW(flat->swapSamples(*turned), CBadPtrEx);
+    EXPECT_EQ(testplanes::bytes(*flat), before);
     ExceptionStack::clear();
 }
 

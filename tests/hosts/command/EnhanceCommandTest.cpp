@@ -1,5 +1,6 @@
 #include "ProgramRun.h"
 
+#include <sys/resource.h>
 #include <unistd.h>
 
 using namespace orvela;
@@ -39,6 +40,26 @@ TEST_F(EnhanceCommandTest, AFailedPhotographDoesNotKeepTheOthers) {
     EXPECT_TRUE(exists("good-enhanced.png"));
     EXPECT_EQ(files().size(), 5);
 }
+
+#if !defined(__SANITIZE_ADDRESS__) && !defined(__SANITIZE_THREAD__) // they need more than any limit
+TEST_F(EnhanceCommandTest, WantOfMemoryHasItsOwnStatusAndDoesNotKeepTheOthers) {
+    sample("good.png");
+    // 30000 x 30000 pixels in packed rows.
+    store("huge.psd", QByteArray::fromHex("38425053000100000000000000030000753000007530000800030000"
+                                          "000000000000000000000001") +
+                          QByteArray(2 * 3 * 30000, '\0'));
+    QProcess process;
+    process.setChildProcessModifier([] {
+        const rlimit limit = {2'000'000'000, 2'000'000'000};
+        setrlimit(RLIMIT_AS, &limit);
+    });
+    begin(process, "enhance missing.png huge.psd good.png");
+    const Answer answer = finish(process);
+    EXPECT_EQ(answer.status, 5);
+    EXPECT_TRUE(answer.says("huge.psd: not enough memory; ")) << answer.err;
+    EXPECT_TRUE(exists("good-enhanced.png"));
+}
+#endif
 
 TEST_F(EnhanceCommandTest, ExistingResultsStayUnlessForced) {
     sample("a.png");
@@ -117,6 +138,23 @@ TEST_F(EnhanceCommandTest, UnwritableTargetsAreTargetTrouble) {
         EXPECT_EQ(orvela(arguments).status, 4) << arguments;
     EXPECT_EQ(files(), QStringList({QStringLiteral("a.png"), QStringLiteral("file")}));
     EXPECT_EQ(orvela("enhance a.png -o x.psd").status, 1);
+}
+
+// A link that leads to itself is neither a folder nor a file.
+TEST_F(EnhanceCommandTest, LoopsOfLinksAreNamed) {
+    sample("a.png");
+    for (const char* name : {"x", "y.png", "z.png"})
+        ASSERT_EQ(symlink(name, qPrintable(path(name))), 0);
+    for (const char* arguments : {"enhance a.png -o r.png --trace x", "enhance a.png -o r.png --trace x/t",
+                                  "enhance a.png -d x", "enhance a.png -o r.png --log x"}) {
+        const Answer answer = orvela(arguments);
+        EXPECT_EQ(answer.status, 4) << arguments;
+        EXPECT_TRUE(answer.says("orvela: x") && answer.says("; ")) << answer.err;
+    }
+    const Answer sources = orvela("enhance y.png z.png .");
+    EXPECT_EQ(sources.status, 1);
+    EXPECT_TRUE(sources.says("y.png: ") && sources.says("z.png: ")) << sources.err;
+    EXPECT_TRUE(exists("a-enhanced.png"));
 }
 
 TEST_F(EnhanceCommandTest, AnyNumberOfThreadsGivesTheSameBytes) {

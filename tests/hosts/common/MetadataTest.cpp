@@ -47,6 +47,36 @@ TEST(Metadata, WarnsOfMalformedXmpAndOfWhatAFormatCannotHold) {
                 ElementsAre(HasSubstr("Keywords"), HasSubstr("comment")));
 }
 
+TEST(Metadata, TravelsWithThePictureWhateverBecomesOfItsFile) {
+    const TestFolder folder;
+    folder.run("convert $S/coffee.png -resize 64x48! s.jpg && exiftool -q -overwrite_original -ISO=200 "
+               "-Make=Canon -IPTC:Keywords=night -XMP:Title=T s.jpg && vips heifsave s.jpg s.heic && "
+               "convert s.jpg s.tif && exiftool -q -overwrite_original -TagsFromFile s.jpg s.tif && "
+               "convert $S/coffee.png -resize 9x9! other.png");
+    for (const char* name : {"s.jpg", "s.tif", "s.heic"}) {
+        const Photograph photograph = readPhotograph(folder / name);
+        writePhotograph(photograph, folder / "before.jpg");
+        folder.run(std::string("cp other.png ") + name);
+        writePhotograph(photograph, folder / "changed.jpg");
+        folder.run(std::string("rm ") + name);
+        writePhotograph(photograph, folder / "gone.jpg");
+        EXPECT_EQ(folder.output("exiftool -s3 -ISO -Make -Title before.jpg"), "200\nCanon\nT\n") << name;
+        folder.run(
+            "cmp before.jpg changed.jpg && cmp before.jpg gone.jpg && rm before.jpg changed.jpg gone.jpg");
+    }
+}
+
+TEST(Metadata, WarnsOnWritingOfWhatCouldNotBeRead) {
+    const TestFolder folder;
+    folder.run("(head -c 2 $S/rocket.jpg; printf '\\377\\341\\0\\020Exif\\0\\0II*\\0\\377\\377\\377\\177'; "
+               "tail -c +3 $S/rocket.jpg) > s.jpg");
+    const Photograph photograph = readPhotograph(folder / "s.jpg");
+    for (const char* name : {"t.jpg", "t.heic"})
+        EXPECT_THAT(writePhotograph(photograph, folder / name),
+                    ElementsAre(HasSubstr("s.jpg: the metadata could not be carried over (")));
+    EXPECT_EQ(readPhotograph(folder / "t.jpg").width, photograph.width);
+}
+
 // Decoding a HEIF turns the pixels, so the tag must not turn them a second time.
 TEST(Metadata, IsUprightAfterHeif) {
     const TestFolder folder;
