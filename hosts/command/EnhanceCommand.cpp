@@ -49,7 +49,7 @@ private:
     const RunSettings& mSettings;
     const std::vector<Job> mJobs;
     StopSignals& mSignals;
-    orvela::RowScheduler mScheduler;
+    RowScheduler mScheduler;
     ProgressLine mProgress;
     std::size_t mIndex = 0;
 };
@@ -76,7 +76,9 @@ ExitStatus Batch::runGuarded(const Job& job) {
     } catch (const PhotographError& error) {
         return failed(ExitStatus::PhotographFailed, error.what());
     } catch (const EngineFailure& error) {
-        return failed(ExitStatus::OutOfMemory, name + error.what() + kMemoryAdvice);
+        return error.isOutOfMemory()
+                   ? failed(ExitStatus::OutOfMemory, name + error.what() + kMemoryAdvice)
+                   : failed(ExitStatus::PhotographFailed, name + error.what() + "; nothing was written");
     } catch (const std::exception& error) {
         if (isOutOfMemory(error))
             return failed(ExitStatus::OutOfMemory, name + "not enough memory" + kMemoryAdvice);
@@ -98,7 +100,7 @@ void Batch::runJob(const Job& job) {
     Photograph photograph = read(job.source);
     checkTarget(photograph, job.target, writing);
     const std::optional<Photograph> result =
-        enhance(std::move(photograph), mSettings, traceOf(job), mSignals, mProgress);
+        enhance(std::move(photograph), mSettings, traceOf(job), mScheduler, mSignals, mProgress);
     if (!result)
         return;
     mProgress.step(1, 1, QStringLiteral("Writing"));

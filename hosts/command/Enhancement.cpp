@@ -2,8 +2,7 @@
 
 #include "Core/CThreadedCore_FinalTouch.h"
 #include "Core/CThreadedCore_Orvela.h"
-#include "Library/Utility/CARGBPlaneProxyDirect.h"
-#include "PluginEntry/CARGBPlanePhotoshop.h"
+#include "PluginEntry/PictureSession.h"
 #include "Utility/CGenericEx.h"
 #include "command/TraceFolder.h"
 #include "common/ImageHost.h"
@@ -15,48 +14,48 @@ namespace orvela {
 
 namespace {
 
-// The planes of one photograph and what watches the runs over them.
+// The runs over one photograph and what watches them.
 class Run {
 public:
-    // `result` is the host's result cell.
-    Run(ImageHost& host, std::int16_t& result, StopSignals& signals, ProgressLine& progress)
-        : mHost(host), mResult(result), mSignals(signals), mProgress(progress),
-          mInput(0, 0, QStringLiteral("Input")) {
-        const StopAction leave(mSignals, [this] { mSignals.leave(); });
-        mInput.FillFrom_Photoshop_Data(&mHost.record(), &mResult);
-        mOriginal.emplace(mInput);
-        mOutput.emplace(mInput, QStringLiteral("Output"));
+    Run(PictureSession& session, RowScheduler& scheduler, StopSignals& signals, ProgressLine& progress)
+        : mSession(session), mScheduler(scheduler), mSignals(signals), mProgress(progress) {}
+
+    void traceTo(const TraceOptions& trace) {
+        mTrace.emplace(trace.folder, trace.overwrite, mSession.input());
     }
 
-    void traceTo(const TraceOptions& trace) { mTrace.emplace(trace.folder, trace.overwrite, mInput); }
-
     bool enhance(const RunSettings& settings) {
-        CThreadedCore_Orvela core(&mInput, &*mOutput);
+        CThreadedCore_Orvela core(&mSession.input(), &mSession.output());
         if (!execute(core, settings.params))
             return false;
-        if (settings.runsFinalTouch) {
-            CThreadedCore_FinalTouch touch(&mInput, &*mOutput);
-            if (!execute(touch, settings.finalTouchParams))
-                return false;
-        }
-        mOutput->copyPlaneToPS(&mHost.record(), &mResult);
-        return true;
+        if (!settings.runsFinalTouch)
+            return true;
+        CThreadedCore_FinalTouch touch(&mSession.input(), &mSession.output());
+        return execute(touch, settings.finalTouchParams);
     }
 
 private:
     bool execute(CThreadedCore& core, const CUserParamsPhotoshop& params);
     void connect(CThreadedCore& core);
 
-    ImageHost& mHost;
-    std::int16_t& mResult;
+    PictureSession& mSession;
+    RowScheduler& mScheduler;
     StopSignals& mSignals;
     ProgressLine& mProgress;
-    CARGBPlanePhotoshop mInput;
-    std::optional<CARGBPlaneProxyDirect> mOriginal;
-    std::optional<CARGBPlanePhotoshop> mOutput;
     std::optional<TraceFolder> mTrace;
     std::exception_ptr mTraceFailure;
 };
+
+// A step that failed leaves the picture without it: a result that nobody asked for.
+void checkOutcome(const CThreadedCore& core) {
+    if (!core.lastProcessingDone())
+        throw EngineFailure("the run failed: " + core.failure().cause.toStdString(),
+                            core.failure().outOfMemory);
+    for (const TaskReport& report : core.reports())
+        if (report.outcome == TaskOutcome::Failed)
+            throw EngineFailure(std::string(report.name) + " failed: " + report.failure.cause.toStdString(),
+                                report.failure.outOfMemory);
+}
 
 // The handlers run on the thread of the run.
 void Run::connect(CThreadedCore& core) {
@@ -76,7 +75,7 @@ void Run::connect(CThreadedCore& core) {
             return;
         // A failed trace must not look like a failed task.
         try {
-            mTrace->taskDone(report, mInput, core.params());
+            mTrace->taskDone(report, core);
         } catch (...) {
             mTraceFailure = std::current_exception();
             core.stop();
@@ -86,38 +85,40 @@ void Run::connect(CThreadedCore& core) {
 
 bool Run::execute(CThreadedCore& core, const CUserParamsPhotoshop& params) {
     connect(core);
-    core.setParams(params);
     {
         const StopAction stopCore(mSignals, [&core] { core.stop(); });
-        core.run();
+        mSession.run(core, params, &mScheduler);
     }
     if (mTraceFailure)
         std::rethrow_exception(mTraceFailure);
     if (mSignals.stopRequested())
         return false;
-    if (!core.lastProcessingDone())
-        throw EngineFailure("the engine gave up, most likely for want of memory");
+    checkOutcome(core);
     return true;
 }
 
 } // namespace
 
 std::optional<Photograph> enhance(Photograph photograph, const RunSettings& settings,
-                                  const std::optional<TraceOptions>& trace, StopSignals& signals,
-                                  ProgressLine& progress) {
+                                  const std::optional<TraceOptions>& trace, RowScheduler& scheduler,
+                                  StopSignals& signals, ProgressLine& progress) {
     std::int16_t result = 0;
     try {
         ImageHost host(std::move(photograph));
-        Run run(host, result, signals, progress);
+        std::optional<StopAction> leave(std::in_place, signals, [&signals] { signals.leave(); });
+        PictureSession session(&host.record(), &result);
+        leave.reset();
+        Run run(session, scheduler, signals, progress);
         if (trace)
             run.traceTo(*trace);
         if (!run.enhance(settings))
             return std::nullopt;
+        session.writeBack();
         return std::move(host.photograph());
     } catch (const CGenericEx&) {
         // The failure itself tells only that the host refused a request.
         if (result == host::MemFullErr)
-            throw EngineFailure("not enough memory");
+            throw EngineFailure("not enough memory", true);
         throw;
     }
 }

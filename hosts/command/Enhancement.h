@@ -10,10 +10,18 @@
 
 namespace orvela {
 
-/// The engine has given up a photograph, for want of memory.
+class RowScheduler;
+
+/// The engine could not enhance a photograph, or not with every step that applies.
 class EngineFailure : public std::runtime_error {
 public:
-    using std::runtime_error::runtime_error;
+    EngineFailure(const std::string& text, bool outOfMemory)
+        : std::runtime_error(text), mOutOfMemory(outOfMemory) {}
+
+    bool isOutOfMemory() const { return mOutOfMemory; }
+
+private:
+    bool mOutOfMemory;
 };
 
 /// Where the steps of a run are to be shown.
@@ -26,7 +34,7 @@ struct TraceOptions {
 /// @return the result; none when a signal stopped the run
 /// @throws EngineFailure, CGenericEx, TargetError (the trace cannot be written)
 std::optional<Photograph> enhance(Photograph photograph, const RunSettings& settings,
-                                  const std::optional<TraceOptions>& trace, StopSignals& signals,
-                                  ProgressLine& progress);
+                                  const std::optional<TraceOptions>& trace, RowScheduler& scheduler,
+                                  StopSignals& signals, ProgressLine& progress);
 
 } // namespace orvela

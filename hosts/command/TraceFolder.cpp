@@ -50,7 +50,8 @@ void writeText(const fs::path& file, const std::string& text) {
 } // namespace
 
 TraceFolder::TraceFolder(fs::path folder, bool overwrite, const CARGBPlane& original)
-    : mFolder(std::move(folder)), mOverwrite(overwrite), mLast(original, QStringLiteral("Trace")) {
+    : mFolder(std::move(folder)), mOverwrite(overwrite),
+      mLast(std::make_unique<CARGBPlane>(original, QStringLiteral("Trace"))) {
     std::error_code error;
     fs::create_directories(mFolder, error);
     std::error_code unused;
@@ -67,15 +68,19 @@ TraceFolder::TraceFolder(fs::path folder, bool overwrite, const CARGBPlane& orig
 
 TraceFolder::~TraceFolder() = default;
 
-void TraceFolder::taskDone(const TaskReport& report, const CARGBPlane& picture, const CUserParams& params) {
-    if (report.kind != TaskKind::Filter || !report.applied || isSamePicture(picture, mLast))
+void TraceFolder::taskDone(const TaskReport& report, const CThreadedCore& core) {
+    if (report.kind != TaskKind::Filter || report.outcome != TaskOutcome::Applied)
         return;
-    mLast.copyFrom(picture);
+    std::unique_ptr<CARGBPlane> picture = core.snapshot();
+    if (isSamePicture(*picture, *mLast))
+        return;
+    mLast = std::move(picture);
     char name[160];
     std::snprintf(name, sizeof name, "%02d-%s", ++mNumber, report.name);
     WriteOptions options;
     options.overwrite = mOverwrite;
-    writePhotograph(photographOf(picture), mFolder / (std::string(name) + ".png"), options);
+    writePhotograph(photographOf(*mLast), mFolder / (std::string(name) + ".png"), options);
+    const CUserParams& params = core.params();
     const nlohmann::ordered_json content = {{"task", report.name},
                                             {"statistics", statisticsOf(params)},
                                             {"histograms",

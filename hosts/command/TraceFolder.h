@@ -18,13 +18,13 @@ public:
 
     /// To be called after each task of the run.
     /// @throws TargetError
-    void taskDone(const TaskReport& report, const CARGBPlane& picture, const CUserParams& params);
+    void taskDone(const TaskReport& report, const CThreadedCore& core);
 
 private:
     std::filesystem::path mFolder;
     bool mOverwrite;
     int mNumber = 0;
-    CARGBPlane mLast;
+    std::unique_ptr<CARGBPlane> mLast;
 };
 
 } // namespace orvela

@@ -81,6 +81,10 @@ bool CThreadedCore::guarded(const std::function<bool()>& action) {
     return false;
 }
 
+std::unique_ptr<CARGBPlane> CThreadedCore::snapshot() const {
+    return snapshot(QRect(0, 0, mInPlane->width(), mInPlane->height()), 1);
+}
+
 std::unique_ptr<CARGBPlane> CThreadedCore::snapshot(const QRect& area, int reduction) const {
     return takeSnapshot(*mInPlane, area, reduction);
 }

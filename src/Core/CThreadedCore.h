@@ -70,8 +70,9 @@ public:
     const orvela::Failure& failure() const { return mFailure; }
 
     /// A copy of the picture as it stands between two tasks, for an observer or a receiver of stepDone(); to
-    /// be asked on the thread of the run. See orvela::takeSnapshot().
+    /// be asked on the thread of the run. See orvela::takeSnapshot() for its part and reduction.
     /// @throws CGenericEx when the memory cannot be had
+    std::unique_ptr<CARGBPlane> snapshot() const;
     std::unique_ptr<CARGBPlane> snapshot(const QRect& area, int reduction) const;
 
 Q_SIGNALS:
