@@ -8,12 +8,28 @@
 
 namespace orvela {
 
-/// Sets a slider, a switch, a statistic or a flag by its name; "pHisto_Luma[128]" is a bin. Throws
+/// The bin of a name like "pHisto_Luma[128]", null for other names.
+inline double* namedBin(CUserParams& params, const QString& name) {
+    const QString histogram = name.section('[', 0, 0);
+    if (!name.endsWith(']'))
+        return nullptr;
+    for (const auto& [known, bins] : {std::pair{"pHisto_Luma", &params.pHisto_Luma},
+                                      {"pHisto_Red", &params.pHisto_Red},
+                                      {"pHisto_Green", &params.pHisto_Green},
+                                      {"pHisto_Blue", &params.pHisto_Blue}}) {
+        if (histogram == QLatin1String(known))
+            return &bins->at(name.section('[', 1).chopped(1).toUInt());
+    }
+    return nullptr;
+}
+
+/// Sets a slider, a switch, a statistic or a flag by its name, or a bin. Throws
 /// std::invalid_argument for other names.
 inline void setField(CUserParams& params, const QString& name, double value) {
-    bool known = name.startsWith("pHisto_Luma[");
-    if (known)
-        params.pHisto_Luma.at(name.section('[', 1).chopped(1).toUInt()) = value;
+    double* const bin = namedBin(params, name);
+    if (bin)
+        *bin = value;
+    bool known = bin != nullptr;
     const auto take = [&](const char* field, auto& target) {
         if (name != field)
             return;
@@ -30,11 +46,16 @@ inline void setField(CUserParams& params, const QString& name, double value) {
         throw std::invalid_argument(name.toStdString());
 }
 
-/// Parameters written as text: "name=value name=value name", where a name alone is a switch that is on.
-inline CUserParams paramsFrom(const std::string& text) {
-    CUserParams params;
+/// Sets fields from text: "name=value name=value name", where a name alone is a switch that is on.
+inline void setFields(CUserParams& params, const std::string& text) {
     for (const QString& word : QString::fromStdString(text).split(' ', Qt::SkipEmptyParts))
         setField(params, word.section('=', 0, 0), word.contains('=') ? word.section('=', 1).toDouble() : 1);
+}
+
+/// Parameters written as the same text.
+inline CUserParams paramsFrom(const std::string& text) {
+    CUserParams params;
+    setFields(params, text);
     return params;
 }
 

@@ -1,0 +1,87 @@
+"""The histograms: which pixels they sample, what they make of the counts, and when they run."""
+from reference import case, numbers
+
+SAMPLED = {"CHistogram0": "", "CHistogram_III": "", "CHistogram_IV": "mAuto_Color_Enabled", "CHistogram_VII": "",
+           "CHistogram_VIII": "DigitalFlashEnabled", "CHistogram_Luma_after_Orv": "OrvelaLevelEnabled"}
+# width, height, step and the numbers of sampled columns and rows
+GRIDS = [(699, 9, 1, 698, 8), (9, 699, 1, 8, 698), (700, 100, 5, 139, 19), (2000, 30, 10, 199, 2),
+         (1001, 1001, 5, 199, 199), (1200, 60, 6, 199, 9), (1000, 20, 5, 199, 3), (30, 1403, 7, 3, 199), (2, 2, 1, 1, 1),
+         (800, 4, 5, 159, 0)]
+
+
+def grid(task, width, height, step, columns, rows):
+    """Only what lies on the grid of the samples is bright; no sample falls beside it."""
+    count = step * step * columns * rows
+    means = {"m_OriginalLumaR0": 200 if rows else 0} if task == "CHistogram0" else {
+        "m_OriginalLumaR": 200 * count // (width * height)}
+    bins = {"pHisto_Luma[100]": count, "pHisto_Red[200]": count, "pHisto_Green[100]": count, "pHisto_Blue[0]": count,
+            "pHisto_Luma[9]": 0, "pHisto_Blue[9]": 0}
+    return case(task, SAMPLED[task], f"in {width}x{height} grid {step} 200,100,0 9",
+                "stat " + numbers({**bins, **means}))
+
+
+def greys(settings, values, **expected):
+    """The pixels stand in the one sampled row."""
+    pixels = " ".join(",".join(map(str, v)) if isinstance(v, tuple) else str(v) for v in values)
+    return case(settings.split()[0], " ".join(settings.split()[1:]), f"in {len(values) + 1}x2 {pixels} 7",
+                "stat " + numbers(expected))
+
+
+def highlights(task, counts, flag, level):
+    """So many of 100 samples per channel at `level`, the others one below the highlights."""
+    columns = [",".join(str(level if x < n else 219) for n in counts) for x in range(101)]
+    return case(task, SAMPLED[task], f"in 101x2 {' '.join(columns)}", f"stat m_Histo_Light_Exception={flag}")
+
+
+def cast(task, means, flag, before=""):
+    """40000 of 40401 pixels are sampled, so a sample is one above its mean."""
+    sample = ",".join(str(m + 1 if m else 0) for m in means)
+    expected = dict(zip(("m_OriginalLumaR", "m_OriginalLumaG", "m_OriginalLumaB"), means), Bicromic=flag)
+    return case(task, f"{SAMPLED[task]} {before}", f"in 201x201 {sample}", "stat " + numbers(expected))
+
+
+def cases():
+    for size in GRIDS:
+        for task in SAMPLED:
+            yield grid(task, *size)
+
+    yield greys("CHistogram0", [230, 231, 255], WhiteCount=2)
+    yield greys("CHistogram0", [0, 19, 20], BlackCount=2)
+    # A range of 44 between the channels is a spread of 29.3, one of 45 a spread of 30.
+    yield greys("CHistogram0", [(255, 211, 240), (255, 210, 240)], WhiteCount=1)
+    yield greys("CHistogram0", [(0, 44, 10), (45, 0, 10)], BlackCount=1)
+    yield greys("CHistogram0", [0, 1, 85, 86, 170, 171, 219, 220, 255],
+                m_Dark_Acu=2 / 20, m_Middle_Acu=2 / 20, m_Light_Acu=2 / 20)
+    # Means are whole numbers: (20 + 21 + 21) / 3, 35 / 3, 62 / 3, 91 / 3.
+    yield greys("CHistogram0", [(10, 20, 30), (13, 20, 31), (12, 22, 30)], m_OriginalLuma0=20, m_OriginalLumaR0=11,
+                m_OriginalLumaG0=20, m_OriginalLumaB0=30)
+    for task in ("CHistogram_III", "CHistogram_IV mAuto_Color_Enabled"):
+        # (1 + 85 + 85) / 3, (86 + 170) / 2, (171 + 255 + 255) / 3
+        yield greys(task, [0, 1, 85, 85, 86, 170, 171, 255, 255], Dark_Ave=57, Middle_Ave=128, Light_Ave=227)
+        yield greys(task, [0, 0], Dark_Ave=0, Middle_Ave=0, Light_Ave=0)
+
+    # Highlights that lack a colour have one channel's share below half of both others'.
+    for flag, a, b, c, level in ((1, 20, 20, 5, 220), (0, 20, 20, 10, 220), (0, 20, 9, 10, 220), (0, 0, 0, 30, 220),
+                                 (0, 0, 0, 0, 220), (1, 20, 20, 5, 255), (0, 20, 20, 5, 219)):
+        for task in ("CHistogram0", "CHistogram_VIII"):
+            for counts in ((a, b, c), (c, a, b), (b, c, a)):
+                yield highlights(task, counts, flag, level)
+
+    # A cast has one mean below half (III) or a quarter (IV) of both others; VII flags all but black.
+    for low, half, quarter in ((45, 0, 0), (44, 1, 0), (23, 1, 0), (22, 1, 1)):
+        for means in ((90, 90, low), (90, low, 90), (low, 90, 90)):
+            yield cast("CHistogram_III", means, half)
+            yield cast("CHistogram_IV", means, quarter)
+    yield cast("CHistogram_III", (90, 40, 50), 0)
+    yield cast("CHistogram_IV", (88, 88, 22), 0)
+    yield cast("CHistogram_III", (50, 50, 50), 1, before="Bicromic")
+    yield cast("CHistogram_VII", (0, 0, 0), 0)
+    for means in ((1, 0, 0), (0, 90, 0), (0, 0, 9), (70, 50, 80), (90, 90, 20)):
+        yield cast("CHistogram_VII", means, 1)
+
+    for bits in range(16):
+        names = ("OrvelaLevelEnabled", "OrvelaLevel2Enabled", "Normal_Picture", "Under_Exposed_Picture")
+        settings = numbers({name: bits >> i & 1 for i, name in enumerate(names)})
+        yield case("CHistogram_Luma_after_Orv", settings, "in 9x9 5", "same" if 5 <= bits <= 7 else "skipped | writes")
+    for task in ("CHistogram_IV", "CHistogram_VIII"):
+        yield case(task, "", "in 9x9 5", "skipped", "writes")
