@@ -1,22 +1,12 @@
 #include "Filters/CGamma_Simple_Filter.h"
 
 #include "Filters/Curves/GammaCurve.h"
+#include "Filters/Curves/LevelMath.h"
 #include "Utility/Logger.h"
 
 #include <utility>
 
 using namespace orvela;
-
-namespace {
-
-float gammaAt(float position) {
-    const double v = position;
-    if (v < 500)
-        return static_cast<float>(v * 0.9 / 500 + 0.1);
-    return static_cast<float>((v - 500) * 9 / 500 + 1);
-}
-
-} // namespace
 
 bool CGamma_Simple_Filter::PreApply() {
     const CSliderParams& sliders = mParams->mSliderParams;
@@ -25,7 +15,7 @@ bool CGamma_Simple_Filter::PreApply() {
     Log::log(LogLevel::Debug, "Applying Gamma_Simple_Filter from plane at 0x%x to plane at 0x%x...",
              logAddress(mInPlane), logAddress(mOutPlane));
     Log::log(LogLevel::Debug, "CGamma_Simple_Filter Condition matched.");
-    mTable = GammaCurve::table(gammaAt(sliders.GammaCorrectionValue));
+    mTable = GammaCurve::table(LevelMath::sliderToGamma(sliders.GammaCorrectionValue));
     return true;
 }
 

@@ -60,7 +60,6 @@ protected:
     void changeEvent(QEvent* event) override;
 
 private:
-    QString shownText(double position) const;
     double stepped(double position, double delta) const;
     void forwardToSlider(QMouseEvent* event);
     void fitToFont();

@@ -1,5 +1,6 @@
 #include "Filters/IFilter.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
+#include "Settings/SettingsStore.h"
 #include "SmartAnalyzers/ISmartAnalyzer.h"
 #include "Utility/CGenericEx.h"
 #include "Utility/RowScheduler.h"
@@ -7,7 +8,6 @@
 #include "support/TestPlanes.h"
 
 #include <QDir>
-#include <QSettings>
 #include <QStringList>
 #include <QTemporaryDir>
 
@@ -167,10 +167,10 @@ TEST_F(TaskTest, RowsReportTheirPercentage) {
 TEST_F(TaskTest, DumpsAreNumberedInTheirOrder) {
     const QTemporaryDir folder;
     qputenv("TEMP", folder.path().toLocal8Bit());
-    QSettings().setValue("2000/GUI/dumpImageAfterFile", 1);
+    openSettings().setValue("2000/GUI/dumpImageAfterFile", 1);
     EXPECT_TRUE(filter.Apply());
     EXPECT_TRUE(ScriptedFilter(&params, in.get(), out.get()).Apply());
-    QSettings().remove("2000/GUI/dumpImageAfterFile");
+    openSettings().remove("2000/GUI/dumpImageAfterFile");
     qunsetenv("TEMP");
     const QStringList files = QDir(folder.path()).entryList(QDir::Files, QDir::Name);
     EXPECT_EQ(files, QStringList({"image_after_Scripted_0_4x7.raw", "image_after_Scripted_1_4x7.raw"}));

@@ -6,6 +6,7 @@
 #include "Platform/Keyboard.h"
 #include "Settings/ModeTable.h"
 #include "Settings/PresetConversion.h"
+#include "Settings/SettingsStore.h"
 #include "Utility/CGenericEx.h"
 #include "support/LogCapture.h"
 
@@ -13,7 +14,6 @@
 #include <QCheckBox>
 #include <QDir>
 #include <QMessageBox>
-#include <QSettings>
 #include <QTimer>
 
 #include <gtest/gtest.h>
@@ -25,7 +25,7 @@ namespace {
 class PresetStore : public testing::Test {
 protected:
     PresetStore() {
-        QSettings().clear();
+        openSettings().clear();
         first->setObjectName("first");
         second->setObjectName("a/b");
         picker->setObjectName("picker");
@@ -80,13 +80,13 @@ TEST_F(PresetStore, LoadsWhatWasSaved) {
     EXPECT_EQ(picker->color(), QColor(1, 2, 3, 255));
     EXPECT_EQ(signalsOfSecond.value(0), "state");
     EXPECT_EQ(signalsOfSecond.value(1), "value");
-    EXPECT_FALSE(QSettings().allKeys().join(' ').contains("CheckBoxes/Checked")) << "has no name";
+    EXPECT_FALSE(openSettings().allKeys().join(' ').contains("CheckBoxes/Checked")) << "has no name";
 }
 
 TEST_F(PresetStore, MissingPartsLeaveControlsAsTheyAre) {
     qputenv("ORVELA_DEBUG_MBOX", "1");
     ASSERT_TRUE(save("x"));
-    QSettings settings;
+    QSettings settings = openSettings();
     settings.beginGroup("2000/UserPresets/Advanced/x");
     settings.remove("ColorPickers");
     settings.remove("CheckBoxes/box");
@@ -121,10 +121,10 @@ TEST_F(PresetStore, AsksBeforeOverwriting) {
     EXPECT_FALSE(save("x"));
     EXPECT_EQ(said, "Warning|This preset already exists. Do you want to overwrite it?");
     const QString key = "2000/UserPresets/Advanced/x/Sliders/first/Value";
-    EXPECT_EQ(QSettings().value(key).toDouble(), 0);
+    EXPECT_EQ(openSettings().value(key).toDouble(), 0);
     answer(QMessageBox::Yes);
     EXPECT_TRUE(save("x") && !isNew);
-    EXPECT_EQ(QSettings().value(key).toDouble(), 700);
+    EXPECT_EQ(openSettings().value(key).toDouble(), 700);
     EXPECT_EQ(boxes([&] { EXPECT_FALSE(save("")); }), QStringList("Warning|A preset needs a name."));
     CPresetStore::removePreset(Mode_Advanced, "x");
     EXPECT_TRUE(CPresetStore::listPresets(Mode_Advanced, true).isEmpty());
@@ -132,7 +132,7 @@ TEST_F(PresetStore, AsksBeforeOverwriting) {
 }
 
 TEST_F(PresetStore, ReportsWhatCannotBeWritten) {
-    const QString path = QSettings().fileName();
+    const QString path = openSettings().fileName();
     QFile::remove(path);
     ASSERT_TRUE(QDir().mkpath(path));
     EXPECT_THROW(save("x"), CGenericEx);
@@ -177,12 +177,12 @@ TEST_F(PresetStore, FactoryPresetsAreThoseOfTheModes) {
 TEST_F(PresetStore, OneMissingFactoryPresetBringsAllBack) {
     const QString key = "2000/UserPresets/Advanced/Portrait/Sliders/sldrContrast_Perc/Value";
     CPresetStore::ensureFactoryPresets(&pane);
-    QSettings().setValue(key, 1);
+    openSettings().setValue(key, 1);
     CPresetStore::ensureFactoryPresets(&pane);
-    EXPECT_EQ(QSettings().value(key).toDouble(), 1) << "none is missing";
+    EXPECT_EQ(openSettings().value(key).toDouble(), 1) << "none is missing";
     CPresetStore::removePreset(Mode_Advanced, "AutoSaturation");
     CPresetStore::ensureFactoryPresets(&pane);
-    EXPECT_EQ(QSettings().value(key).toDouble(), 550);
+    EXPECT_EQ(openSettings().value(key).toDouble(), 550);
     EXPECT_TRUE(CPresetStore::presetExists(Mode_Advanced, "AutoSaturation"));
     EXPECT_TRUE(pane.findChildren<CWgtPaneAdvancedImpl*>().isEmpty());
 }
@@ -203,7 +203,7 @@ TEST_F(PresetStore, ShiftSwitchesBatchModeOff) {
     EXPECT_TRUE(log.has("SHIFT key state 128"));
     EXPECT_EQ(said, "Batch Mode|Batch mode is now off.");
     EXPECT_EQ(CBatchMode::instance().batchMode(), 32);
-    EXPECT_EQ(QSettings().value("2000/GUI/batchModeEnabled"), QVariant(false));
+    EXPECT_EQ(openSettings().value("2000/GUI/batchModeEnabled"), QVariant(false));
 }
 
 } // namespace

@@ -47,4 +47,16 @@ TEST(SliderTable, EverySliderReachesItsRangeAndComesBackFromEveryPosition) {
     EXPECT_TRUE(SliderTable::threeSliders(Mode_Advanced).empty());
 }
 
+// The text is the same at every tenth of a position; a filter takes the gamma as a float.
+TEST(SliderScales, GammaIsOneMapForControlsAndFilters) {
+    for (int tenth = 0; tenth <= 10000; ++tenth) {
+        const double p = tenth / 10.0;
+        const double gamma = p < 500 ? p * 0.9 / 500 + 0.1 : (p - 500) * 9 / 500 + 1;
+        EXPECT_EQ(static_cast<float>(SliderScales::gammaAt(p)), static_cast<float>(gamma)) << p;
+    }
+    EXPECT_EQ(SliderScales::Gamma.text(575), "2.3"); // 2.35 lies between two texts
+    EXPECT_EQ(SliderScales::Gamma.text(250), "0.6"); // 0.55
+    EXPECT_NEAR(SliderScales::Noise.told(250), (1.6 - 0.5) / 0.0045, 1e-9);
+}
+
 } // namespace
