@@ -115,6 +115,12 @@ void COrvelaSliderBlockImpl::setText(const QString& NewName) {
     txtValue->setAccessibleName(NewName);
 }
 
+void COrvelaSliderBlockImpl::setHelp(const QString& help) {
+    sldrValue->setToolTip(help);
+    sldrValue->setAccessibleDescription(help);
+    setWhatsThis(help);
+}
+
 // A step too small for the text to show it goes on to the text's next number.
 double COrvelaSliderBlockImpl::stepped(double position, double delta) const {
     const double target = std::clamp(position + delta, 0.0, kLastPosition);

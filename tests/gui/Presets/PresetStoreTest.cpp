@@ -158,11 +158,10 @@ TEST_F(PresetStore, FactoryPresetsAreThoseOfTheModes) {
         ASSERT_TRUE(content && content->sliders.size() == 26 && content->colors.size() == 1);
         const CSliderParams stored = PresetConversion::paramsOf(Mode_Advanced, *content);
         const CUserParamsPhotoshop factory(mode.mode);
-        for (const SliderDescription& slider : SliderTable::advanced()) {
-            SCOPED_TRACE(slider.object);
+        for (const SliderDescription& slider : SliderTable::sliders()) {
             EXPECT_EQ(stored.*slider.enabled, factory.mSliderParams.*slider.enabled);
             const float position = slider.value ? factory.mSliderParams.*slider.value : 0;
-            EXPECT_NEAR(slider.value ? stored.*slider.value : 0, position, snapping(slider, position));
+            EXPECT_NEAR(slider.value ? stored.*slider.value : 0, position, snapping(*slider.scale, position));
         }
         EXPECT_EQ(stored.mColor_Value_R + stored.mColor_Value_G + stored.mColor_Value_B, 0);
     }
@@ -172,6 +171,26 @@ TEST_F(PresetStore, FactoryPresetsAreThoseOfTheModes) {
                   EXPECT_EQ(CPresetStore::factoryPresetName(Mode_Custom), QString(QChar(0xFFFF)));
               }),
               QStringList({"Note:|Unknown preset:portrait", "Note:|Unknown preset:13"}));
+}
+
+TEST_F(PresetStore, FactoryPresetsAreWhatTheirPaneWouldSave) {
+    Shown<CWgtPaneAdvancedImpl> shown(Mode_Advanced);
+    CPresetStore::ensureFactoryPresets(&pane);
+    const auto lines = [] {
+        const QSettings settings = openSettings();
+        QStringList lines;
+        for (const QString& key : settings.allKeys())
+            lines << key + '=' + settings.value(key).toString();
+        return lines;
+    };
+    const QStringList written = lines();
+    EXPECT_EQ(written.size(), 12 * (26 * 2 + 3));
+    openSettings().clear();
+    for (const QString& name : FactoryPresets::names()) {
+        shown.pane->setSliders(name);
+        CPresetStore::savePreset(shown.pane, Mode_Advanced, name, saved, isNew, false);
+    }
+    EXPECT_EQ(lines(), written);
 }
 
 TEST_F(PresetStore, OneMissingFactoryPresetBringsAllBack) {
@@ -184,7 +203,6 @@ TEST_F(PresetStore, OneMissingFactoryPresetBringsAllBack) {
     CPresetStore::ensureFactoryPresets(&pane);
     EXPECT_EQ(openSettings().value(key).toDouble(), 550);
     EXPECT_TRUE(CPresetStore::presetExists(Mode_Advanced, "AutoSaturation"));
-    EXPECT_TRUE(pane.findChildren<CWgtPaneAdvancedImpl*>().isEmpty());
 }
 
 TEST_F(PresetStore, ShiftSwitchesBatchModeOff) {
