@@ -2,6 +2,7 @@
 # arithmetic and the sanitizers of the chosen preset.
 
 set(ORVELA_SANITIZE "" CACHE STRING "Sanitizers to build with, such as address,undefined or thread")
+option(ORVELA_WERROR "Warnings of the compiler that the checks run with are errors")
 
 add_library(orvela_options INTERFACE)
 target_compile_features(orvela_options INTERFACE cxx_std_20)
@@ -9,10 +10,17 @@ target_compile_features(orvela_options INTERFACE cxx_std_20)
 # or the floating-point exception flags; without them roots and comparisons vectorise, with the same results.
 target_compile_options(orvela_options INTERFACE -Wall -Wextra -Wpedantic -ffp-contract=off -fno-math-errno
                                                 -fno-trapping-math)
+# Another compiler knows other warnings, and they must not keep anybody from building.
+if(ORVELA_WERROR AND CMAKE_CXX_COMPILER_ID STREQUAL "GNU" AND CMAKE_CXX_COMPILER_VERSION MATCHES "^12\\.")
+    target_compile_options(orvela_options INTERFACE -Werror)
+endif()
 if(ORVELA_SANITIZE)
+    # With sanitizers the compiler finds members of std::regex that "may be used uninitialized". The release build
+    # warns of such members.
     target_compile_options(orvela_options INTERFACE -fsanitize=${ORVELA_SANITIZE} -fno-omit-frame-pointer
-                                                    -fno-sanitize-recover=all)
+                                                    -fno-sanitize-recover=all -Wno-maybe-uninitialized)
     target_link_options(orvela_options INTERFACE -fsanitize=${ORVELA_SANITIZE})
+    target_compile_definitions(orvela_options INTERFACE QT_FORCE_ASSERTS _GLIBCXX_ASSERTIONS)
 endif()
 target_compile_definitions(orvela_options INTERFACE QT_NO_KEYWORDS)
 

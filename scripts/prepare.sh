@@ -22,12 +22,12 @@ install_packages() {
             "${missing[@]}" >&2
 }
 
-# build PRESET [TARGET...]: configures when that has not been done and builds what is not up to date.
+# build PRESET [TARGET...]: configures when that has not been done with these presets, and builds what is not up to date.
 build() {
     local preset=$1 folder=$ROOT/build/$1 log=$ROOT/build/$1.log
     shift
     mkdir -p "$ROOT/build"
-    if [ ! -f "$folder/build.ninja" ]; then
+    if [ ! "$folder/build.ninja" -nt "$ROOT/CMakePresets.json" ]; then
         echo "Building Orvela ($preset); the first time takes some minutes" >&2
         (cd "$ROOT" && cmake --preset "$preset") >"$log" 2>&1 || { cat "$log" >&2; return 1; }
     fi

@@ -1,7 +1,11 @@
 #include "command/ModeNames.h"
 
+#include "Settings/PaneTable.h"
+#include "Settings/PresetConversion.h"
+
 #include <algorithm>
 #include <cctype>
+#include <cstring>
 #include <numeric>
 
 namespace orvela {
@@ -36,6 +40,14 @@ std::vector<const ModeDescription*> selectable() {
     return modes;
 }
 
+std::vector<const ModeDescription*> withPresets() {
+    std::vector<const ModeDescription*> modes;
+    for (const ModeDescription& mode : ModeTable::all())
+        if (PresetConversion::hasControls(mode.mode))
+            modes.push_back(&mode);
+    return modes;
+}
+
 std::string identifierOf(const ModeDescription& mode) {
     // The only mode whose display name belongs to another one as well.
     if (mode.mode == Mode_AutoColorFilter)
@@ -53,12 +65,28 @@ std::string plain(std::string_view name) {
     return text;
 }
 
-const ModeDescription* find(std::string_view name) {
+const ModeDescription* find(std::string_view name, const std::vector<const ModeDescription*>& modes) {
     const std::string wanted = plain(name);
-    for (const ModeDescription* mode : selectable())
+    for (const ModeDescription* mode : modes)
         if (wanted == plain(mode->displayName) || wanted == plain(identifierOf(*mode)))
             return mode;
     return nullptr;
+}
+
+std::vector<NamedSlider> slidersOf(EGUIMode mode) {
+    std::vector<NamedSlider> sliders;
+    if (const PaneSlider* single = PaneTable::single(mode))
+        sliders.push_back({"--value", single->slider});
+    for (const PaneSlider& each : PaneTable::threeSliders(mode))
+        sliders.push_back({"--" + plain(each.slider.label), each.slider});
+    return sliders;
+}
+
+std::vector<NamedSlider> finalTouchSliders() {
+    std::vector<NamedSlider> sliders;
+    for (const PaneSlider& each : PaneTable::sliders(Mode_FinalTouch))
+        sliders.push_back({each.object + std::strlen("sldr"), each.slider});
+    return sliders;
 }
 
 std::vector<std::string> nearest(std::string_view name) {

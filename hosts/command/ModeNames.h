@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Settings/ModeTable.h"
+#include "Settings/SliderTable.h"
 
 #include <string>
 #include <string_view>
@@ -8,7 +9,13 @@
 
 namespace orvela {
 
-/// The modes as the command line names them.
+/// A slider as the command line names it.
+struct NamedSlider {
+    std::string name;
+    const SliderDescription& slider;
+};
+
+/// The modes and their sliders as the command line names them.
 namespace ModeNames {
 
 /// Every mode that can be chosen by name, in the order of their numbers.
@@ -17,12 +24,22 @@ std::vector<const ModeDescription*> selectable();
 /// One word that names the mode and no other: the preset identifier, or the display name without blanks.
 std::string identifierOf(const ModeDescription& mode);
 
-/// The selectable mode with that display name or identifier. Case, blanks and punctuation do not matter; of
+/// Every mode that has presets of its own.
+std::vector<const ModeDescription*> withPresets();
+
+/// The mode of `modes` with that display name or identifier. Case, blanks and punctuation do not matter; of
 /// two modes with one display name the first is meant. Null when there is none.
-const ModeDescription* find(std::string_view name);
+const ModeDescription* find(std::string_view name,
+                            const std::vector<const ModeDescription*>& modes = selectable());
 
 /// Up to three identifiers, the nearest to `name` first.
 std::vector<std::string> nearest(std::string_view name);
+
+/// The sliders that the mode itself has, by their options: "--value" of a single one, or "--" and the label.
+std::vector<NamedSlider> slidersOf(EGUIMode mode);
+
+/// The sliders of the final touch, such as "AbsContrast".
+std::vector<NamedSlider> finalTouchSliders();
 
 /// `name` in lower case without anything but letters and digits.
 std::string plain(std::string_view name);

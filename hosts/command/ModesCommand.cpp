@@ -1,11 +1,10 @@
 #include "command/ModesCommand.h"
 
-#include "Settings/SliderTable.h"
+#include "Settings/PaneTable.h"
 #include "command/ModeNames.h"
 #include "command/TextValues.h"
 
 #include <algorithm>
-#include <cstring>
 #include <iostream>
 #include <nlohmann/json.hpp>
 
@@ -13,63 +12,48 @@ namespace orvela {
 
 namespace {
 
-// How a slider is set on the command line.
-struct NamedSlider {
-    std::string option;
-    const SliderDescription* slider;
-};
-
-std::vector<NamedSlider> slidersOf(EGUIMode mode) {
-    std::vector<NamedSlider> sliders;
-    if (const SliderDescription* slider = SliderTable::single(mode))
-        sliders.push_back({"--value", slider});
-    for (const SliderDescription& slider : SliderTable::threeSliders(mode))
-        sliders.push_back({"--" + ModeNames::plain(slider.label), &slider});
-    return sliders;
-}
-
-std::vector<NamedSlider> finalTouchSliders() {
-    std::vector<NamedSlider> sliders;
-    for (const SliderDescription& slider : SliderTable::finalTouch())
-        sliders.push_back({slider.object + std::strlen("sldr"), &slider});
-    return sliders;
-}
-
 double lowest(const SliderDescription& slider) {
-    return std::min(slider.low, slider.high);
+    return std::min(slider.scale->low(), slider.scale->high());
 }
 
 double highest(const SliderDescription& slider) {
-    return std::max(slider.low, slider.high);
+    return std::max(slider.scale->low(), slider.scale->high());
 }
 
-void printSlider(const NamedSlider& named) {
-    std::cout << "      " << named.option << "  " << named.slider->label << ", "
-              << TextValues::shortest(lowest(*named.slider)) << " to "
-              << TextValues::shortest(highest(*named.slider)) << '\n';
+void print(const std::string& option, const std::string& range, const char* help) {
+    std::cout << "      " << option << "  " << range << "\n          " << help << '\n';
+}
+
+void print(const std::vector<NamedSlider>& sliders) {
+    for (const auto& [name, slider] : sliders)
+        print(name,
+              std::string(slider.label) + ", " + TextValues::shortest(lowest(slider)) + " to " +
+                  TextValues::shortest(highest(slider)),
+              slider.help);
 }
 
 nlohmann::ordered_json describe(const std::vector<NamedSlider>& sliders) {
     auto list = nlohmann::ordered_json::array();
-    for (const NamedSlider& named : sliders)
-        list.push_back({{"option", named.option},
-                        {"label", named.slider->label},
-                        {"low", lowest(*named.slider)},
-                        {"high", highest(*named.slider)}});
+    for (const auto& [name, slider] : sliders)
+        list.push_back({{"option", name},
+                        {"label", slider.label},
+                        {"low", lowest(slider)},
+                        {"high", highest(slider)},
+                        {"help", slider.help}});
     return list;
 }
 
 void listText() {
     for (const ModeDescription* mode : ModeNames::selectable()) {
         std::cout << ModeNames::identifierOf(*mode) << ": " << mode->summary << '\n';
-        for (const NamedSlider& named : slidersOf(mode->mode))
-            printSlider(named);
-        if (mode->mode == Mode_ColorFilter)
-            std::cout << "      --colour  R,G,B, 0 to 255 each\n";
+        const std::vector<NamedSlider> sliders = ModeNames::slidersOf(mode->mode);
+        print(sliders);
+        for (const PaneColor& each : PaneTable::colors(mode->mode))
+            if (!sliders.empty())
+                print("--colour", "R,G,B, 0 to 255 each", each.color.help);
     }
     std::cout << "\nFinal touch, after any mode (--final-touch NAME=NUMBER,...):\n";
-    for (const NamedSlider& named : finalTouchSliders())
-        printSlider(named);
+    print(ModeNames::finalTouchSliders());
 }
 
 void listJson() {
@@ -79,8 +63,9 @@ void listJson() {
                          {"identifier", ModeNames::identifierOf(*mode)},
                          {"name", mode->displayName},
                          {"summary", mode->summary},
-                         {"sliders", describe(slidersOf(mode->mode))}});
-    const nlohmann::ordered_json list = {{"modes", modes}, {"finalTouch", describe(finalTouchSliders())}};
+                         {"sliders", describe(ModeNames::slidersOf(mode->mode))}});
+    const nlohmann::ordered_json list = {{"modes", modes},
+                                         {"finalTouch", describe(ModeNames::finalTouchSliders())}};
     std::cout << list.dump(2) << '\n';
 }
 

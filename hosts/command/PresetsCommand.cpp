@@ -1,14 +1,15 @@
 #include "command/PresetsCommand.h"
 
+#include "Settings/FactoryPresets.h"
 #include "Settings/PresetConversion.h"
 #include "Settings/PresetFile.h"
 #include "Utility/CGenericEx.h"
 #include "command/ModeNames.h"
+#include "command/TextValues.h"
 
 #include <QFileInfo>
 
 #include <CLI/CLI.hpp>
-#include <algorithm>
 #include <iostream>
 
 namespace orvela {
@@ -20,19 +21,16 @@ ExitStatus report(ExitStatus status, const QString& text) {
     return status;
 }
 
-// The mode whose pane the presets belong to; of two modes with one display name the first with a pane.
+// The mode whose pane the presets belong to.
 EGUIMode modeOf(const std::string& name) {
-    const std::string wanted = ModeNames::plain(name);
-    std::string known;
-    for (const ModeDescription& mode : ModeTable::all()) {
-        if (!PresetConversion::hasControls(mode.mode))
-            continue;
-        if (wanted == ModeNames::plain(mode.displayName) ||
-            wanted == ModeNames::plain(ModeNames::identifierOf(mode)))
-            return mode.mode;
-        known += (known.empty() ? "" : ", ") + ModeNames::identifierOf(mode);
-    }
-    throw UsageError("--mode: \"" + name + "\" has no presets of its own; the modes that have are " + known);
+    const auto modes = ModeNames::withPresets();
+    if (const ModeDescription* mode = ModeNames::find(name, modes))
+        return mode->mode;
+    std::vector<std::string> known;
+    for (const ModeDescription* mode : modes)
+        known.push_back(ModeNames::identifierOf(*mode));
+    throw UsageError("--mode: \"" + name + "\" has no presets of its own; the modes that have are " +
+                     TextValues::joined(known, ", "));
 }
 
 QString nameOf(const PresetsOptions& options) {
@@ -42,13 +40,6 @@ QString nameOf(const PresetsOptions& options) {
     if (name.isEmpty() || name == PresetTree::batchPresetName())
         throw UsageError("\"" + name.toStdString() + "\" cannot be the name of a preset");
     return name;
-}
-
-bool isFactoryPreset(EGUIMode mode, const QString& name) {
-    const auto modes = ModeTable::all();
-    return mode == Mode_Advanced && std::any_of(modes.begin(), modes.end(), [&](const ModeDescription& each) {
-               return each.presetName && name == QLatin1String(each.presetName);
-           });
 }
 
 ExitStatus reportMissing(EGUIMode mode, const QString& name) {
@@ -129,7 +120,7 @@ ExitStatus importPreset(const PresetsOptions& options) {
     const EGUIMode mode = modeOf(options.mode);
     const QString name = nameOf(options);
     const PresetFile preset = PresetFile::read(QString::fromStdString(options.file));
-    const bool exists = PresetTree::names(mode).contains(name) || isFactoryPreset(mode, name);
+    const bool exists = PresetTree::names(mode).contains(name) || FactoryPresets::isFactoryPreset(mode, name);
     if (exists && !options.overwrite)
         return report(
             ExitStatus::TargetTrouble,
@@ -148,7 +139,7 @@ ExitStatus importPreset(const PresetsOptions& options) {
 ExitStatus removePreset(const PresetsOptions& options) {
     const EGUIMode mode = modeOf(options.mode);
     const QString name = nameOf(options);
-    if (isFactoryPreset(mode, name))
+    if (FactoryPresets::isFactoryPreset(mode, name))
         return report(ExitStatus::PhotographFailed,
                       QStringLiteral("The current preset cannot be deleted, since it's one of the factory "
                                      "presets."));

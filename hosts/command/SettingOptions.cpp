@@ -1,13 +1,12 @@
 #include "command/SettingOptions.h"
 
+#include "Settings/PaneTable.h"
 #include "Settings/SettingFields.h"
-#include "Settings/SliderTable.h"
 #include "command/ExitStatus.h"
 #include "command/ModeNames.h"
 #include "command/TextValues.h"
 
 #include <algorithm>
-#include <cstring>
 
 namespace orvela {
 
@@ -27,47 +26,53 @@ const ModeDescription& modeFor(const SettingOptions& options) {
 // Switches the slider on at the shown number.
 void setShown(CSliderParams& sliders, const SliderDescription& slider, const std::string& option,
               const std::string& text) {
-    const double low = std::min(slider.low, slider.high);
-    const double high = std::max(slider.low, slider.high);
+    const auto [low, high] = std::minmax({slider.scale->low(), slider.scale->high()});
     const double shown = TextValues::number(option, text, low, high);
     sliders.*slider.value = static_cast<float>(std::clamp(slider.scale->toPosition(shown), 0.0, 1000.0));
     sliders.*slider.enabled = true;
 }
 
 void applyValue(CSliderParams& sliders, const ModeDescription& mode, const std::string& text) {
-    const SliderDescription* slider = SliderTable::single(mode.mode);
-    if (!slider)
+    const PaneSlider* single = PaneTable::single(mode.mode);
+    if (!single)
         throw UsageError(std::string("--value is for modes with one slider; ") + mode.displayName +
                          " is none (see `orvela modes`)");
-    setShown(sliders, *slider, std::string("--value (") + slider->label + ")", text);
+    setShown(sliders, single->slider, std::string("--value (") + single->slider.label + ")", text);
+}
+
+std::vector<std::string> namesOf(const std::vector<NamedSlider>& sliders) {
+    std::vector<std::string> names;
+    for (const NamedSlider& each : sliders)
+        names.push_back(each.name);
+    return names;
+}
+
+const SliderDescription* sliderNamed(const std::vector<NamedSlider>& sliders, const std::string& name) {
+    const auto found = std::find_if(sliders.begin(), sliders.end(),
+                                    [&name](const NamedSlider& each) { return each.name == name; });
+    return found == sliders.end() ? nullptr : &found->slider;
 }
 
 void applyLabelled(CSliderParams& sliders, const ModeDescription& mode, const std::string& label,
                    const std::string& text) {
     const std::string option = "--" + ModeNames::plain(label);
-    std::vector<std::string> known;
-    for (const SliderDescription& slider : SliderTable::threeSliders(mode.mode)) {
-        if (label == slider.label)
-            return setShown(sliders, slider, option, text);
-        known.push_back("--" + ModeNames::plain(slider.label));
-    }
-    throw UsageError(option + " is no slider of " + mode.displayName +
-                     (known.empty() ? " (see `orvela modes`)" : ", which has " + joined(known, ", ")));
+    const std::vector<NamedSlider> known = ModeNames::slidersOf(mode.mode);
+    const SliderDescription* slider = sliderNamed(known, option);
+    if (!slider)
+        throw UsageError(
+            option + " is no slider of " + mode.displayName +
+            (known.empty() ? " (see `orvela modes`)" : ", which has " + joined(namesOf(known), ", ")));
+    setShown(sliders, *slider, option, text);
 }
 
 void applyColor(CSliderParams& sliders, const std::string& text) {
     const std::vector<std::string> parts = TextValues::split(text, ',');
     if (parts.size() != 3)
         throw UsageError("--colour " + text + ": three numbers from 0 to 255 are needed, such as 0,255,0");
-    using P = CSliderParams;
-    constexpr float P::*kFilter[] = {&P::mColor_Value_R, &P::mColor_Value_G, &P::mColor_Value_B};
-    constexpr float P::*kTouch[] = {&P::mColor_Touch_Value_R, &P::mColor_Touch_Value_G,
-                                    &P::mColor_Touch_Value_B};
-    for (std::size_t i = 0; i < parts.size(); ++i) {
-        const auto component = static_cast<float>(TextValues::wholeNumber("--colour", parts[i], 0, 255));
-        sliders.*kFilter[i] = component;
-        sliders.*kTouch[i] = component;
-    }
+    for (std::size_t i = 0; i < parts.size(); ++i)
+        for (const ColorDescription& color : SliderTable::colors())
+            sliders.*color.parts[i] =
+                static_cast<float>(TextValues::wholeNumber("--colour", parts[i], 0, 255));
 }
 
 // NAME=POSITION, NAME=POSITION,on|off or, for a switch, NAME=on|off.
@@ -92,27 +97,15 @@ void applyField(CSliderParams& sliders, const std::string& text) {
     sliders.*enabled = TextValues::onOrOff("--set " + name, given.substr(comma + 1));
 }
 
-// The slider's name in options: its object name without the prefix.
-std::string touchName(const SliderDescription& slider) {
-    return slider.object + std::strlen("sldr");
-}
-
 void applyFinalTouch(CSliderParams& sliders, const std::string& text) {
+    const std::vector<NamedSlider> known = ModeNames::finalTouchSliders();
     for (const std::string& part : TextValues::split(text, ',')) {
-        auto [name, given] = TextValues::assignment("--final-touch", part);
-        // The perceptual colour filter mirrors the absolute one, which alone has fields.
-        const std::string wanted = name == "PercColorFilter" ? "AbsColorFilter" : name;
-        std::vector<std::string> known;
-        const SliderDescription* found = nullptr;
-        for (const SliderDescription& slider : SliderTable::finalTouch()) {
-            known.push_back(touchName(slider));
-            if (known.back() == wanted)
-                found = &slider;
-        }
-        if (!found)
+        const auto [name, given] = TextValues::assignment("--final-touch", part);
+        const SliderDescription* slider = sliderNamed(known, name);
+        if (!slider)
             throw UsageError("--final-touch: there is no slider \"" + name + "\"; there are " +
-                             joined(known, ", "));
-        setShown(sliders, *found, "--final-touch " + name, given);
+                             joined(namesOf(known), ", "));
+        setShown(sliders, *slider, "--final-touch " + name, given);
     }
 }
 
@@ -123,12 +116,10 @@ void checkColorIsUsed(const SettingOptions& options, const CSliderParams& slider
 }
 
 void checkSomethingIsSet(const SettingOptions& options, const ModeDescription& mode) {
-    std::vector<std::string> sliders;
-    for (const SliderDescription& slider : SliderTable::threeSliders(mode.mode))
-        sliders.push_back("--" + ModeNames::plain(slider.label));
-    if (!sliders.empty() && options.labelled.empty() && options.fields.empty() && !options.preset &&
-        !options.finalTouch)
-        throw UsageError(std::string(mode.displayName) + " needs at least one of " + joined(sliders, ", "));
+    if (!PaneTable::threeSliders(mode.mode).empty() && options.labelled.empty() && options.fields.empty() &&
+        !options.preset && !options.finalTouch)
+        throw UsageError(std::string(mode.displayName) + " needs at least one of " +
+                         joined(namesOf(ModeNames::slidersOf(mode.mode)), ", "));
 }
 
 void applyPreset(RunSettings& run, CSliderParams& sliders, const std::string& path) {
@@ -143,9 +134,9 @@ void applyPreset(RunSettings& run, CSliderParams& sliders, const std::string& pa
 std::vector<std::string> labelsOfThreeSliders() {
     std::vector<std::string> labels;
     for (const EGUIMode mode : {Mode_Adjustments, Mode_SmartLevels})
-        for (const SliderDescription& slider : SliderTable::threeSliders(mode))
-            if (std::find(labels.begin(), labels.end(), slider.label) == labels.end())
-                labels.emplace_back(slider.label);
+        for (const PaneSlider& each : PaneTable::threeSliders(mode))
+            if (std::find(labels.begin(), labels.end(), each.slider.label) == labels.end())
+                labels.emplace_back(each.slider.label);
     return labels;
 }
 
@@ -170,9 +161,9 @@ RunSettings settle(const SettingOptions& options) {
     checkColorIsUsed(options, sliders);
 
     run.preset.take(sliders);
-    run.params.mSliderParams = SettingFields::onlyFinalTouch(sliders, false);
-    run.runsFinalTouch = SettingFields::anyFinalTouchOn(sliders);
-    run.finalTouchParams.mSliderParams = SettingFields::onlyFinalTouch(sliders, true);
+    run.params.mSliderParams = SettingFields::ofStage(sliders, SettingStage::Main);
+    run.runsFinalTouch = SettingFields::anyOn(sliders, SettingStage::FinalTouch);
+    run.finalTouchParams.mSliderParams = SettingFields::ofStage(sliders, SettingStage::FinalTouch);
     return run;
 }
 

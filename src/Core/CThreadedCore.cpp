@@ -1,6 +1,8 @@
 #include "Core/CThreadedCore.h"
 
 #include "Core/Snapshot.h"
+#include "Settings/PresetTree.h"
+#include "Settings/SettingsStore.h"
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
 #include "Utility/RowScheduler.h"
@@ -29,6 +31,8 @@ void CThreadedCore::setParams(const CUserParamsPhotoshop& params) {
 
 void CThreadedCore::run() {
     const LogDepth ownDepth;
+    mContext.dumpsPictures =
+        openSettings().value(PresetTree::guiKey(QStringLiteral("dumpImageAfterFile"))).toInt() != 0;
     if (mContext.scheduler)
         mContext.scheduler->execute([this] { runAnnounced(); });
     else

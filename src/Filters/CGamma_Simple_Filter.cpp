@@ -1,19 +1,9 @@
 #include "Filters/CGamma_Simple_Filter.h"
 
 #include "Filters/Curves/GammaCurve.h"
+#include "Filters/Curves/LevelMath.h"
 
 using namespace orvela;
-
-namespace {
-
-float gammaAt(float position) {
-    const double v = position;
-    if (v < 500)
-        return static_cast<float>(v * 0.9 / 500 + 0.1);
-    return static_cast<float>((v - 500) * 9 / 500 + 1);
-}
-
-} // namespace
 
 const TaskDescription& CGamma_Simple_Filter::description() const {
     static constexpr TaskDescription kDescription = {
@@ -31,7 +21,7 @@ bool CGamma_Simple_Filter::applies() {
 }
 
 void CGamma_Simple_Filter::prepare() {
-    mTable = GammaCurve::table(gammaAt(mParams->mSliderParams.GammaCorrectionValue));
+    mTable = GammaCurve::table(LevelMath::sliderToGamma(mParams->mSliderParams.GammaCorrectionValue));
 }
 
 void CGamma_Simple_Filter::mapRow(const PixelRow& row) const {

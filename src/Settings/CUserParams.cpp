@@ -1,7 +1,7 @@
 #include "Settings/CUserParams.h"
 
 #include "Settings/ModeTable.h"
-#include "Settings/SliderTable.h"
+#include "Settings/PaneTable.h"
 #include "Utility/DebugBoxes.h"
 #include "Utility/Logger.h"
 
@@ -108,14 +108,15 @@ CUserParamsPhotoshop::CUserParamsPhotoshop(EGUIMode mode) {
         if (setting.enabled)
             mSliderParams.*setting.enabled = true;
     }
-    if (const SliderDescription* slider = SliderTable::single(mode)) {
-        mSliderParams.*slider->value = static_cast<float>(slider->initial);
-        mSliderParams.*slider->enabled = true;
-        mGenericSlider = {slider->value,
-                          QString::fromLatin1(slider->label),
-                          slider->zones,
-                          static_cast<float>(slider->low),
-                          static_cast<float>(slider->high),
-                          slider->scale};
+    if (const PaneSlider* single = PaneTable::single(mode)) {
+        const SliderDescription& slider = single->slider;
+        mSliderParams.*slider.value = static_cast<float>(single->initial);
+        mSliderParams.*slider.enabled = true;
+        mGenericSlider = {slider.value,
+                          QString::fromLatin1(slider.label),
+                          static_cast<std::int32_t>(single->zones()),
+                          static_cast<float>(slider.scale->low()),
+                          static_cast<float>(slider.scale->high()),
+                          slider.scale};
     }
 }

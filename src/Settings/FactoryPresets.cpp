@@ -1,6 +1,8 @@
 #include "Settings/FactoryPresets.h"
 
+#include "Settings/CUserParams.h"
 #include "Settings/ModeTable.h"
+#include "Settings/PresetConversion.h"
 #include "Utility/DebugBoxes.h"
 
 #include <QCoreApplication>
@@ -41,6 +43,15 @@ QStringList names() {
 
 bool isFactoryPresetName(const QString& name) {
     return names().contains(name);
+}
+
+bool isFactoryPreset(EGUIMode mode, const QString& name) {
+    return mode == Mode_Advanced && isFactoryPresetName(name);
+}
+
+PresetContent contentOf(const QString& name) {
+    const CUserParamsPhotoshop factory(factoryPresetMode(name));
+    return PresetConversion::shownContentOf(Mode_Advanced, factory.mSliderParams);
 }
 
 EGUIMode factoryPresetMode(const QString& name) {

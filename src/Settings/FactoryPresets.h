@@ -1,12 +1,11 @@
 #pragma once
 
-#include "Settings/EGUIMode.h"
-
-#include <QStringList>
+#include "Settings/PresetTree.h"
 
 namespace orvela {
 
-/// The presets that come with the program: one for each automatic mode, under the mode's identifier.
+/// The presets that come with the program: one for each automatic mode, among the presets of Advanced and
+/// under the mode's identifier.
 namespace FactoryPresets {
 
 /// True for the automatic modes, 0 to 11.
@@ -17,6 +16,13 @@ QStringList names();
 
 /// True for exactly one of the twelve names.
 bool isFactoryPresetName(const QString& name);
+
+/// True for the presets of Advanced with such a name.
+bool isFactoryPreset(EGUIMode mode, const QString& name);
+
+/// What the preset of that name holds when it comes: the settings of its mode as the controls of Advanced
+/// would have them once they took them.
+PresetContent contentOf(const QString& name);
 
 /// The mode of the factory preset of exactly that name. Any other name gives a message box and Portrait.
 EGUIMode factoryPresetMode(const QString& name);

@@ -1,47 +1,12 @@
 #include "Settings/PresetConversion.h"
 
-#include "Settings/SliderTable.h"
+#include "Settings/PaneTable.h"
 
 #include <algorithm>
 
 namespace orvela {
 
 namespace {
-
-using P = CSliderParams;
-
-// The fields of a pane's colour picker; object is null for a pane without one.
-struct Picker {
-    const char* object = nullptr;
-    float P::*red = nullptr;
-    float P::*green = nullptr;
-    float P::*blue = nullptr;
-};
-
-Picker pickerOf(EGUIMode mode) {
-    if (mode == Mode_FinalTouch)
-        return {"colrPickAbsColorFilter", &P::mColor_Touch_Value_R, &P::mColor_Touch_Value_G,
-                &P::mColor_Touch_Value_B};
-    if (mode == Mode_Advanced)
-        return {"colrPickAutoColor", &P::mColor_Value_R, &P::mColor_Value_G, &P::mColor_Value_B};
-    if (mode == Mode_ColorFilter)
-        return {"colrPickGeneric", &P::mColor_Value_R, &P::mColor_Value_G, &P::mColor_Value_B};
-    return {};
-}
-
-std::span<const SliderDescription> slidersOf(EGUIMode mode) {
-    if (mode == Mode_Advanced)
-        return SliderTable::advanced();
-    if (mode == Mode_FinalTouch)
-        return SliderTable::finalTouch();
-    if (const SliderDescription* slider = SliderTable::single(mode))
-        return {slider, 1};
-    return SliderTable::threeSliders(mode);
-}
-
-bool isMirror(const SliderDescription& slider) {
-    return !slider.value && !slider.enabled;
-}
 
 template <typename Entry>
 const Entry* find(const QList<Entry>& entries, const char* object) {
@@ -51,42 +16,68 @@ const Entry* find(const QList<Entry>& entries, const char* object) {
     return found == entries.end() ? nullptr : &*found;
 }
 
+double positionOf(const SliderDescription& slider, const CSliderParams& sliders) {
+    return slider.value ? static_cast<double>(sliders.*slider.value) : 0;
+}
+
+// Controls are set from their middle position; one whose text does not change by it keeps the exact position.
+double toldPositionOf(const SliderDescription& slider, const CSliderParams& sliders) {
+    constexpr double kMiddle = 500;
+    const double position = positionOf(slider, sliders);
+    const SliderScale& scale = *slider.scale;
+    return scale.text(position) == scale.text(kMiddle) ? position : scale.told(position);
+}
+
+using PositionOf = double (*)(const SliderDescription& slider, const CSliderParams& sliders);
+
+PresetContent content(EGUIMode mode, const CSliderParams& sliders, PositionOf position) {
+    PresetContent content;
+    for (const PaneSlider& each : PaneTable::sliders(mode))
+        if (!each.mirror)
+            content.sliders.append({QString::fromLatin1(each.object), position(each.slider, sliders),
+                                    sliders.*each.slider.enabled});
+    for (const auto& [object, color] : PaneTable::colors(mode)) {
+        const auto& [red, green, blue] = color.parts;
+        content.colors.append({QString::fromLatin1(object), static_cast<int>(sliders.*red),
+                               static_cast<int>(sliders.*green), static_cast<int>(sliders.*blue)});
+    }
+    return content;
+}
+
 } // namespace
 
 namespace PresetConversion {
 
 bool hasControls(EGUIMode mode) {
-    return !slidersOf(mode).empty();
+    return !PaneTable::sliders(mode).empty();
 }
 
 PresetContent contentOf(EGUIMode mode, const CSliderParams& sliders) {
-    PresetContent content;
-    for (const SliderDescription& slider : slidersOf(mode))
-        if (!isMirror(slider))
-            content.sliders.append({QString::fromLatin1(slider.object),
-                                    slider.value ? static_cast<double>(sliders.*slider.value) : 0,
-                                    slider.enabled && sliders.*slider.enabled});
-    if (const Picker picker = pickerOf(mode); picker.object)
-        content.colors.append({QString::fromLatin1(picker.object), static_cast<int>(sliders.*picker.red),
-                               static_cast<int>(sliders.*picker.green),
-                               static_cast<int>(sliders.*picker.blue)});
-    return content;
+    return content(mode, sliders, positionOf);
+}
+
+PresetContent shownContentOf(EGUIMode mode, const CSliderParams& sliders) {
+    return content(mode, sliders, toldPositionOf);
 }
 
 CSliderParams paramsOf(EGUIMode mode, const PresetContent& content) {
     CSliderParams sliders;
-    for (const SliderDescription& slider : slidersOf(mode)) {
-        const PresetSlider* stored = find(content.sliders, slider.object);
-        if (stored && slider.value)
-            sliders.*slider.value = static_cast<float>(std::clamp(stored->value, 0.0, 1000.0));
-        if (stored && slider.enabled)
-            sliders.*slider.enabled = stored->enabled;
+    for (const PaneSlider& each : PaneTable::sliders(mode)) {
+        const PresetSlider* stored = each.mirror ? nullptr : find(content.sliders, each.object);
+        if (!stored)
+            continue;
+        if (each.slider.value)
+            sliders.*each.slider.value = static_cast<float>(std::clamp(stored->value, 0.0, 1000.0));
+        sliders.*each.slider.enabled = stored->enabled;
     }
-    const Picker picker = pickerOf(mode);
-    if (const PresetColor* stored = picker.object ? find(content.colors, picker.object) : nullptr) {
-        sliders.*picker.red = static_cast<float>(stored->red);
-        sliders.*picker.green = static_cast<float>(stored->green);
-        sliders.*picker.blue = static_cast<float>(stored->blue);
+    for (const auto& [object, color] : PaneTable::colors(mode)) {
+        const PresetColor* stored = find(content.colors, object);
+        if (!stored)
+            continue;
+        const auto& [red, green, blue] = color.parts;
+        sliders.*red = static_cast<float>(stored->red);
+        sliders.*green = static_cast<float>(stored->green);
+        sliders.*blue = static_cast<float>(stored->blue);
     }
     return sliders;
 }

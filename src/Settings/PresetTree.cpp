@@ -1,9 +1,9 @@
 #include "Settings/PresetTree.h"
 
+#include "Settings/SettingsStore.h"
 #include "Utility/CGenericEx.h"
 
 #include <QRegularExpression>
-#include <QSettings>
 
 #include <algorithm>
 #include <cmath>
@@ -115,7 +115,7 @@ QStringList names(EGUIMode mode) {
     const QString group = groupOf(mode);
     if (group.isEmpty())
         return {};
-    QSettings settings;
+    QSettings settings = openSettings();
     settings.beginGroup(group);
     QStringList names = settings.childGroups();
     std::transform(names.begin(), names.end(), names.begin(), nameOf);
@@ -123,13 +123,13 @@ QStringList names(EGUIMode mode) {
 }
 
 bool hasPresets() {
-    QSettings settings;
+    QSettings settings = openSettings();
     settings.beginGroup(kPresets);
     return !settings.childGroups().isEmpty();
 }
 
 std::optional<PresetContent> read(EGUIMode mode, const QString& name) {
-    QSettings settings; // kept open, so that the file is read once
+    QSettings settings = openSettings(); // kept open, so that the file is read once
     if (!names(mode).contains(name))
         return std::nullopt;
     settings.beginGroup(groupOf(mode, name));

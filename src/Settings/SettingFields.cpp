@@ -1,52 +1,65 @@
 #include "Settings/SettingFields.h"
 
-#include "Settings/SliderTable.h"
-
 #include <algorithm>
 
 namespace orvela {
 
-namespace SettingFields {
+namespace {
 
-const SliderField* find(std::string_view name) {
-    const auto fields = sliderFields();
-    const auto found = std::find_if(fields.begin(), fields.end(),
-                                    [name](const SliderField& each) { return each.name == name; });
-    return found == fields.end() ? nullptr : &*found;
+// The first of `entries` that holds; null when none does.
+template <typename Entry, typename Holds>
+const Entry* firstOf(std::span<const Entry> entries, Holds holds) {
+    const auto found = std::find_if(entries.begin(), entries.end(), holds);
+    return found == entries.end() ? nullptr : &*found;
 }
 
-float highest(const SliderField& field) {
-    using P = CSliderParams;
-    static constexpr float P::*kColors[] = {&P::mColor_Value_R,       &P::mColor_Value_G,
-                                            &P::mColor_Value_B,       &P::mColor_Touch_Value_R,
-                                            &P::mColor_Touch_Value_G, &P::mColor_Touch_Value_B};
-    return std::find(std::begin(kColors), std::end(kColors), field.value) == std::end(kColors) ? 1000.0F
-                                                                                               : 255.0F;
-}
-
-bool CSliderParams::*switchOf(const SliderField& field) {
-    for (const auto sliders : {SliderTable::advanced(), SliderTable::finalTouch()})
-        for (const SliderDescription& slider : sliders)
-            if (field.value && slider.value == field.value)
-                return slider.enabled;
-    return nullptr;
-}
-
-bool isFinalTouch(const SliderField& field) {
-    return std::string_view(field.name).find("_Touch_") != std::string_view::npos;
-}
-
-bool anyFinalTouchOn(const CSliderParams& sliders) {
-    const auto slidersOfStage = SliderTable::finalTouch();
-    return std::any_of(slidersOfStage.begin(), slidersOfStage.end(), [&](const SliderDescription& slider) {
-        return slider.enabled && sliders.*slider.enabled;
+const SliderDescription* sliderOf(const SliderField& field) {
+    return firstOf(SliderTable::sliders(), [&field](const SliderDescription& each) {
+        return field.value ? each.value == field.value : each.enabled == field.flag;
     });
 }
 
-CSliderParams onlyFinalTouch(const CSliderParams& sliders, bool finalTouch) {
+const ColorDescription* colorOf(const SliderField& field) {
+    return firstOf(SliderTable::colors(), [&field](const ColorDescription& each) {
+        return std::find(each.parts.begin(), each.parts.end(), field.value) != each.parts.end();
+    });
+}
+
+} // namespace
+
+namespace SettingFields {
+
+const SliderField* find(std::string_view name) {
+    return firstOf(sliderFields(), [name](const SliderField& each) { return each.name == name; });
+}
+
+float highest(const SliderField& field) {
+    return colorOf(field) ? 255.0F : 1000.0F;
+}
+
+bool CSliderParams::*switchOf(const SliderField& field) {
+    const SliderDescription* slider = field.value ? sliderOf(field) : nullptr;
+    return slider ? slider->enabled : nullptr;
+}
+
+SettingStage stageOf(const SliderField& field) {
+    if (const SliderDescription* slider = sliderOf(field))
+        return slider->stage;
+    const ColorDescription* color = colorOf(field);
+    return color ? color->stage : SettingStage::Main;
+}
+
+bool anyOn(const CSliderParams& sliders, SettingStage stage) {
+    const auto isOn = [&](const SliderDescription& slider) {
+        return slider.stage == stage && sliders.*slider.enabled;
+    };
+    return firstOf(SliderTable::sliders(), isOn) != nullptr;
+}
+
+CSliderParams ofStage(const CSliderParams& sliders, SettingStage stage) {
     CSliderParams kept;
     for (const SliderField& field : sliderFields()) {
-        if (isFinalTouch(field) != finalTouch)
+        if (stageOf(field) != stage)
             continue;
         if (field.value)
             kept.*field.value = sliders.*field.value;

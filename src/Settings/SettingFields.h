@@ -1,31 +1,32 @@
 #pragma once
 
-#include "Settings/CSliderParams.h"
+#include "Settings/SliderTable.h"
 
 #include <string_view>
 
 namespace orvela {
 
-/// What the outside may know of the fields of CSliderParams: their names, ranges and switches.
+/// What the outside may know of the fields of CSliderParams: their names, ranges, switches and stages, all by
+/// the sliders and colours that drive them.
 namespace SettingFields {
 
 /// The field of that exact name; null when there is none.
 const SliderField* find(std::string_view name);
 
-/// Largest value of a value field: 255 for a picker colour, 1000 for a position. The smallest is 0.
+/// Largest value of a value field: 255 for a part of a colour, 1000 for a position. The smallest is 0.
 float highest(const SliderField& field);
 
-/// The switch that turns the slider of a value field on; null for picker colours and flags.
+/// The switch that turns the slider of a value field on; null for parts of colours and flags.
 bool CSliderParams::*switchOf(const SliderField& field);
 
-/// True for the fields that the final-touch stage reads.
-bool isFinalTouch(const SliderField& field);
+/// The stage that reads the field. The fields that nothing drives and nothing reads count to the main one.
+SettingStage stageOf(const SliderField& field);
 
-/// True when a slider of the final-touch stage is on.
-bool anyFinalTouchOn(const CSliderParams& sliders);
+/// True when a slider of the stage is on.
+bool anyOn(const CSliderParams& sliders, SettingStage stage);
 
-/// `sliders` with only the fields of the final-touch stage (or only the others) kept, the rest 0 and off.
-CSliderParams onlyFinalTouch(const CSliderParams& sliders, bool finalTouch);
+/// `sliders` with only the fields of the stage kept, the rest 0 and off.
+CSliderParams ofStage(const CSliderParams& sliders, SettingStage stage);
 
 } // namespace SettingFields
 

@@ -1,12 +1,12 @@
 #include "Settings/SettingsEdit.h"
 
+#include "Settings/SettingsStore.h"
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
 
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
-#include <QSettings>
 #include <QTemporaryFile>
 
 #include <algorithm>
@@ -103,11 +103,11 @@ void apply(QSettings& settings, const Changes& changes) {
 void SettingsEdit::commit() const {
     // Reading everything once has every complaint about the file made to this object, so that the status of
     // the other tells of the writing alone.
-    const QSettings reader;
+    const QSettings reader = openSettings();
     keepForeignFile(reader.fileName());
     checkRoom(reader.fileName(), mChanges);
     const Changes before = valuesBefore(reader, mChanges);
-    QSettings writer;
+    QSettings writer = openSettings();
     apply(writer, mChanges);
     writer.sync();
     if (writer.status() == QSettings::NoError)

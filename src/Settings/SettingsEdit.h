@@ -8,8 +8,7 @@
 
 namespace orvela {
 
-/// A change of the settings store that is made whole or not at all. The store is the one of the organisation
-/// and application names; it is opened for the change only.
+/// A change of the settings store that is made whole or not at all. The store is opened for the change only.
 class SettingsEdit {
 public:
     /// Will write `value` under `key`.

@@ -1,14 +1,36 @@
 #pragma once
 
+#include <QString>
+
 namespace orvela {
 
 /// The two-way map between a slider's position (0 to 1000) and the number shown for it.
 struct SliderScale {
     double (*toShown)(double position);
     double (*toPosition)(double shown);
+
+    /// The shown number at position 0; above high() on a scale that runs down.
+    double low() const { return toShown(0); }
+    /// The shown number at position 1000.
+    double high() const { return toShown(1000); }
+
+    /// What stands beside a slider at `position`.
+    QString text(double position) const;
+    /// The position that this text tells, where a slider comes to stand that is put to `position`.
+    double told(double position) const;
 };
 
 namespace SliderScales {
+
+/// Decimals of the numbers that stand beside sliders.
+inline constexpr int kDecimals = 1;
+
+/// A shown number as it stands beside a slider.
+QString textOf(double shown);
+
+/// The gamma of a position, for controls and filters alike: 0.1 at 0, 1 at 500, 10 at 1000, linear in
+/// between.
+double gammaAt(double position);
 
 extern const SliderScale Tenth;       ///< 0 to 100
 extern const SliderScale Hundredth;   ///< 0 to 10

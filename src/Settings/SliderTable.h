@@ -1,55 +1,65 @@
 #pragma once
 
 #include "Settings/CSliderParams.h"
-#include "Settings/EGUIMode.h"
 #include "Settings/SliderScale.h"
 
+#include <array>
+#include <cstdint>
 #include <span>
 
 namespace orvela {
 
-/// Where a slider stands in its pane.
-enum class SliderGroup {
-    Lighting,
-    Perceptual,
-    Absolute,
-    Color,
-    Artefacts,
-    Texture,
-    Global,
-    Levels,
-    LightAndColor,
-    Single
+/// The stage of a run that reads a setting.
+enum class SettingStage { Main, FinalTouch };
+
+/// The sets of track colours that tell mild from strong and extreme positions.
+enum class ZoneSet : std::int32_t {
+    Standard = 1,          ///< mild, from 600 on strong, from 900 on extreme
+    CentredWide = 2,       ///< mild in the middle and far above it
+    NeutralLight = 3,      ///< one light colour
+    Neutral = 4,           ///< one colour
+    CentredFinal = 5,      ///< mild in the middle and above it
+    Sharpness = 6,         ///< mild, from 695 on strong, from 865 on extreme
+    Illumination = 7,      ///< mild, from 750 on strong
+    Strength = 8,          ///< mild, from 700 on strong
+    Blur = 9,              ///< mild, from 300 on strong, from 500 on extreme
+    Fade = 10,             ///< extreme, from 350 on strong, from 500 on mild
+    NeutralSingle = 11,    ///< as Neutral, in the modes with one slider
+    CentredGamma = 12,     ///< mild in the middle
+    CentredFinalPale = 13, ///< as CentredFinal, strong ones paler
 };
 
-/// One slider, described once for the panes, the command line, presets and help.
+/// One slider, described once: panes, command line, presets and help go by this.
 struct SliderDescription {
-    const char* object;           ///< object name of the control
+    float CSliderParams::*value;  ///< field that holds the position; null when only the state counts
+    bool CSliderParams::*enabled; ///< field that holds the on/off state; no two sliders share one
     const char* label;            ///< text shown beside it
-    SliderGroup group;            ///< group box of its pane
     const SliderScale* scale;     ///< position and shown number
-    double low;                   ///< shown number at position 0
-    double high;                  ///< shown number at position 1000
-    float CSliderParams::*value;  ///< field that holds the position; null when the position is not used
-    bool CSliderParams::*enabled; ///< field that holds the on/off state
-    int zones;                    ///< number of the set of track colours, 1 to 13
-    double initial;               ///< position before a preset or the user sets one
+    SettingStage stage;
+    ZoneSet zones;
+    const char* help; ///< what it does and which end does what, in one sentence
+};
+
+/// One colour that is picked, described once.
+struct ColorDescription {
+    std::array<float CSliderParams::*, 3> parts; ///< fields that hold red, green and blue, 0 to 255 each
+    SettingStage stage;
+    const char* help; ///< what it does, in one sentence
 };
 
 namespace SliderTable {
 
-/// The 26 sliders of the Advanced pane, in the order in which they are set up.
-std::span<const SliderDescription> advanced();
+/// Every slider, those of the main stage first.
+std::span<const SliderDescription> sliders();
 
-/// The sliders of the Final Touch pane, the mirrored perceptual colour filter last (it has no fields of its
-/// own).
-std::span<const SliderDescription> finalTouch();
+/// The slider with that switch. @throws std::out_of_range
+const SliderDescription& slider(bool CSliderParams::*enabled);
 
-/// The three sliders of Smart Levels or Adjustments; empty for any other mode.
-std::span<const SliderDescription> threeSliders(EGUIMode mode);
+/// The colour of each stage.
+std::span<const ColorDescription> colors();
 
-/// The slider of a single-filter mode (17 to 30); null for any other mode.
-const SliderDescription* single(EGUIMode mode);
+/// The colour of the stage.
+const ColorDescription& color(SettingStage stage);
 
 } // namespace SliderTable
 

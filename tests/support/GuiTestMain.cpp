@@ -1,3 +1,5 @@
+#include "Settings/SettingsStore.h"
+
 #include <QApplication>
 #include <QRegularExpression>
 #include <QStringList>
@@ -34,6 +36,7 @@ int main(int argc, char** argv) {
     QApplication application(argc, argv);
     QCoreApplication::setOrganizationName(QStringLiteral("Kestrand"));
     QCoreApplication::setApplicationName(QStringLiteral("OrvelaGuiTests"));
+    orvela::setSettingsApplication(QStringLiteral("OrvelaGuiTests"));
     testing::UnitTest::GetInstance()->listeners().Append(new WarningListener);
     return RUN_ALL_TESTS();
 }

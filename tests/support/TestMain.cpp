@@ -1,3 +1,5 @@
+#include "Settings/SettingsStore.h"
+
 #include <QCoreApplication>
 #include <QTemporaryDir>
 
@@ -10,5 +12,6 @@ int main(int argc, char** argv) {
     QCoreApplication application(argc, argv);
     QCoreApplication::setOrganizationName(QStringLiteral("Kestrand"));
     QCoreApplication::setApplicationName(QStringLiteral("OrvelaTests"));
+    orvela::setSettingsApplication(QStringLiteral("OrvelaTests"));
     return RUN_ALL_TESTS();
 }

@@ -1,6 +1,7 @@
 #include "Filters/Curves/LevelMath.h"
 
 #include "Filters/Curves/GammaCurve.h"
+#include "Settings/SliderScale.h"
 
 #include <cmath>
 
@@ -55,8 +56,7 @@ void MoveTables::apply(const PixelRow& row) const {
 }
 
 float sliderToGamma(float position) {
-    const double v = position;
-    return static_cast<float>(v >= 500 ? (v - 500) * 9 / 500 + 1 : v * 0.9 / 500 + 0.1);
+    return static_cast<float>(SliderScales::gammaAt(position));
 }
 
 float gammaRatio(float mean, float gamma) {

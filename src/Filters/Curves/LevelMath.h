@@ -77,7 +77,7 @@ private:
     std::array<std::size_t, 3> mOfChannel = {}; ///< each channel's table
 };
 
-/// The gamma of an absolute midtone slider: 0.1 at position 0, 1 at 500, 10 at 1000.
+/// The gamma of a slider (see SliderScales::gammaAt), as a float.
 float sliderToGamma(float position);
 
 /// How much a gamma brightens the mean: the transfer of its whole part divided by it. Exactly 1 for gamma 1

@@ -14,7 +14,6 @@ using namespace orvela;
 namespace {
 
 constexpr double kLastPosition = 1000;
-constexpr int kDecimals = 1;
 constexpr double kTextStep = 0.1; // the smallest difference that the text shows
 
 double same(double value) {
@@ -25,15 +24,11 @@ int mixed(int text, int base) {
     return (3 * text + 2 * base) / 5;
 }
 
-QString shown(double value) {
-    return QString::number(value, 'f', kDecimals);
-}
-
 } // namespace
 
 COrvelaSliderBlockImpl::COrvelaSliderBlockImpl(QWidget* parent)
     : QWidget(parent), mScale{same, same},
-      mValidator(new CDoubleValidator_FixUp(0, kLastPosition, kDecimals, this)) {
+      mValidator(new CDoubleValidator_FixUp(0, kLastPosition, SliderScales::kDecimals, this)) {
     installControlAccessibility();
     setupUi(this);
     txtValue->setValidator(mValidator);
@@ -61,7 +56,7 @@ void COrvelaSliderBlockImpl::setZoneStops(const QList<ZoneStop>& stops) {
 }
 
 void COrvelaSliderBlockImpl::on_sldrValue_valueChanged(double position) {
-    txtValue->setText(shownText(position));
+    txtValue->setText(mScale.text(position));
     if (!sldrValue->isDragging())
         Q_EMIT valueChanged(position);
 }
@@ -94,12 +89,12 @@ void COrvelaSliderBlockImpl::setMinMax(double newMin, double newMax) {
 
 void COrvelaSliderBlockImpl::setVirtualValue(double NewVal) {
     sldrValue->setValue(mScale.toPosition(NewVal));
-    txtValue->setText(shown(NewVal));
+    txtValue->setText(SliderScales::textOf(NewVal));
 }
 
 void COrvelaSliderBlockImpl::setValue(double NewVal) {
     sldrValue->setValue(NewVal);
-    txtValue->setText(shownText(NewVal));
+    txtValue->setText(mScale.text(NewVal));
 }
 
 void COrvelaSliderBlockImpl::setEnabled(bool isEnabled) {
@@ -120,14 +115,16 @@ void COrvelaSliderBlockImpl::setText(const QString& NewName) {
     txtValue->setAccessibleName(NewName);
 }
 
-QString COrvelaSliderBlockImpl::shownText(double position) const {
-    return shown(mScale.toShown(position));
+void COrvelaSliderBlockImpl::setHelp(const QString& help) {
+    sldrValue->setToolTip(help);
+    sldrValue->setAccessibleDescription(help);
+    setWhatsThis(help);
 }
 
 // A step too small for the text to show it goes on to the text's next number.
 double COrvelaSliderBlockImpl::stepped(double position, double delta) const {
     const double target = std::clamp(position + delta, 0.0, kLastPosition);
-    if (shownText(target) != shownText(position))
+    if (mScale.text(target) != mScale.text(position))
         return target;
     const double from = mScale.toShown(position);
     const double step = mScale.toShown(target) < from ? -kTextStep : kTextStep;

@@ -44,6 +44,9 @@ public Q_SLOTS:
     void setEnabled(bool isEnabled);
     /// Names the setting.
     void setText(const QString& NewName);
+    /// Says what the setting does: the slider's tool tip, the help on the whole row, the description for
+    /// screen readers.
+    void setHelp(const QString& help);
 
 Q_SIGNALS:
     /// The position changed and the slider is not being dragged.
@@ -60,7 +63,6 @@ protected:
     void changeEvent(QEvent* event) override;
 
 private:
-    QString shownText(double position) const;
     double stepped(double position, double delta) const;
     void forwardToSlider(QMouseEvent* event);
     void fitToFont();

@@ -12,17 +12,17 @@ CWgtPane3SlidersImpl::CWgtPane3SlidersImpl(QWidget* owner, EGUIMode mode) : IWgt
 }
 
 void CWgtPane3SlidersImpl::doSetSliders(const QString&) {
-    const auto sliders = SliderTable::threeSliders(mode());
-    for (const SliderDescription& slider : sliders) {
-        setUpSlider(slider, false, slider.initial);
-        Log::log(LogLevel::Debug, "SETUP_SLIDER_WITH_DEFVALUE%s", slider.label);
+    const auto sliders = PaneTable::threeSliders(mode());
+    for (const PaneSlider& each : sliders) {
+        setUpSlider(each, false, each.initial);
+        Log::log(LogLevel::Debug, "SETUP_SLIDER_WITH_DEFVALUE%s", each.slider.label);
     }
     if (sliders.empty())
         DebugBoxes::warningBox(window(), tr("Note:"), tr("invalid mode in CWgtPane3SlidersImpl::setSliders"));
 }
 
 void CWgtPane3SlidersImpl::applyGUIParams(CUserParams& params) {
-    const auto sliders = SliderTable::threeSliders(mode());
+    const auto sliders = PaneTable::threeSliders(mode());
     writeSliders(sliders, params.mSliderParams);
     if (!sliders.empty())
         return;

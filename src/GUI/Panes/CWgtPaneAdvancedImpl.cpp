@@ -10,21 +10,21 @@ CWgtPaneAdvancedImpl::CWgtPaneAdvancedImpl(QWidget* owner, EGUIMode mode) : IWgt
     mShowsPresets = true;
     setupUi(this);
     sldrAutoContrast->hide();
-    setUpSliders(SliderTable::advanced(), CSliderParams());
+    setUpSliders(PaneTable::sliders(Mode_Advanced), CSliderParams());
     setUpColorPicker(colrPickAutoColor, sldrColorFilter);
     extendSettings(false);
 }
 
 void CWgtPaneAdvancedImpl::doSetSliders(const QString& presetName) {
     const CUserParamsPhotoshop factory(FactoryPresets::factoryPresetMode(presetName));
-    setUpSliders(SliderTable::advanced(), factory.mSliderParams);
-    colrPickAutoColor->setColor(filterColor(factory.mSliderParams));
+    setUpSliders(PaneTable::sliders(Mode_Advanced), factory.mSliderParams);
+    showColors(PaneTable::colors(Mode_Advanced), factory.mSliderParams);
 }
 
 void CWgtPaneAdvancedImpl::applyGUIParams(CUserParams& params) {
     CSliderParams& settings = params.mSliderParams;
-    writeSliders(SliderTable::advanced(), settings);
-    writeColor(colrPickAutoColor, settings.mColor_Value_R, settings.mColor_Value_G, settings.mColor_Value_B);
+    writeSliders(PaneTable::sliders(Mode_Advanced), settings);
+    writeColors(PaneTable::colors(Mode_Advanced), settings);
     Log::log(LogLevel::Debug, "CWgtPaneAdvancedImpl::applyGUIParams");
     params.list(QStringLiteral("CWgtPaneAdvancedImpl::applyGUIParams"));
     Log::log(LogLevel::Debug, "CWgtPaneAdvancedImpl::applyGUIParams finished.");

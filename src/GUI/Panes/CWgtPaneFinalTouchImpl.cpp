@@ -51,15 +51,14 @@ void CWgtPaneFinalTouchImpl::mirrorColorFilters() {
 }
 
 void CWgtPaneFinalTouchImpl::doSetSliders(const QString&) {
-    for (const SliderDescription& slider : SliderTable::finalTouch())
+    for (const PaneSlider& slider : PaneTable::sliders(Mode_FinalTouch))
         setUpSlider(slider, false, slider.initial);
 }
 
 void CWgtPaneFinalTouchImpl::applyGUIParams(CUserParams& params) {
     CSliderParams& settings = params.mSliderParams;
-    writeSliders(SliderTable::finalTouch(), settings);
-    writeColor(colrPickAbsColorFilter, settings.mColor_Touch_Value_R, settings.mColor_Touch_Value_G,
-               settings.mColor_Touch_Value_B);
+    writeSliders(PaneTable::sliders(Mode_FinalTouch), settings);
+    writeColors(PaneTable::colors(Mode_FinalTouch), settings);
     Log::log(LogLevel::Debug, "TMP: params.mSliderParams.mColor_Touch_Enabled %d.",
              settings.mColor_Touch_Enabled);
 }

@@ -12,31 +12,30 @@ constexpr int kSliderWidth = 240; // pixels
 } // namespace
 
 CWgtPaneGenericImpl::CWgtPaneGenericImpl(QWidget* owner, EGUIMode mode)
-    : IWgtPane(owner, mode), mSlider(SliderTable::single(mode)) {
+    : IWgtPane(owner, mode), mSlider(PaneTable::single(mode)) {
     setupUi(this);
     sldrGeneric->setFixedWidth(kSliderWidth);
     const CUserParamsPhotoshop factory(mode);
     if (mSlider)
         setUpSliders({mSlider, 1}, factory.mSliderParams);
-    if (mode == Mode_ColorFilter)
-        addColorPicker(factory.mSliderParams);
+    for (const PaneColor& color : PaneTable::colors(mode))
+        addColorPicker(color.object);
+    showColors(PaneTable::colors(mode), factory.mSliderParams);
 }
 
-void CWgtPaneGenericImpl::addColorPicker(const CSliderParams& settings) {
-    mPicker = new CColorPicker(this);
-    mPicker->setObjectName(QStringLiteral("colrPickGeneric"));
-    mPicker->setAccessibleName(tr(mSlider->label));
-    setUpColorPicker(mPicker, sldrGeneric);
-    mPicker->setColor(filterColor(settings));
-    verticalLayout->insertWidget(1, mPicker, 0, Qt::AlignRight);
+void CWgtPaneGenericImpl::addColorPicker(const char* object) {
+    auto* picker = new CColorPicker(this);
+    picker->setObjectName(QLatin1String(object));
+    picker->setAccessibleName(tr(mSlider->slider.label));
+    setUpColorPicker(picker, sldrGeneric);
+    verticalLayout->insertWidget(1, picker, 0, Qt::AlignRight);
 }
 
 void CWgtPaneGenericImpl::applyGUIParams(CUserParams& params) {
     CSliderParams& settings = params.mSliderParams;
     if (mSlider)
-        settings.*mSlider->value = static_cast<float>(sldrGeneric->value());
-    if (mPicker)
-        writeColor(mPicker, settings.mColor_Value_R, settings.mColor_Value_G, settings.mColor_Value_B);
+        settings.*mSlider->slider.value = static_cast<float>(sldrGeneric->value());
+    writeColors(PaneTable::colors(mode()), settings);
 }
 
 CThreadedCore* CWgtPaneGenericImpl::createCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* owner) {

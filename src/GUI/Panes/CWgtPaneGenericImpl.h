@@ -16,8 +16,7 @@ public:
     CThreadedCore* createCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* owner) override;
 
 private:
-    void addColorPicker(const CSliderParams& settings);
+    void addColorPicker(const char* object);
 
-    const orvela::SliderDescription* mSlider;
-    CColorPicker* mPicker = nullptr;
+    const orvela::PaneSlider* mSlider;
 };

@@ -35,8 +35,14 @@ void IWgtPane::resetSliders() {
     }
 }
 
-COrvelaSliderBlockImpl* IWgtPane::block(const SliderDescription& slider) const {
+COrvelaSliderBlockImpl* IWgtPane::block(const PaneSlider& slider) const {
     auto* found = findChild<COrvelaSliderBlockImpl*>(QLatin1String(slider.object));
+    Q_ASSERT(found);
+    return found;
+}
+
+CColorPicker* IWgtPane::picker(const PaneColor& color) const {
+    auto* found = findChild<CColorPicker*>(QLatin1String(color.object));
     Q_ASSERT(found);
     return found;
 }
@@ -48,26 +54,26 @@ void IWgtPane::setUpSlider(COrvelaSliderBlockImpl* block, const QString& label) 
     connect(block, SIGNAL(stateChanged(bool)), mOwner, SLOT(onMy_slider_stateChanged(bool)));
 }
 
-void IWgtPane::setUpSlider(const SliderDescription& slider, bool on, double position) {
+void IWgtPane::setUpSlider(const PaneSlider& slider, bool on, double position) {
+    const auto& [value, enabled, label, scale, stage, zones, help] = slider.slider;
     COrvelaSliderBlockImpl* control = block(slider);
-    const QString label = tr(slider.label);
-    setUpSlider(control, label);
-    control->setToolTip(label);
-    control->sldrValue->setToolTip(label);
-    if (const QList<ZoneStop> zones = TrackZones::set(slider.zones); !zones.isEmpty())
-        control->setZoneStops(zones);
+    setUpSlider(control, tr(label));
+    control->setToolTip(tr(label));
+    control->setHelp(tr(help));
+    control->setZoneStops(TrackZones::set(slider.zones()));
     control->setEnabled(on);
-    control->setScale(*slider.scale);
-    control->setMinMax(slider.low, slider.high);
+    control->setScale(*scale);
+    control->setMinMax(scale->low(), scale->high());
     control->setValue(position);
-    Log::log(LogLevel::Debug, "%s", slider.label);
+    Log::log(LogLevel::Debug, "%s", label);
     Log::log(LogLevel::Debug, "Enabled:%d", on);
-    Log::log(LogLevel::Debug, "Range:[%.2f,%.2f] Default:%.2f", slider.low, slider.high, slider.initial);
+    Log::log(LogLevel::Debug, "Range:[%.2f,%.2f] Default:%.2f", scale->low(), scale->high(), slider.initial);
 }
 
-void IWgtPane::setUpSliders(std::span<const SliderDescription> sliders, const CSliderParams& settings) {
-    for (const SliderDescription& slider : sliders)
-        setUpSlider(slider, settings.*slider.enabled, slider.value ? settings.*slider.value : slider.initial);
+void IWgtPane::setUpSliders(std::span<const PaneSlider> sliders, const CSliderParams& settings) {
+    for (const PaneSlider& each : sliders)
+        setUpSlider(each, settings.*each.slider.enabled,
+                    each.slider.value ? settings.*each.slider.value : each.initial);
 }
 
 void IWgtPane::setUpColorPicker(CColorPicker* picker, COrvelaSliderBlockImpl* slider) {
@@ -76,25 +82,32 @@ void IWgtPane::setUpColorPicker(CColorPicker* picker, COrvelaSliderBlockImpl* sl
     picker->setVisible(slider->isEnabled());
 }
 
-void IWgtPane::writeSliders(std::span<const SliderDescription> sliders, CSliderParams& settings) const {
-    for (const SliderDescription& slider : sliders) {
-        const COrvelaSliderBlockImpl* control = block(slider);
-        if (slider.value)
-            settings.*slider.value = static_cast<float>(control->value());
-        if (slider.enabled)
-            settings.*slider.enabled = control->isEnabled();
+void IWgtPane::showColors(std::span<const PaneColor> colors, const CSliderParams& settings) {
+    for (const PaneColor& each : colors) {
+        const auto& [red, green, blue] = each.color.parts;
+        picker(each)->setColor(QColor(int(settings.*red), int(settings.*green), int(settings.*blue)));
     }
 }
 
-QColor IWgtPane::filterColor(const CSliderParams& settings) {
-    return QColor(int(settings.mColor_Value_R), int(settings.mColor_Value_G), int(settings.mColor_Value_B));
+void IWgtPane::writeSliders(std::span<const PaneSlider> sliders, CSliderParams& settings) const {
+    for (const PaneSlider& each : sliders) {
+        if (each.mirror)
+            continue;
+        const COrvelaSliderBlockImpl* control = block(each);
+        if (each.slider.value)
+            settings.*each.slider.value = static_cast<float>(control->value());
+        settings.*each.slider.enabled = control->isEnabled();
+    }
 }
 
-void IWgtPane::writeColor(const CColorPicker* picker, float& red, float& green, float& blue) {
-    const QColor color = picker->color();
-    red = static_cast<float>(color.red());
-    green = static_cast<float>(color.green());
-    blue = static_cast<float>(color.blue());
+void IWgtPane::writeColors(std::span<const PaneColor> colors, CSliderParams& settings) const {
+    for (const PaneColor& each : colors) {
+        const QColor color = picker(each)->color();
+        const auto& [red, green, blue] = each.color.parts;
+        settings.*red = static_cast<float>(color.red());
+        settings.*green = static_cast<float>(color.green());
+        settings.*blue = static_cast<float>(color.blue());
+    }
 }
 
 void IWgtPane::enableAfterRuns(QWidget* button, CThreadedCore* core) {

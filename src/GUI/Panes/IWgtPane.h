@@ -1,11 +1,9 @@
 #pragma once
 
 #include "Settings/CUserParams.h"
-#include "Settings/SliderTable.h"
+#include "Settings/PaneTable.h"
 
 #include <QWidget>
-
-#include <span>
 
 class CARGBPlane;
 class CColorPicker;
@@ -54,26 +52,22 @@ Q_SIGNALS:
     void changeMode(EGUIMode mode);
 
 protected:
-    /// The block that `slider` describes.
-    COrvelaSliderBlockImpl* block(const orvela::SliderDescription& slider) const;
-
     /// Labels the block, puts it to position 500 and tells the owner of its changes. Further calls make the
     /// owner hear of a change once more.
     void setUpSlider(COrvelaSliderBlockImpl* block, const QString& label);
     /// Gives the slider's block all that its description holds, the state and the position (0 to 1000).
-    void setUpSlider(const orvela::SliderDescription& slider, bool on, double position);
+    void setUpSlider(const orvela::PaneSlider& slider, bool on, double position);
     /// Sets up every slider with the states and positions of `settings`.
-    void setUpSliders(std::span<const orvela::SliderDescription> sliders, const CSliderParams& settings);
+    void setUpSliders(std::span<const orvela::PaneSlider> sliders, const CSliderParams& settings);
     /// Tells the owner of the picker's changes and shows it while its slider is on.
     void setUpColorPicker(CColorPicker* picker, COrvelaSliderBlockImpl* slider);
+    /// Gives every picker the colour that it has in `settings`.
+    void showColors(std::span<const orvela::PaneColor> colors, const CSliderParams& settings);
 
     /// Writes position and state of every slider into the fields that it drives.
-    void writeSliders(std::span<const orvela::SliderDescription> sliders, CSliderParams& settings) const;
-
-    /// The colour of the colour filter.
-    static QColor filterColor(const CSliderParams& settings);
-    /// Writes the picker's components, 0 to 255.
-    static void writeColor(const CColorPicker* picker, float& red, float& green, float& blue);
+    void writeSliders(std::span<const orvela::PaneSlider> sliders, CSliderParams& settings) const;
+    /// Writes the colour of every picker into its fields.
+    void writeColors(std::span<const orvela::PaneColor> colors, CSliderParams& settings) const;
 
     /// Disables `button` when a run of `core` starts and enables it again when it was completed.
     void enableAfterRuns(QWidget* button, CThreadedCore* core);
@@ -84,6 +78,8 @@ protected:
 
 private:
     void resetSliders();
+    COrvelaSliderBlockImpl* block(const orvela::PaneSlider& slider) const;
+    CColorPicker* picker(const orvela::PaneColor& color) const;
 
     QWidget* mOwner;
     EGUIMode mMode;

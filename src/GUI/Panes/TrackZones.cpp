@@ -1,6 +1,5 @@
 #include "GUI/Panes/TrackZones.h"
 
-#include <iterator>
 #include <vector>
 
 namespace orvela {
@@ -29,31 +28,43 @@ Bands centred(int greenLast, int orangeLast, QRgb orange = kOrange) {
     return {{199, kRed}, {399, orange}, {greenLast, kGreen}, {orangeLast, orange}, {kEnd, kRed}};
 }
 
-Bands bands(int number) {
-    const Bands sets[] = {
-        {{599, kGreen}, {899, kOrange}, {kEnd, kRed}}, // 1: standard
-        centred(887, 943),                             // 2: centred wide
-        {{kEnd, kLightBlue}},                          // 3: neutral light
-        {{kEnd, kBlue}},                               // 4: neutral
-        centred(687, 943),                             // 5: centred final
-        {{694, kGreen}, {864, kOrange}, {kEnd, kRed}}, // 6: sharpness
-        {{749, kGreen}, {kEnd, kOrange}},              // 7: illumination
-        {{699, kGreen}, {kEnd, kOrange}},              // 8: strength
-        {{299, kGreen}, {499, kOrange}, {kEnd, kRed}}, // 9: blur
-        {{349, kRed}, {499, kOrange}, {kEnd, kGreen}}, // 10: fade
-        {{kEnd, kBlue}},                               // 11: neutral
-        centred(587, 643),                             // 12: centred gamma
-        centred(687, 943, kPaleOrange),                // 13: centred final, all channels
-    };
-    return number >= 1 && number <= int(std::size(sets)) ? sets[number - 1] : Bands{};
+Bands bands(ZoneSet zones) {
+    switch (zones) {
+    case ZoneSet::Standard:
+        return {{599, kGreen}, {899, kOrange}, {kEnd, kRed}};
+    case ZoneSet::CentredWide:
+        return centred(887, 943);
+    case ZoneSet::NeutralLight:
+        return {{kEnd, kLightBlue}};
+    case ZoneSet::Neutral:
+    case ZoneSet::NeutralSingle:
+        return {{kEnd, kBlue}};
+    case ZoneSet::CentredFinal:
+        return centred(687, 943);
+    case ZoneSet::Sharpness:
+        return {{694, kGreen}, {864, kOrange}, {kEnd, kRed}};
+    case ZoneSet::Illumination:
+        return {{749, kGreen}, {kEnd, kOrange}};
+    case ZoneSet::Strength:
+        return {{699, kGreen}, {kEnd, kOrange}};
+    case ZoneSet::Blur:
+        return {{299, kGreen}, {499, kOrange}, {kEnd, kRed}};
+    case ZoneSet::Fade:
+        return {{349, kRed}, {499, kOrange}, {kEnd, kGreen}};
+    case ZoneSet::CentredGamma:
+        return centred(587, 643);
+    case ZoneSet::CentredFinalPale:
+        return centred(687, 943, kPaleOrange);
+    }
+    return {};
 }
 
 } // namespace
 
-QList<ZoneStop> set(int number) {
+QList<ZoneStop> set(ZoneSet zones) {
     QList<ZoneStop> stops;
     int first = 0;
-    for (const Band& band : bands(number)) {
+    for (const Band& band : bands(zones)) {
         const QColor color(band.color);
         stops.append({double(first), color});
         stops.append({double(band.last), color});

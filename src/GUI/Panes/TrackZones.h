@@ -1,14 +1,15 @@
 #pragma once
 
 #include "GUI/Controls/ZoneStop.h"
+#include "Settings/SliderTable.h"
 
 namespace orvela {
 
-/// The numbered sets of track colours that tell mild from strong and extreme positions.
+/// The track colours that tell mild from strong and extreme positions.
 namespace TrackZones {
 
-/// The stops of set `number`: 1 to 12, or 13, which is set 5 with a paler orange. Empty for any other number.
-QList<ZoneStop> set(int number);
+/// The stops of a set, in rising order of position.
+QList<ZoneStop> set(ZoneSet zones);
 
 } // namespace TrackZones
 

@@ -2,12 +2,12 @@
 
 #include "Platform/Keyboard.h"
 #include "Settings/PresetTree.h"
+#include "Settings/SettingsStore.h"
 #include "Utility/DebugBoxes.h"
 #include "Utility/Logger.h"
 
 #include <QCoreApplication>
 #include <QMessageBox>
-#include <QSettings>
 
 using namespace orvela;
 
@@ -42,7 +42,7 @@ CBatchMode::CBatchMode() {
 }
 
 bool CBatchMode::isBatchModeEnabled() const {
-    return PresetTree::switchOf(QSettings().value(PresetTree::guiKey(kEnabled)));
+    return PresetTree::switchOf(openSettings().value(PresetTree::guiKey(kEnabled)));
 }
 
 void CBatchMode::setBatchModeEnabled(bool enabled) {
@@ -50,7 +50,7 @@ void CBatchMode::setBatchModeEnabled(bool enabled) {
 }
 
 int CBatchMode::batchMode() const {
-    return QSettings().value(PresetTree::guiKey(kMode), -1).toInt();
+    return openSettings().value(PresetTree::guiKey(kMode), -1).toInt();
 }
 
 void CBatchMode::setBatchMode(int mode) {

@@ -2,8 +2,6 @@
 
 #include "GUI/Controls/CColorPicker.h"
 #include "GUI/Controls/COrvelaSliderBlockImpl.h"
-#include "GUI/Panes/CWgtPaneAdvancedImpl.h"
-#include "Settings/PresetTree.h"
 #include "Utility/DebugBoxes.h"
 #include "Utility/Logger.h"
 
@@ -132,17 +130,14 @@ void savePreset(QWidget* parent, EGUIMode mode, const QString& name, bool& saved
     saved = true;
 }
 
-void ensureFactoryPresets(QWidget* parent) {
+void ensureFactoryPresets(QWidget*) {
     const QStringList stored = listPresets(Mode_Advanced, true);
     const QStringList names = FactoryPresets::names();
     if (std::all_of(names.begin(), names.end(), [&](const QString& name) { return stored.contains(name); }))
         return;
-    CWgtPaneAdvancedImpl pane(parent, Mode_Advanced);
     SettingsEdit edit;
-    for (const QString& name : names) {
-        pane.setSliders(name);
-        PresetTree::write(edit, Mode_Advanced, name, contentOf(&pane));
-    }
+    for (const QString& name : names)
+        PresetTree::write(edit, Mode_Advanced, name, FactoryPresets::contentOf(name));
     edit.commit();
 }
 

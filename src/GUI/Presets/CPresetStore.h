@@ -41,8 +41,7 @@ void loadPreset(QWidget* parent, EGUIMode mode, const QString& name);
 void savePreset(QWidget* parent, EGUIMode mode, const QString& name, bool& saved, bool& isNew,
                 bool askOverwrite);
 
-/// Writes all twelve factory presets when one of them is missing.
-/// @param parent  becomes the owner of a temporary pane, see IWgtPane
+/// Writes all twelve factory presets when one of them is missing. No control is needed or touched.
 /// @throws CGenericEx when the store cannot be written
 void ensureFactoryPresets(QWidget* parent);
 

@@ -2,6 +2,7 @@
 #include "GUI/Panes/CWgtPaneAdvancedImpl.h"
 #include "PaneFixture.h"
 
+#include <QAccessible>
 #include <QTest>
 
 #include <gtest/gtest.h>
@@ -56,8 +57,18 @@ TEST_F(AdvancedPane, WritesEverySliderIntoItsOwnFields) {
 TEST_F(AdvancedPane, SlidersShowEveryPosition) {
     load("Portrait");
     EXPECT_EQ(pane->sldrContrast_Perc->value(), 550);
-    for (const SliderDescription& slider : SliderTable::advanced())
+    for (const PaneSlider& slider : PaneTable::sliders(Mode_Advanced))
         expectShowsEveryPosition(pane, slider);
+}
+
+TEST_F(AdvancedPane, TipsNameSlidersAndTellWhatTheyDo) {
+    EXPECT_EQ(pane->sldrFade->toolTip(), "Fade");
+    const QString help = pane->sldrFade->sldrValue->toolTip();
+    EXPECT_TRUE(help.startsWith("Brings the original back")) << qPrintable(help);
+    EXPECT_EQ(pane->sldrFade->whatsThis(), help);
+    EXPECT_EQ(
+        QAccessible::queryAccessibleInterface(pane->sldrFade->sldrValue)->text(QAccessible::Description),
+        help);
 }
 
 TEST_F(AdvancedPane, TypedNumbersBecomePositions) {

@@ -49,16 +49,16 @@ TEST_F(FinalTouchPane, StartsNeutralAndWritesEverySliderIntoItsOwnFields) {
         const std::map<std::string, const char*> texts = {{"Shadows", "0.0"},      {"Middle", "1.0"},
                                                           {"Highlights", "255.0"}, {"Contrast", "0.0"},
                                                           {"Brightness", "0.0"},   {"Color Filter", "0.0"}};
-        for (const SliderDescription& slider : SliderTable::finalTouch()) {
+        for (const PaneSlider& slider : PaneTable::sliders(Mode_FinalTouch)) {
             const COrvelaSliderBlockImpl* block = blockOf(pane, slider.object);
             EXPECT_FALSE(block->isEnabled()) << slider.object;
-            EXPECT_STREQ(qPrintable(block->txtValue->text()), texts.at(slider.label)) << slider.object;
+            EXPECT_STREQ(qPrintable(block->txtValue->text()), texts.at(slider.slider.label)) << slider.object;
         }
     }
-    EXPECT_EQ(SliderTable::finalTouch().size(), drives().size() + 1);
+    EXPECT_EQ(PaneTable::sliders(Mode_FinalTouch).size(), drives().size() + 1);
     pane->colrPickPercColorFilter->setColor(QColor(9, 8, 7));
     expectWrites(pane, drives(), "mColor_Touch_Value_", QColor(9, 8, 7));
-    for (const SliderDescription& slider : SliderTable::finalTouch())
+    for (const PaneSlider& slider : PaneTable::sliders(Mode_FinalTouch))
         expectShowsEveryPosition(pane, slider);
 }
 

@@ -67,21 +67,22 @@ void expectWrites(IWgtPane* pane, const std::vector<Drives>& sliders, const std:
     }
 }
 
-double snapping(const SliderDescription& slider, double position) {
-    const double shown = slider.scale->toShown(position);
-    return 1e-6 + std::max(std::abs(slider.scale->toPosition(shown + 0.05) - position),
-                           std::abs(slider.scale->toPosition(shown - 0.05) - position));
+double snapping(const SliderScale& scale, double position) {
+    const double shown = scale.toShown(position);
+    return 1e-6 + std::max(std::abs(scale.toPosition(shown + 0.05) - position),
+                           std::abs(scale.toPosition(shown - 0.05) - position));
 }
 
-void expectShowsEveryPosition(const QWidget* pane, const SliderDescription& slider) {
+void expectShowsEveryPosition(const QWidget* pane, const PaneSlider& slider) {
     SCOPED_TRACE(slider.object);
+    const SliderScale& scale = *slider.slider.scale;
     COrvelaSliderBlockImpl* block = blockOf(pane, slider.object);
     ASSERT_TRUE(block);
     for (int position = 0; position <= 1000; ++position) {
         block->setValue(position);
         const QString text = block->txtValue->text();
-        EXPECT_NEAR(text.toDouble(), slider.scale->toShown(position), 0.05 + 1e-9);
-        EXPECT_NEAR(block->value(), position, snapping(slider, position));
+        EXPECT_NEAR(text.toDouble(), scale.toShown(position), 0.05 + 1e-9);
+        EXPECT_NEAR(block->value(), position, snapping(scale, position));
         Q_EMIT block->txtValue->editingFinished();
         EXPECT_EQ(block->txtValue->text(), text) << "inside the range";
     }

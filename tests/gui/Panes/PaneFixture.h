@@ -52,10 +52,10 @@ void expectWrites(IWgtPane* pane, const std::vector<Drives>& sliders, const std:
                   const QColor& color);
 
 /// Expects the slider to show every position to one decimal and to keep it as exactly as that tells it.
-void expectShowsEveryPosition(const QWidget* pane, const SliderDescription& slider);
+void expectShowsEveryPosition(const QWidget* pane, const PaneSlider& slider);
 
-/// How far the text's one decimal may move the slider from `position`.
-double snapping(const SliderDescription& slider, double position);
+/// How far the text's one decimal may move a slider from `position`.
+double snapping(const SliderScale& scale, double position);
 
 /// Expects a core of that class, and `button` to ask for `mode` unless the core's last run began and was not
 /// completed.

@@ -33,15 +33,15 @@ TEST(ThreeSlidersPane, DrivesTheFieldsOfItsMode) {
           {"sldr3", "PerceptualDark", "PerceptualDarkEnabled"}}}};
     for (const auto& [mode, sliders] : modes) {
         Shown<CWgtPane3SlidersImpl> shown(mode);
-        for (const SliderDescription& slider : SliderTable::threeSliders(mode)) {
+        for (const PaneSlider& slider : PaneTable::threeSliders(mode)) {
             const COrvelaSliderBlockImpl* block = blockOf(shown.pane, slider.object);
             const double initial = std::map<std::string, double>{
-                {"Saturation", 500}, {"Highlights", 255}, {"Middle", 500}, {"Dark", 0}}[slider.label];
-            EXPECT_NEAR(block->value(), initial, snapping(slider, initial)) << slider.label;
+                {"Saturation", 500}, {"Highlights", 255}, {"Middle", 500}, {"Dark", 0}}[slider.slider.label];
+            EXPECT_NEAR(block->value(), initial, snapping(*slider.slider.scale, initial)) << slider.object;
             EXPECT_FALSE(block->isEnabled());
         }
         expectWrites(shown.pane, sliders, "", {});
-        for (const SliderDescription& slider : SliderTable::threeSliders(mode))
+        for (const PaneSlider& slider : PaneTable::threeSliders(mode))
             expectShowsEveryPosition(shown.pane, slider);
         expectPlainPane(shown.pane);
     }
@@ -77,7 +77,7 @@ TEST(GenericPane, DrivesTheOneFieldOfItsMode) {
             picker->setColor(QColor(1, 2, 200));
         expectWrites(shown.pane, {{"sldrGeneric", fields[number - Mode_SmartSharpness].toStdString(), ""}},
                      picker ? "mColor_Value_" : "", QColor(1, 2, 200));
-        expectShowsEveryPosition(shown.pane, *SliderTable::single(mode));
+        expectShowsEveryPosition(shown.pane, *PaneTable::single(mode));
         expectPlainPane(shown.pane);
     }
 }

@@ -6,6 +6,7 @@
 #include "Platform/Keyboard.h"
 #include "Settings/ModeTable.h"
 #include "Settings/PresetConversion.h"
+#include "Settings/SettingsStore.h"
 #include "Utility/CGenericEx.h"
 #include "support/LogCapture.h"
 
@@ -13,7 +14,6 @@
 #include <QCheckBox>
 #include <QDir>
 #include <QMessageBox>
-#include <QSettings>
 #include <QTimer>
 
 #include <gtest/gtest.h>
@@ -25,7 +25,7 @@ namespace {
 class PresetStore : public testing::Test {
 protected:
     PresetStore() {
-        QSettings().clear();
+        openSettings().clear();
         first->setObjectName("first");
         second->setObjectName("a/b");
         picker->setObjectName("picker");
@@ -80,13 +80,13 @@ TEST_F(PresetStore, LoadsWhatWasSaved) {
     EXPECT_EQ(picker->color(), QColor(1, 2, 3, 255));
     EXPECT_EQ(signalsOfSecond.value(0), "state");
     EXPECT_EQ(signalsOfSecond.value(1), "value");
-    EXPECT_FALSE(QSettings().allKeys().join(' ').contains("CheckBoxes/Checked")) << "has no name";
+    EXPECT_FALSE(openSettings().allKeys().join(' ').contains("CheckBoxes/Checked")) << "has no name";
 }
 
 TEST_F(PresetStore, MissingPartsLeaveControlsAsTheyAre) {
     qputenv("ORVELA_DEBUG_MBOX", "1");
     ASSERT_TRUE(save("x"));
-    QSettings settings;
+    QSettings settings = openSettings();
     settings.beginGroup("2000/UserPresets/Advanced/x");
     settings.remove("ColorPickers");
     settings.remove("CheckBoxes/box");
@@ -121,10 +121,10 @@ TEST_F(PresetStore, AsksBeforeOverwriting) {
     EXPECT_FALSE(save("x"));
     EXPECT_EQ(said, "Warning|This preset already exists. Do you want to overwrite it?");
     const QString key = "2000/UserPresets/Advanced/x/Sliders/first/Value";
-    EXPECT_EQ(QSettings().value(key).toDouble(), 0);
+    EXPECT_EQ(openSettings().value(key).toDouble(), 0);
     answer(QMessageBox::Yes);
     EXPECT_TRUE(save("x") && !isNew);
-    EXPECT_EQ(QSettings().value(key).toDouble(), 700);
+    EXPECT_EQ(openSettings().value(key).toDouble(), 700);
     EXPECT_EQ(boxes([&] { EXPECT_FALSE(save("")); }), QStringList("Warning|A preset needs a name."));
     CPresetStore::removePreset(Mode_Advanced, "x");
     EXPECT_TRUE(CPresetStore::listPresets(Mode_Advanced, true).isEmpty());
@@ -132,7 +132,7 @@ TEST_F(PresetStore, AsksBeforeOverwriting) {
 }
 
 TEST_F(PresetStore, ReportsWhatCannotBeWritten) {
-    const QString path = QSettings().fileName();
+    const QString path = openSettings().fileName();
     QFile::remove(path);
     ASSERT_TRUE(QDir().mkpath(path));
     EXPECT_THROW(save("x"), CGenericEx);
@@ -158,11 +158,10 @@ TEST_F(PresetStore, FactoryPresetsAreThoseOfTheModes) {
         ASSERT_TRUE(content && content->sliders.size() == 26 && content->colors.size() == 1);
         const CSliderParams stored = PresetConversion::paramsOf(Mode_Advanced, *content);
         const CUserParamsPhotoshop factory(mode.mode);
-        for (const SliderDescription& slider : SliderTable::advanced()) {
-            SCOPED_TRACE(slider.object);
+        for (const SliderDescription& slider : SliderTable::sliders()) {
             EXPECT_EQ(stored.*slider.enabled, factory.mSliderParams.*slider.enabled);
             const float position = slider.value ? factory.mSliderParams.*slider.value : 0;
-            EXPECT_NEAR(slider.value ? stored.*slider.value : 0, position, snapping(slider, position));
+            EXPECT_NEAR(slider.value ? stored.*slider.value : 0, position, snapping(*slider.scale, position));
         }
         EXPECT_EQ(stored.mColor_Value_R + stored.mColor_Value_G + stored.mColor_Value_B, 0);
     }
@@ -174,17 +173,36 @@ TEST_F(PresetStore, FactoryPresetsAreThoseOfTheModes) {
               QStringList({"Note:|Unknown preset:portrait", "Note:|Unknown preset:13"}));
 }
 
+TEST_F(PresetStore, FactoryPresetsAreWhatTheirPaneWouldSave) {
+    Shown<CWgtPaneAdvancedImpl> shown(Mode_Advanced);
+    CPresetStore::ensureFactoryPresets(&pane);
+    const auto lines = [] {
+        const QSettings settings = openSettings();
+        QStringList lines;
+        for (const QString& key : settings.allKeys())
+            lines << key + '=' + settings.value(key).toString();
+        return lines;
+    };
+    const QStringList written = lines();
+    EXPECT_EQ(written.size(), 12 * (26 * 2 + 3));
+    openSettings().clear();
+    for (const QString& name : FactoryPresets::names()) {
+        shown.pane->setSliders(name);
+        CPresetStore::savePreset(shown.pane, Mode_Advanced, name, saved, isNew, false);
+    }
+    EXPECT_EQ(lines(), written);
+}
+
 TEST_F(PresetStore, OneMissingFactoryPresetBringsAllBack) {
     const QString key = "2000/UserPresets/Advanced/Portrait/Sliders/sldrContrast_Perc/Value";
     CPresetStore::ensureFactoryPresets(&pane);
-    QSettings().setValue(key, 1);
+    openSettings().setValue(key, 1);
     CPresetStore::ensureFactoryPresets(&pane);
-    EXPECT_EQ(QSettings().value(key).toDouble(), 1) << "none is missing";
+    EXPECT_EQ(openSettings().value(key).toDouble(), 1) << "none is missing";
     CPresetStore::removePreset(Mode_Advanced, "AutoSaturation");
     CPresetStore::ensureFactoryPresets(&pane);
-    EXPECT_EQ(QSettings().value(key).toDouble(), 550);
+    EXPECT_EQ(openSettings().value(key).toDouble(), 550);
     EXPECT_TRUE(CPresetStore::presetExists(Mode_Advanced, "AutoSaturation"));
-    EXPECT_TRUE(pane.findChildren<CWgtPaneAdvancedImpl*>().isEmpty());
 }
 
 TEST_F(PresetStore, ShiftSwitchesBatchModeOff) {
@@ -203,7 +221,7 @@ TEST_F(PresetStore, ShiftSwitchesBatchModeOff) {
     EXPECT_TRUE(log.has("SHIFT key state 128"));
     EXPECT_EQ(said, "Batch Mode|Batch mode is now off.");
     EXPECT_EQ(CBatchMode::instance().batchMode(), 32);
-    EXPECT_EQ(QSettings().value("2000/GUI/batchModeEnabled"), QVariant(false));
+    EXPECT_EQ(openSettings().value("2000/GUI/batchModeEnabled"), QVariant(false));
 }
 
 } // namespace

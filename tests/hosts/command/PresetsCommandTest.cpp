@@ -1,6 +1,5 @@
 #include "ProgramRun.h"
-
-#include <QSettings>
+#include "Settings/SettingsStore.h"
 
 using namespace orvela;
 
@@ -8,14 +7,19 @@ namespace {
 
 class PresetsCommand : public ProgramTest {
 protected:
-    // The program's own store.
-    QSettings settings{QStringLiteral("Kestrand"), QStringLiteral("Orvela")};
     PresetsCommand() {
         settings.clear();
         settings.sync();
         store("in.json", R"({"version": 1, "by": "me", "settings": {"SaturationValue": 640.5,
                              "SaturationEnabled": true, "mColor_Value_R": 7, "Future": 1}})");
     }
+    ~PresetsCommand() override { setSettingsApplication(QStringLiteral("OrvelaTests")); }
+
+    static QSettings programStore() {
+        setSettingsApplication(QStringLiteral("Orvela"));
+        return openSettings();
+    }
+    QSettings settings = programStore();
 };
 
 TEST_F(PresetsCommand, FileToStoreAndBack) {

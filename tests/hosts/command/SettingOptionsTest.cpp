@@ -146,8 +146,10 @@ TEST_F(SettingCommandTest, EveryModeIsListedWithItsSliders) {
     EXPECT_EQ(levels["identifier"], "SmartLevels");
     EXPECT_EQ(levels["sliders"].toArray()[0].toObject()["option"], "--highlights");
     EXPECT_EQ(levels["sliders"].toArray()[0].toObject()["high"], 255);
+    EXPECT_TRUE(levels["sliders"].toArray()[0].toObject()["help"].toString().startsWith("Brightens"));
     const Answer text = orvela("modes");
     EXPECT_TRUE(text.says("Temperature: ") && text.says("Temperature, 2000 to 10000"));
+    EXPECT_TRUE(text.says("Makes the light warmer"));
 }
 
 } // namespace

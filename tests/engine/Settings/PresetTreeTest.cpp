@@ -1,10 +1,10 @@
 #include "Settings/ModeTable.h"
 #include "Settings/PresetConversion.h"
+#include "Settings/SettingsStore.h"
 #include "Utility/CGenericEx.h"
 
 #include <QElapsedTimer>
 #include <QPoint>
-#include <QSettings>
 
 #include <gtest/gtest.h>
 
@@ -14,7 +14,7 @@ namespace {
 
 class PresetTreeTest : public testing::Test {
 protected:
-    PresetTreeTest() { QSettings().clear(); }
+    PresetTreeTest() { openSettings().clear(); }
 
     static void write(EGUIMode mode, const QString& name, const PresetContent& content) {
         SettingsEdit edit;
@@ -29,7 +29,7 @@ TEST_F(PresetTreeTest, KeysAreTheKnownOnes) {
            {{QStringLiteral("c"), 1, 2, 255}},
            {{QStringLiteral("b"), true}}});
     const QString preset = QStringLiteral("2000/UserPresets/Auto Color/Mine/");
-    const QSettings settings;
+    const QSettings settings = openSettings();
     QStringList expected;
     for (const char* key : {"CheckBoxes/b/Checked", "ColorPickers/c/Blue", "ColorPickers/c/Green",
                             "ColorPickers/c/Red", "Sliders/s/Enabled", "Sliders/s/Value"})
@@ -50,7 +50,7 @@ TEST_F(PresetTreeTest, EveryNameComesBack) {
     for (const QString& name : names)
         write(Mode_Advanced, name, {{{name, 1.5, true}}, {}, {}});
     QStringList listed = PresetTree::names(Mode_Advanced);
-    QSettings().sync();
+    openSettings().sync();
     for (const QString& name : names) {
         EXPECT_EQ(listed.removeAll(name), 1) << qPrintable(name);
         const auto stored = PresetTree::read(Mode_Advanced, name);
@@ -71,7 +71,7 @@ TEST_F(PresetTreeTest, GarbageReadsAsZeroAndOff) {
         QVariant(),   "abc",        "nan", "-inf", QStringList{"1", "2"}, QByteArray("\0\1", 2),
         QPoint(3, 4), "@Variant(x", ""};
     for (const QVariant& value : garbage) {
-        QSettings settings;
+        QSettings settings = openSettings();
         settings.beginGroup("2000/UserPresets/Advanced/x");
         for (const char* key : {"Sliders/s/Value", "Sliders/s/Enabled", "ColorPickers/c/Red",
                                 "CheckBoxes/b/Checked", "Sliders/t"})

@@ -1,10 +1,11 @@
 #include "Settings/SettingsEdit.h"
 
+#include "Settings/SettingsStore.h"
 #include "Utility/CGenericEx.h"
 
+#include <QCoreApplication>
 #include <QDir>
 #include <QFileInfo>
-#include <QSettings>
 
 #include <gtest/gtest.h>
 #include <sys/mount.h>
@@ -51,11 +52,11 @@ protected:
             EXPECT_TRUE(error.message().contains(path)) << qPrintable(error.message());
         }
         EXPECT_EQ(bytes(path), before);
-        EXPECT_EQ(QSettings().value("2000/a").toInt(), before.isEmpty() ? 0 : 1);
-        EXPECT_FALSE(QSettings().contains("2000/c"));
+        EXPECT_EQ(openSettings().value("2000/a").toInt(), before.isEmpty() ? 0 : 1);
+        EXPECT_FALSE(openSettings().contains("2000/c"));
     }
 
-    const QString path = QSettings().fileName();
+    const QString path = openSettings().fileName();
     const QString folder = QFileInfo(path).path();
 };
 
@@ -106,7 +107,7 @@ TEST_F(SettingsEditTest, KeepsForeignFiles) {
         file.close();
         set("2000/a", 7);
         set("2000/b", 8);
-        EXPECT_EQ(QSettings().value("2000/a").toInt(), 7);
+        EXPECT_EQ(openSettings().value("2000/a").toInt(), 7);
     }
     for (QByteArray& text : foreign) {
         const auto number = &text - &foreign.front() + 1;
@@ -130,7 +131,19 @@ TEST_F(SettingsEditTest, TwoProcessesWriteAtOnce) {
         ASSERT_EQ(waitpid(child, &status, 0), child);
         EXPECT_EQ(status, 0);
     }
-    EXPECT_EQ(QSettings().allKeys().size(), 82);
+    EXPECT_EQ(openSettings().allKeys().size(), 82);
+}
+
+TEST_F(SettingsEditTest, TheStoreIsNotThatOfTheProgramAround) {
+    const QString name = QCoreApplication::applicationName();
+    QCoreApplication::setApplicationName(QStringLiteral("Host"));
+    QCoreApplication::setOrganizationName(QStringLiteral("Host"));
+    EXPECT_EQ(openSettings().fileName(), path);
+    EXPECT_TRUE(path.endsWith(QStringLiteral("Kestrand/OrvelaTests.conf"))) << qPrintable(path);
+    set("2000/a", 9);
+    EXPECT_TRUE(bytes(path).contains("a=9"));
+    QCoreApplication::setApplicationName(name);
+    QCoreApplication::setOrganizationName(QStringLiteral("Kestrand"));
 }
 
 } // namespace
