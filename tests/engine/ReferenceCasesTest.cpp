@@ -3,13 +3,13 @@
 
 #include "support/ReferenceCases.h"
 
-#include "Core/PipelineTable.h"
 #include "Filters/Kernels/HistogramRecount.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
 #include "Utility/CGenericEx.h"
 #include "support/LogCapture.h"
 #include "support/ParamsText.h"
 #include "support/StatisticMap.h"
+#include "support/TaskSettings.h"
 
 #include <QTemporaryDir>
 
@@ -71,7 +71,8 @@ public:
         const auto out = testplanes::noise(mWidth, mHeight, 7); // must never show
         ExceptionStack::clear();
         const LogCapture log;
-        const auto task = make({.proxy = &proxy}, *out);
+        const auto task =
+            tasksettings::taskNamed(mCase.task).make({.proxy = &proxy}, &mParams, mIn.get(), out.get());
         task->Apply();
         checkOutcome(*task);
         for (const QString& line : texts("log"))
@@ -85,14 +86,6 @@ public:
 private:
     std::unique_ptr<CARGBPlane> picture(const QString& pixels) const {
         return referencecases::picture(mWidth, mHeight, pixels);
-    }
-
-    std::unique_ptr<TaskBase> make(const RunContext& context, CARGBPlane& out) {
-        for (const PipelineTask& task : PipelineTable::allTasks()) {
-            if (task.name == mCase.task)
-                return task.make(context, &mParams, mIn.get(), &out);
-        }
-        throw std::invalid_argument("no task of this name");
     }
 
     QStringList texts(const std::string& keyword) const {
@@ -181,7 +174,7 @@ TEST(ReferenceFiles, EveryTaskHasCasesInFilesOfItsName) {
         for (const ReferenceCase& each : referencecases::read(file))
             EXPECT_EQ(each.task, file.stem()) << each.place;
     }
-    for (const PipelineTask& task : PipelineTable::allTasks())
+    for (const PipelineTask& task : tasksettings::allTasks())
         EXPECT_TRUE(named.count(task.name)) << task.name;
 }
 

@@ -75,13 +75,24 @@ inline CUserParamsPhotoshop paramsFor(const std::string& task, float position = 
     return params;
 }
 
-/// Runs a task of the pipelines by its class name.
-inline bool run(const std::string& name, CUserParams& params, CARGBPlane& in, CARGBPlane& out) {
-    for (const PipelineTask& task : PipelineTable::allTasks()) {
+/// The registry, asked for once.
+inline const std::vector<PipelineTask>& allTasks() {
+    static const std::vector<PipelineTask> tasks = PipelineTable::allTasks();
+    return tasks;
+}
+
+/// A task of the pipelines by its class name.
+inline const PipelineTask& taskNamed(const std::string& name) {
+    for (const PipelineTask& task : allTasks()) {
         if (task.name == name)
-            return task.make({}, &params, &in, &out)->Apply();
+            return task;
     }
     throw std::invalid_argument("no task named " + name);
+}
+
+/// Runs a task by its class name.
+inline bool run(const std::string& name, CUserParams& params, CARGBPlane& in, CARGBPlane& out) {
+    return taskNamed(name).make({}, &params, &in, &out)->Apply();
 }
 
 /// Runs a task on a picture in place.
@@ -90,18 +101,11 @@ inline bool apply(const std::string& name, CUserParams& params, CARGBPlane& plan
     return run(name, params, plane, out);
 }
 
-/// The colour that a task makes of a picture of one colour.
-inline testplanes::Pixel colourAfter(const std::string& name, CUserParams& params, testplanes::Pixel colour) {
-    const auto plane = testplanes::uniform(5, 5, colour);
-    EXPECT_TRUE(apply(name, params, *plane)) << name;
-    return testplanes::at(*plane, 4, 4);
-}
-
 /// Leaves in `params` what the pipeline's measurements and analyzers would know of the picture.
 inline void measure(CUserParams& params, CARGBPlane& in, CARGBPlane& out) {
     for (const char* name : {"CHistogram0", "CHistogram_VII", "CHistogram_III"})
         run(name, params, in, out);
-    for (const PipelineTask& task : PipelineTable::allTasks()) {
+    for (const PipelineTask& task : allTasks()) {
         if (task.kind == TaskKind::Analyzer)
             task.make({}, &params, &in, &out)->Apply();
     }

@@ -1,125 +1,32 @@
-#include "Filters/IFilter.h"
-#include "Library/Utility/CARGBPlaneProxyDirect.h"
-#include "SmartAnalyzers/ISmartAnalyzer.h"
+#include "Filters/TaskBase.h"
+
 #include "Utility/CGenericEx.h"
 #include "Utility/RowScheduler.h"
 #include "support/LogCapture.h"
-#include "support/TestPlanes.h"
+#include "support/ScriptedFilter.h"
 
-#include <QDir>
 #include <QStringList>
-#include <QTemporaryDir>
 
 #include <gmock/gmock.h>
-#include <gtest/gtest.h>
-
-#include <functional>
-#include <mutex>
-#include <set>
-#include <stdexcept>
 
 using namespace orvela;
 
 namespace {
 
 using testing::ElementsAre;
+using TaskBaseTest = ScriptedFilterTest;
 
-// A filter whose phases do as told and that writes 200 to every sample of its rows.
-class ScriptedFilter final : public IFilter {
-public:
-    ScriptedFilter(CUserParams* params, CARGBPlane* in, CARGBPlane* out, const RunContext& context = {})
-        : IFilter(context, params, in, out) {}
-
-    using IFilter::GetRGBFromHost;
-    using IFilter::useHostPicture;
-
-    bool pre = true;
-    bool post = true;
-    int throwAtRow = -1;
-    std::uint32_t start = 0;
-    std::uint32_t end = 0;
-    std::uint32_t step = 1;
-    std::set<std::uint32_t> rows;
-    std::vector<std::string> phases;
-
-protected:
-    const TaskDescription& description() const override {
-        static constexpr TaskDescription kDescription = {
-            .source = "Filters/Scripted", .line = 7, .dumpName = "Scripted", .writes = Writes::SomePixels};
-        return kDescription;
-    }
-    bool applies() override {
-        phases.emplace_back("pre");
-        return pre;
-    }
-    void prepare() override {
-        if (end != 0) {
-            mVertStart = start;
-            mVertEnd = end;
-            mVertStep = step;
-        }
-    }
-    void ApplyRow(std::uint32_t row) override {
-        const Row out = mOutPlane->row(static_cast<int>(row));
-        for (std::uint8_t* channel : out)
-            std::fill_n(channel, mOutPlane->width(), std::uint8_t{200});
-        {
-            const std::lock_guard lock(mMutex);
-            rows.insert(row);
-        }
-        if (static_cast<int>(row) == throwAtRow)
-            throw std::runtime_error("row 3 is broken");
-    }
-    bool PostApply() override {
-        phases.emplace_back("post");
-        return post;
-    }
-    void onSuccess() override {
-        phases.emplace_back("success");
-        IFilter::onSuccess();
-    }
-
-private:
-    std::mutex mMutex;
-};
-
-// A broken promise ends builds with assertions; elsewhere it is an exception.
-void expectBroken(const std::function<void()>& action, const std::string& where, const std::string& what,
-                  const std::string& file, int line) {
-#if defined(QT_NO_DEBUG) && !defined(QT_FORCE_ASSERTS)
-    static_cast<void>(where);
-    try {
-        action();
-        ADD_FAILURE() << "nothing was thrown";
-    } catch (const CGenericEx& failure) {
-        EXPECT_EQ(failure.message().toStdString(), what);
-        EXPECT_EQ(failure.sourceFile().toStdString() + std::to_string(failure.line()),
-                  file + std::to_string(line));
-    }
-    ExceptionStack::clear();
-#else
-    EXPECT_DEATH(action(), where + ": \"" + what + "\", file " + file + ", line " + std::to_string(line));
-#endif
-}
-
-struct TaskTest : testing::Test {
-    CUserParams params;
-    std::unique_ptr<CARGBPlane> in = testplanes::uniform(4, 7, {10, 20, 30});
-    std::unique_ptr<CARGBPlane> out = testplanes::uniform(4, 7, {10, 20, 30});
-    ScriptedFilter filter{&params, in.get(), out.get()};
-};
-
-TEST_F(TaskTest, PhasesRunInOrderAndTheOutputBecomesTheInput) {
+TEST_F(TaskBaseTest, PhasesRunInOrderBetweenTheirLines) {
     LogCapture log;
     EXPECT_TRUE(filter.Apply());
+    EXPECT_EQ(filter.outcome(), TaskOutcome::Applied);
     EXPECT_THAT(filter.phases, ElementsAre("pre", "post", "success"));
-    EXPECT_EQ(testplanes::at(*in, 3, 6), (testplanes::Pixel{200, 200, 200}));
     ASSERT_EQ(log.lines().size(), 8U);
     EXPECT_EQ(log.lines()[0], "-> PreApply");
     EXPECT_EQ(log.lines()[6], "onSuccess copying from out to in");
 }
 
-TEST_F(TaskTest, QuietStopsSkipTheLaterPhases) {
+TEST_F(TaskBaseTest, QuietStopsSkipTheLaterPhases) {
     LogCapture log;
     filter.pre = false;
     EXPECT_FALSE(filter.Apply());
@@ -131,50 +38,27 @@ TEST_F(TaskTest, QuietStopsSkipTheLaterPhases) {
     EXPECT_FALSE(late.Apply());
     EXPECT_THAT(late.phases, ElementsAre("pre", "post"));
     EXPECT_TRUE(log.has("<- Task canceled in PostApply."));
-    EXPECT_EQ(testplanes::bytes(*in), testplanes::bytes(*out)) << "the output is put back";
-    EXPECT_EQ(testplanes::at(*in, 0, 0), (testplanes::Pixel{10, 20, 30}));
+    expectUntouched();
 }
 
-TEST_F(TaskTest, RowRangesOfStartEndAndStep) {
-    filter.end = 5;
-    filter.step = 2;
-    EXPECT_TRUE(filter.Apply());
-    EXPECT_THAT(filter.rows, ElementsAre(0, 2));
-
-    ScriptedFilter inner(&params, in.get(), out.get());
-    inner.start = 1;
-    inner.end = 6;
-    EXPECT_TRUE(inner.Apply());
-    EXPECT_THAT(inner.rows, ElementsAre(1, 2, 3, 4, 5));
-
-    for (const auto& [start, end] :
-         {std::pair{3U, 3U}, std::pair{3U, 2U}, std::pair{0U, static_cast<unsigned>(-4)}}) {
-        ScriptedFilter empty(&params, in.get(), out.get());
-        empty.start = start;
-        empty.end = end;
-        EXPECT_TRUE(empty.Apply());
-        EXPECT_TRUE(empty.rows.empty());
+TEST_F(TaskBaseTest, RowRangesOfStartEndAndStep) {
+    const std::tuple<unsigned, unsigned, unsigned, std::set<std::uint32_t>> cases[] = {
+        {0, 5, 2, {0, 2}},
+        {1, 6, 1, {1, 2, 3, 4, 5}},
+        {3, 3, 1, {}},
+        {3, 2, 1, {}},
+        {0, static_cast<unsigned>(-4), 1, {}}};
+    for (const auto& [start, end, step, rows] : cases) {
+        ScriptedFilter part(&params, in.get(), out.get());
+        part.start = start;
+        part.end = end;
+        part.step = step;
+        EXPECT_TRUE(part.Apply());
+        EXPECT_EQ(part.rows, rows) << start << ' ' << end;
     }
 }
 
-TEST_F(TaskTest, RowsThatAreNotVisitedComeFromTheInput) {
-    for (const auto& [start, end, step] : {std::tuple{2U, 5U, 1U}, {0U, 6U, 2U}, {3U, 2U, 1U}}) {
-        const auto plane = testplanes::uniform(4, 7, {10, 20, 30});
-        const auto garbage = testplanes::noise(4, 7);
-        ScriptedFilter some(&params, plane.get(), garbage.get());
-        some.start = start;
-        some.end = end;
-        some.step = step;
-        EXPECT_TRUE(some.Apply());
-        for (std::uint32_t y = 0; y < 7; ++y) {
-            const testplanes::Pixel expected =
-                some.rows.count(y) ? testplanes::Pixel{200, 200, 200} : testplanes::Pixel{10, 20, 30};
-            EXPECT_EQ(testplanes::at(*plane, 3, static_cast<int>(y)), expected) << y;
-        }
-    }
-}
-
-TEST_F(TaskTest, AStepOfNoRowsIsABrokenPromise) {
+TEST_F(TaskBaseTest, AStepOfNoRowsIsABrokenPromise) {
     filter.end = 5;
     filter.step = 0;
 #if defined(QT_NO_DEBUG) && !defined(QT_FORCE_ASSERTS)
@@ -187,7 +71,7 @@ TEST_F(TaskTest, AStepOfNoRowsIsABrokenPromise) {
 #endif
 }
 
-TEST_F(TaskTest, FailuresOnWorkersEndThePassAndLeaveBothPlanesAsTheyWere) {
+TEST_F(TaskBaseTest, FailuresOnWorkersEndThePass) {
     for (const int threads : {1, 2, 7}) {
         RowScheduler scheduler(threads);
         LogCapture log;
@@ -198,103 +82,29 @@ TEST_F(TaskTest, FailuresOnWorkersEndThePassAndLeaveBothPlanesAsTheyWere) {
         EXPECT_EQ(failing.outcome(), TaskOutcome::Failed);
         EXPECT_EQ(failing.failure().cause, "row 3 is broken");
         EXPECT_TRUE(log.has("<- Unable to complete filter block."));
-        EXPECT_EQ(testplanes::bytes(*in), testplanes::bytes(*testplanes::uniform(4, 7, {10, 20, 30})));
-        EXPECT_EQ(testplanes::bytes(*out), testplanes::bytes(*in));
+        expectUntouched();
     }
 }
 
-TEST_F(TaskTest, StopRequestEndsThePassBeforeAnyLaterRow) {
+TEST_F(TaskBaseTest, StopRequestEndsThePassBeforeAnyLaterRow) {
     ExceptionStack::clear();
     params.mProgressCallback = [this](int) { params.mCancelRequested = true; };
     RowScheduler scheduler(1);
     scheduler.execute([&] { EXPECT_FALSE(filter.Apply()); });
     EXPECT_EQ(filter.rows.size(), 1U);
     EXPECT_EQ(filter.outcome(), TaskOutcome::Cancelled);
-    EXPECT_TRUE(ExceptionStack::entries()[0].startsWith("Filters/Scripted:7 CGenericEx User canceled."));
-    EXPECT_EQ(testplanes::at(*out, 0, 0), (testplanes::Pixel{10, 20, 30}));
+    EXPECT_EQ(ExceptionStack::entries(), QStringList("Filters/Scripted:7 CGenericEx User canceled."));
+    expectUntouched();
     ExceptionStack::clear();
 }
 
-TEST_F(TaskTest, RowsReportTheirPercentage) {
+TEST_F(TaskBaseTest, RowsReportTheirPercentage) {
     std::set<int> percents;
     params.mProgressCallback = [&percents](int percent) { percents.insert(percent); };
     RowScheduler scheduler(1);
     scheduler.execute([&] { EXPECT_TRUE(filter.Apply()); });
     // 100 / 7 = 14.2857 in single precision, times 1 to 7.
     EXPECT_THAT(percents, ElementsAre(14, 28, 42, 57, 71, 85, 100));
-}
-
-TEST_F(TaskTest, DumpsAreNumberedInTheirOrder) {
-    const QTemporaryDir folder;
-    qputenv("TEMP", folder.path().toLocal8Bit());
-    EXPECT_TRUE(ScriptedFilter(&params, in.get(), out.get(), {.dumpsPictures = true}).Apply());
-    EXPECT_TRUE(filter.Apply());
-    EXPECT_TRUE(ScriptedFilter(&params, in.get(), out.get(), {.dumpsPictures = true}).Apply());
-    qunsetenv("TEMP");
-    const QStringList files = QDir(folder.path()).entryList(QDir::Files, QDir::Name);
-    EXPECT_EQ(files, QStringList({"image_after_Scripted_0_4x7.raw", "image_after_Scripted_1_4x7.raw"}));
-}
-
-TEST_F(TaskTest, MissingObjectsAreReportedByTheConstructor) {
-    LogCapture log;
-    EXPECT_THROW(ScriptedFilter(nullptr, in.get(), out.get()), CBadPtrEx);
-    EXPECT_THROW(ScriptedFilter(&params, in.get(), nullptr), CBadPtrEx);
-    EXPECT_TRUE(log.has("The User Settings object was invalid."));
-    EXPECT_TRUE(log.has("The Output plane was invalid!"));
-    ExceptionStack::clear();
-}
-
-TEST_F(TaskTest, HostPixelsNeedTheDirectProxyAndComeFromItsCopy) {
-    std::uint32_t r = 0;
-    std::uint32_t g = 0;
-    std::uint32_t b = 0;
-    expectBroken([this] { filter.useHostPicture(); }, "IFilter::GetRGBFromHost",
-                 "This version of GetRGBFromHost requires direct proxy.", "Filters/IFilter", 89);
-    const CARGBPlaneProxyDirect own(*testplanes::noise(4, 7));
-    CARGBPlaneProxyDirect proxy(*testplanes::noise(4, 7, 2)); // the process-wide one
-    ScriptedFilter withOwn(&params, in.get(), out.get(), {.proxy = &own});
-    for (const auto& [each, seed] : {std::pair{&filter, 2U}, {&withOwn, 1U}}) {
-        each->useHostPicture();
-        each->GetRGBFromHost(3, 5, r, g, b);
-        const testplanes::Pixel expected = testplanes::at(*testplanes::noise(4, 7, seed), 3, 5);
-        EXPECT_THAT((std::array{r, g, b}), ElementsAre(expected[0], expected[1], expected[2]));
-    }
-    EXPECT_DEATH(proxy.getPixels(0, 0, 1, 1, nullptr, 0),
-                 "\"Do not use this method for CARGBPlaneProxyDirect!\"");
-}
-
-class FailingAnalyzer final : public ISmartAnalyzer {
-public:
-    using ISmartAnalyzer::ISmartAnalyzer;
-
-protected:
-    void Prepare() override {}
-    void Analyze() override { throw 1; }
-};
-
-TEST_F(TaskTest, AnalyzerFailuresReachTheCaller) {
-    const auto messageOf = [](CUserParams* p, CARGBPlane* plane) {
-        try {
-            FailingAnalyzer({}, p, plane).Apply();
-        } catch (const CGenericEx& failure) {
-            return failure.message().toStdString() + "@" + std::to_string(failure.line());
-        }
-        return std::string();
-    };
-    EXPECT_EQ(messageOf(&params, in.get()), "An error occured while running a SmartAnalyzer object.@40");
-    EXPECT_EQ(messageOf(nullptr, in.get()), "The User Settings object was invalid.@26");
-    EXPECT_EQ(messageOf(&params, nullptr), "The analyzer has an invalid Input plane.@31");
-    ExceptionStack::clear();
-}
-
-TEST(RowScheduler, PiecesHalveDownToTheGrainAndCoverTheRange) {
-    std::mutex mutex;
-    std::set<std::pair<unsigned, unsigned>> pieces;
-    forEachRange(0, 202, 200, [&](unsigned begin, unsigned end) {
-        const std::lock_guard lock(mutex);
-        pieces.insert({begin, end});
-    });
-    EXPECT_THAT(pieces, ElementsAre(std::pair{0U, 101U}, std::pair{101U, 202U}));
 }
 
 } // namespace

@@ -1,7 +1,7 @@
 #include "Utility/CARGBPlane.h"
 
-#include "Library/Utility/CARGBPlaneProxyDirect.h"
 #include "Utility/CGenericEx.h"
+#include "support/FailingArrays.h"
 #include "support/LogCapture.h"
 #include "support/TestPlanes.h"
 
@@ -11,25 +11,7 @@
 
 #include <gtest/gtest.h>
 
-#include <new>
-
 using namespace orvela;
-
-namespace {
-int gArraysLeft = -1; // how many arrays can still be had; negative: any number
-}
-
-// The form of allocation that reports a failure as null.
-void* operator new[](std::size_t size, const std::nothrow_t&) noexcept {
-    if (gArraysLeft == 0)
-        return nullptr;
-    gArraysLeft -= gArraysLeft > 0 ? 1 : 0;
-    try {
-        return ::operator new[](size);
-    } catch (const std::bad_alloc&) {
-        return nullptr;
-    }
-}
 
 namespace {
 
@@ -72,15 +54,14 @@ TEST(CARGBPlane, AFailedCopyLeavesAnEmptyPlaneThatTakesTheNextOne) {
     const auto source = testplanes::noise(16, 9);
     for (const int arrays : {0, 1, 2}) {
         CARGBPlane plane(4, 4, QStringLiteral("plane"));
-        gArraysLeft = arrays;
         try {
+            const FailingArrays rest(FailingArrays::kAnySize, arrays);
             plane.copyFrom(*source);
             ADD_FAILURE();
         } catch (const CBadPtrEx& failure) {
             EXPECT_TRUE(isOutOfMemory(failure));
             EXPECT_EQ(innermostMessage(failure), "Unable to allocate plane memory (Indirect error).");
         }
-        gArraysLeft = -1;
         EXPECT_FALSE(plane.isAllocated());
         EXPECT_EQ(plane.width() + plane.height() + plane.pixelCount(), 0);
         EXPECT_EQ(plane.samples(Channel::Red), nullptr);
@@ -122,18 +103,6 @@ TEST(CARGBPlane, RawDumpInterleavesTheChannels) {
     LogCapture log;
     plane->dumpToRaw(folder.filePath("missing/dump.raw").toLocal8Bit());
     EXPECT_TRUE(log.has("Can not open file for writing in CARGBPlane::dumpToRaw"));
-}
-
-TEST(PlaneProxy, LatestProxyIsCurrentAndKeepsItsOwnCopy) {
-    const auto plane = testplanes::uniform(3, 2, {9, 8, 7});
-    {
-        const CARGBPlaneProxyDirect first(*plane);
-        const CARGBPlaneProxyDirect second(*plane);
-        EXPECT_EQ(CARGBPlaneProxy::current(), &second);
-        plane->copyFrom(*testplanes::uniform(3, 2, {0, 0, 0}));
-        EXPECT_EQ(testplanes::at(second.plane(), 2, 1), (testplanes::Pixel{9, 8, 7}));
-    }
-    EXPECT_EQ(CARGBPlaneProxy::current(), nullptr);
 }
 
 } // namespace

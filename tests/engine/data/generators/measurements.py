@@ -5,7 +5,7 @@ SAMPLED = {"CHistogram0": "", "CHistogram_III": "", "CHistogram_IV": "mAuto_Colo
            "CHistogram_VIII": "DigitalFlashEnabled", "CHistogram_Luma_after_Orv": "OrvelaLevelEnabled"}
 # width, height, step and the numbers of sampled columns and rows
 GRIDS = [(699, 9, 1, 698, 8), (9, 699, 1, 8, 698), (700, 100, 5, 139, 19), (2000, 30, 10, 199, 2),
-         (1001, 1001, 5, 199, 199), (1200, 60, 6, 199, 9), (1000, 20, 5, 199, 3), (30, 1403, 7, 3, 199), (2, 2, 1, 1, 1),
+         (1001, 1001, 5, 200, 199), (1200, 60, 6, 199, 9), (1000, 20, 5, 199, 3), (30, 1403, 7, 4, 199), (2, 2, 1, 1, 1),
          (800, 4, 5, 159, 0)]
 
 
