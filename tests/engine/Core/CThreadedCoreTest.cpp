@@ -1,17 +1,21 @@
 #include "Core/CThreadedCore_FinalTouch.h"
 #include "Core/CThreadedCore_Orvela.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
+#include "SmartAnalyzers/ISmartAnalyzer.h"
 #include "Utility/CGenericEx.h"
 #include "Utility/RowScheduler.h"
+#include "support/FailingArrays.h"
 #include "support/LogCapture.h"
 #include "support/TestPlanes.h"
 
 #include <QMetaMethod>
+#include <QRect>
 #include <QThread>
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <thread>
 
 using namespace orvela;
@@ -25,6 +29,7 @@ template <typename Core = CThreadedCore_Orvela>
 struct Session {
     Session(std::unique_ptr<CARGBPlane> picture, EGUIMode mode)
         : in(std::move(picture)), out(*in, QStringLiteral("out")), proxy(*in), core(in.get(), &out) {
+        core.setContext({.proxy = &proxy});
         core.setParams(CUserParamsPhotoshop(mode));
         QObject::connect(
             &core, &CThreadedCore::stepDone, &core, [this](int step, int total, const QString& name) {
@@ -105,6 +110,16 @@ TEST(CThreadedCore, StopFromAnotherThreadReleasesAWaitingRun) {
     EXPECT_TRUE(core.lastProcessingDone());
 }
 
+// An analyzer without memory, whose failure reaches the run wrapped.
+class FailingAnalyzer final : public ISmartAnalyzer {
+public:
+    using ISmartAnalyzer::ISmartAnalyzer;
+
+protected:
+    void Prepare() override {}
+    void Analyze() override { throw COutOfMemoryEx(QStringLiteral("no room to count"), "x", 1); }
+};
+
 class FailingCore final : public CThreadedCore {
 public:
     using CThreadedCore::CThreadedCore;
@@ -112,19 +127,113 @@ public:
 protected:
     bool doRun() override {
         emitPercentDone(40);
-        throw CGenericEx(QStringLiteral("broken"), "x", 1);
+        const auto make = [](const RunContext& context, CUserParams* params, CARGBPlane* in,
+                             CARGBPlane*) -> std::unique_ptr<TaskBase> {
+            return std::make_unique<FailingAnalyzer>(context, params, in);
+        };
+        runTask({"FailingAnalyzer", TaskKind::Analyzer, make});
+        return true;
     }
 };
 
-TEST(CThreadedCore, FailureIsAnnouncedAndForgotten) {
+TEST(CThreadedCore, AnAnalyzersFailureEndsTheRunAndIsForgottenByTheProcess) {
     LogCapture log;
     Session<FailingCore> session(testplanes::noise(8, 8), Mode_Advanced);
     session.core.run();
-    EXPECT_THAT(session.steps, ElementsAre("0/1 Duplicating Input Plane", testing::EndsWith(" Failed")));
+    EXPECT_THAT(session.steps, ElementsAre("0/1 Duplicating Input Plane", "0/1 Failed"));
     EXPECT_THAT(session.percents, ElementsAre(40, 0));
     EXPECT_FALSE(session.core.lastProcessingDone());
+    EXPECT_EQ(session.core.failure().cause, "no room to count");
+    EXPECT_TRUE(session.core.failure().outOfMemory);
     EXPECT_TRUE(log.has("Core/CThreadedCore 50"));
     EXPECT_TRUE(ExceptionStack::entries().isEmpty());
+}
+
+// The noise filter finds no memory for its second table; the run is as one without it.
+TEST(CThreadedCore, AFailedFilterIsReportedAndTheRunGoesOnWithThePictureAsItWas) {
+    std::vector<std::vector<std::uint8_t>> results;
+    for (const bool fails : {false, true}) {
+        Session<> session(testplanes::noise(40, 30), Mode_Advanced);
+        CUserParamsPhotoshop params;
+        params.mSliderParams.ContrastEnabled = true;
+        params.mSliderParams.ContrastValue = 750;
+        params.mSliderParams.BilinearFilteringEnabled = fails;
+        session.core.setParams(params);
+        const FailingArrays none(195076 * sizeof(float));
+        session.core.run();
+        EXPECT_EQ(session.steps.back(), "1/1 All Done");
+        for (const TaskReport& report : session.core.reports()) {
+            const bool failed = report.outcome == TaskOutcome::Failed;
+            EXPECT_EQ(failed, fails && report.name == std::string("CBilinear"));
+            EXPECT_EQ(report.failure.outOfMemory, failed);
+            EXPECT_EQ(report.failure.cause,
+                      failed ? "Bilinear filter was unable to declare the m_sBilinear floats array." : "");
+        }
+        results.push_back(testplanes::bytes(*session.in));
+    }
+    EXPECT_EQ(results[0], results[1]);
+    EXPECT_NE(results[0], testplanes::bytes(*testplanes::noise(40, 30)));
+    ExceptionStack::clear();
+}
+
+// A run with threads of its own, which logs a line at every announcement.
+template <typename Core>
+std::vector<std::uint8_t> runWith(int threads, int width, int height, const CUserParamsPhotoshop& params) {
+    RowScheduler scheduler(threads);
+    Session<Core> session(testplanes::noise(width, height, static_cast<std::uint32_t>(width)), Mode_Advanced);
+    session.core.setContext({.proxy = &session.proxy, .scheduler = &scheduler});
+    session.core.setParams(params);
+    session.onStep = [](const QString&) { Log::log(LogLevel::Debug, "a step"); };
+    session.core.run();
+    EXPECT_TRUE(session.core.lastProcessingDone());
+    EXPECT_NE(testplanes::bytes(*session.in), testplanes::bytes(session.proxy.plane()));
+    return testplanes::bytes(*session.in);
+}
+
+TEST(CThreadedCore, RunsSideBySideGiveWhatTheyGiveAlone) {
+    const auto main = [] {
+        return runWith<CThreadedCore_Orvela>(3, 233, 150, CUserParamsPhotoshop(Mode_LandscapePro));
+    };
+    const auto touch = [] {
+        CUserParamsPhotoshop params;
+        params.mSliderParams.mColor_Touch_Enabled = true;
+        params.mSliderParams.mColor_Intensity_Touch_Value = 600;
+        params.mSliderParams.mPerceptual_Touch_Dark_RGB_Enabled = true;
+        params.mSliderParams.mPerceptual_Touch_Dark_Value_RGB = 900;
+        return runWith<CThreadedCore_FinalTouch>(2, 120, 440, params);
+    };
+    const LogCapture log;
+    const auto mainAlone = main();
+    const auto touchAlone = touch();
+    std::thread other([&] {
+        for (int i = 0; i < 6; ++i)
+            EXPECT_TRUE(touch() == touchAlone);
+    });
+    for (int i = 0; i < 3; ++i)
+        EXPECT_TRUE(main() == mainAlone);
+    other.join();
+    const auto steps = std::count_if(log.lines().begin(), log.lines().end(),
+                                     [](const std::string& line) { return line.ends_with("a step"); });
+    EXPECT_EQ(std::count(log.lines().begin(), log.lines().end(), "a step"), steps) << "none is indented";
+    EXPECT_EQ(steps, 4 * 37 + 7 * 2);
+}
+
+TEST(CThreadedCore, ASnapshotStaysWhileTheRunGoesOn) {
+    Session<> session(testplanes::noise(40, 30), Mode_LandscapePro);
+    std::unique_ptr<CARGBPlane> whole;
+    std::unique_ptr<CARGBPlane> part;
+    std::vector<std::uint8_t> then;
+    session.onStep = [&](const QString& name) {
+        if (name != "Saturation")
+            return;
+        then = testplanes::bytes(*session.in);
+        whole = session.core.snapshot();
+        part = session.core.snapshot({39, 29, 5, 5}, 1);
+    };
+    session.core.run();
+    EXPECT_EQ(testplanes::bytes(*whole), then);
+    EXPECT_NE(testplanes::bytes(*session.in), then);
+    EXPECT_EQ(testplanes::bytes(*part), (std::vector{then[1199], then[2399], then[3599]}));
 }
 
 TEST(CThreadedCore, ProgressComesOnTheRunsThreadAndItsHandlersCanStop) {
