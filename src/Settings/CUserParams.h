@@ -87,7 +87,7 @@ struct StatisticField {
     const char* meaning;
     double low;         ///< lowest value
     double high;        ///< highest value; infinite when there is none
-    const char* writer; ///< class names of the tasks that write it, after commas; empty when none does
+    const char* writer; ///< class names of the tasks that write it, between commas; empty when none does
 
     /// Flags are 0 and 1.
     double valueIn(const CUserParams& params) const;
