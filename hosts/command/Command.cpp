@@ -58,8 +58,6 @@ ExitStatus perform(const Action& action) {
 int runProgram(int argc, char** argv) {
     StopSignals signals;
     QCoreApplication application(argc, argv);
-    QCoreApplication::setOrganizationName(QStringLiteral("Kestrand"));
-    QCoreApplication::setApplicationName(QStringLiteral("Orvela"));
 
     CLI::App program("Enhances photographs.", "orvela");
     program.set_version_flag("--version", "orvela " ORVELA_VERSION);

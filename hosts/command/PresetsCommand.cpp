@@ -89,9 +89,8 @@ void PresetsOptions::declare(CLI::App& app, const std::function<void(std::functi
 }
 
 ExitStatus listPresets(const PresetsOptions& options) {
-    for (const QString& name : PresetTree::names(modeOf(options.mode)))
-        if (name != PresetTree::batchPresetName())
-            std::cout << name.toStdString() << '\n';
+    for (const QString& name : PresetTree::offeredNames(modeOf(options.mode)))
+        std::cout << name.toStdString() << '\n';
     std::cout.flush();
     return ExitStatus::Done;
 }

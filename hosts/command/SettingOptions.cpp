@@ -97,7 +97,16 @@ void applyField(CSliderParams& sliders, const std::string& text) {
     sliders.*enabled = TextValues::onOrOff("--set " + name, given.substr(comma + 1));
 }
 
+// Puts the final-touch sliders that are off to their neutral positions: a midtone filter that one of them
+// switches on reads the others' too.
+void neutralizeFinalTouch(CSliderParams& sliders) {
+    for (const PaneSlider& each : PaneTable::sliders(Mode_FinalTouch))
+        if (!(sliders.*each.slider.enabled))
+            sliders.*each.slider.value = static_cast<float>(each.initial);
+}
+
 void applyFinalTouch(CSliderParams& sliders, const std::string& text) {
+    neutralizeFinalTouch(sliders);
     const std::vector<NamedSlider> known = ModeNames::finalTouchSliders();
     for (const std::string& part : TextValues::split(text, ',')) {
         const auto [name, given] = TextValues::assignment("--final-touch", part);

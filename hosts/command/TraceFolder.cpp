@@ -34,9 +34,16 @@ Photograph photographOf(const CARGBPlane& plane) {
 
 nlohmann::ordered_json statisticsOf(const CUserParams& params) {
     nlohmann::ordered_json statistics;
-#define ORVELA_STATISTIC_FIELD(type, name, value, listed) statistics[#name] = params.name;
-#define ORVELA_KEPT_FIELD(type, name, listed) statistics[#name] = params.name;
-#include "Settings/StatisticFields.inc"
+    for (const StatisticField& field : statisticFields())
+        std::visit(
+            [&](auto member) {
+                // An infinite end of the range becomes null.
+                statistics[field.name] = {{"value", params.*member},
+                                          {"meaning", field.meaning},
+                                          {"range", {field.low, field.high}},
+                                          {"writer", field.writer}};
+            },
+            field.member);
     return statistics;
 }
 

@@ -9,12 +9,23 @@
 #include <QTextStream>
 
 #include <algorithm>
+#include <limits>
 #include <type_traits>
 #include <vector>
 
 using namespace orvela;
 
 namespace {
+
+constexpr double kNoLimit = std::numeric_limits<double>::infinity();
+
+constexpr StatisticField kStatisticFields[] = {
+#define ORVELA_STATISTIC_FIELD(type, name, start, listed, meaning, low, high, writer)                        \
+    {#name, &CUserParams::name, listed, meaning, low, high, writer},
+#define ORVELA_KEPT_FIELD(type, name, meaning, low, high, writer)                                            \
+    {#name, &CUserParams::name, 0, meaning, low, high, writer},
+#include "Settings/StatisticFields.inc"
+};
 
 // One line of the listing.
 struct ListedLine {
@@ -59,6 +70,26 @@ void listSliders(const CSliderParams& sliders, const char* name) {
 
 } // namespace
 
+namespace orvela {
+
+double StatisticField::valueIn(const CUserParams& params) const {
+    return std::visit([&params](auto member) { return static_cast<double>(params.*member); }, member);
+}
+
+void StatisticField::setIn(CUserParams& params, double value) const {
+    std::visit(
+        [&params, value](auto member) {
+            params.*member = static_cast<std::remove_reference_t<decltype(params.*member)>>(value);
+        },
+        member);
+}
+
+std::span<const StatisticField> statisticFields() {
+    return kStatisticFields;
+}
+
+} // namespace orvela
+
 CUserParams::CUserParams() = default;
 
 void CUserParams::reset() {
@@ -66,8 +97,8 @@ void CUserParams::reset() {
     mProgressCallback = nullptr;
     mCancelRequested = false;
     Final_Touch_Mode_Enabled = false;
-#define ORVELA_STATISTIC_FIELD(type, name, value, listed) name = value;
-#define ORVELA_KEPT_FIELD(type, name, listed)
+#define ORVELA_STATISTIC_FIELD(type, name, start, listed, meaning, low, high, writer) name = start;
+#define ORVELA_KEPT_FIELD(type, name, meaning, low, high, writer)
 #include "Settings/StatisticFields.inc"
     for (Histogram* histogram : {&pHisto_Luma, &pHisto_Red, &pHisto_Green, &pHisto_Blue})
         histogram->fill(0.0);
@@ -89,9 +120,9 @@ void CUserParams::list(const QString& name) const {
     Log::scopeEntry(LogLevel::Debug, "Begin Globals Listing: %s", shown.constData());
     listSliders(mSliderParams, shown.constData());
     std::vector<ListedLine> lines;
-#define ORVELA_STATISTIC_FIELD(type, name, value, listed) addLine(lines, listed, #name, name);
-#define ORVELA_KEPT_FIELD(type, name, listed) addLine(lines, listed, #name, name);
-#include "Settings/StatisticFields.inc"
+    for (const StatisticField& field : kStatisticFields)
+        std::visit([&](auto member) { addLine(lines, field.listed, field.name, this->*member); },
+                   field.member);
     logInOrder(lines);
     Log::scopeExit(LogLevel::Debug, "End Globals Listing.");
 }

@@ -11,6 +11,8 @@
 #include <atomic>
 #include <cstdint>
 #include <functional>
+#include <span>
+#include <variant>
 
 namespace orvela {
 
@@ -62,8 +64,8 @@ public:
     bool Final_Touch_Mode_Enabled = false;
     CSliderParams mSliderParams;
 
-#define ORVELA_STATISTIC_FIELD(type, name, value, listed) type name = value;
-#define ORVELA_KEPT_FIELD(type, name, listed) type name = {};
+#define ORVELA_STATISTIC_FIELD(type, name, start, listed, meaning, low, high, writer) type name = start;
+#define ORVELA_KEPT_FIELD(type, name, meaning, low, high, writer) type name = {};
 #include "Settings/StatisticFields.inc"
 
     orvela::Histogram pHisto_Luma = {};
@@ -73,6 +75,27 @@ public:
 };
 
 namespace orvela {
+
+/// One picture flag, statistic or derived factor of CUserParams.
+struct StatisticField {
+    using Member = std::variant<bool CUserParams::*, std::int32_t CUserParams::*, float CUserParams::*,
+                                double CUserParams::*>;
+
+    const char* name;
+    Member member;
+    int listed; ///< position among the lines of the listing, 0 when it has none
+    const char* meaning;
+    double low;         ///< lowest value
+    double high;        ///< highest value; infinite when there is none
+    const char* writer; ///< class names of the tasks that write it, between commas; empty when none does
+
+    /// Flags are 0 and 1.
+    double valueIn(const CUserParams& params) const;
+    void setIn(CUserParams& params, double value) const;
+};
+
+/// All of them, in order.
+std::span<const StatisticField> statisticFields();
 
 /// The single slider that a single-filter mode shows.
 struct GenericSlider {

@@ -122,6 +122,12 @@ QStringList names(EGUIMode mode) {
     return names;
 }
 
+QStringList offeredNames(EGUIMode mode) {
+    QStringList offered = names(mode);
+    offered.removeAll(batchPresetName());
+    return offered;
+}
+
 bool hasPresets() {
     QSettings settings = openSettings();
     settings.beginGroup(kPresets);

@@ -59,6 +59,9 @@ QString batchPresetName();
 /// not a mode.
 QStringList names(EGUIMode mode);
 
+/// The same without the reserved one: what the user is offered.
+QStringList offeredNames(EGUIMode mode);
+
 /// True when there is a preset of any mode, also a reserved one.
 bool hasPresets();
 

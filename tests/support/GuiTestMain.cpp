@@ -34,8 +34,6 @@ int main(int argc, char** argv) {
     qputenv("XDG_CONFIG_HOME", settings.path().toLocal8Bit());
     qInstallMessageHandler(collect);
     QApplication application(argc, argv);
-    QCoreApplication::setOrganizationName(QStringLiteral("Kestrand"));
-    QCoreApplication::setApplicationName(QStringLiteral("OrvelaGuiTests"));
     orvela::setSettingsApplication(QStringLiteral("OrvelaGuiTests"));
     testing::UnitTest::GetInstance()->listeners().Append(new WarningListener);
     return RUN_ALL_TESTS();

@@ -1,9 +1,11 @@
 #pragma once
 
 #include "Settings/CUserParams.h"
+#include "Settings/SettingFields.h"
 
 #include <QStringList>
 
+#include <algorithm>
 #include <stdexcept>
 
 namespace orvela {
@@ -26,24 +28,22 @@ inline double* namedBin(CUserParams& params, const QString& name) {
 /// Sets a slider, a switch, a statistic or a flag by its name, or a bin. Throws
 /// std::invalid_argument for other names.
 inline void setField(CUserParams& params, const QString& name, double value) {
-    double* const bin = namedBin(params, name);
-    if (bin)
+    if (name == "Final_Touch_Mode_Enabled")
+        params.Final_Touch_Mode_Enabled = value != 0;
+    else if (double* const bin = namedBin(params, name))
         *bin = value;
-    bool known = bin != nullptr;
-    const auto take = [&](const char* field, auto& target) {
-        if (name != field)
-            return;
-        target = static_cast<std::remove_reference_t<decltype(target)>>(value);
-        known = true;
-    };
-    take("Final_Touch_Mode_Enabled", params.Final_Touch_Mode_Enabled);
-#define ORVELA_SLIDER_FIELD(type, field, listed) take(#field, params.mSliderParams.field);
-#include "Settings/SliderFields.inc"
-#define ORVELA_STATISTIC_FIELD(type, field, start, listed) take(#field, params.field);
-#define ORVELA_KEPT_FIELD(type, field, listed) take(#field, params.field);
-#include "Settings/StatisticFields.inc"
-    if (!known)
-        throw std::invalid_argument(name.toStdString());
+    else if (const SliderField* field = SettingFields::find(name.toStdString()); field && field->value)
+        params.mSliderParams.*field->value = static_cast<float>(value);
+    else if (field)
+        params.mSliderParams.*field->flag = value != 0;
+    else {
+        const auto fields = statisticFields();
+        const auto found = std::find_if(fields.begin(), fields.end(),
+                                        [&name](const StatisticField& each) { return name == each.name; });
+        if (found == fields.end())
+            throw std::invalid_argument(name.toStdString());
+        found->setIn(params, value);
+    }
 }
 
 /// Sets fields from text: "name=value name=value name", where a name alone is a switch that is on.

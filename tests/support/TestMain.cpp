@@ -10,8 +10,6 @@ int main(int argc, char** argv) {
     const QTemporaryDir settings; // nobody's own settings are touched
     qputenv("XDG_CONFIG_HOME", settings.path().toLocal8Bit());
     QCoreApplication application(argc, argv);
-    QCoreApplication::setOrganizationName(QStringLiteral("Kestrand"));
-    QCoreApplication::setApplicationName(QStringLiteral("OrvelaTests"));
     orvela::setSettingsApplication(QStringLiteral("OrvelaTests"));
     return RUN_ALL_TESTS();
 }

@@ -16,11 +16,13 @@ CWgtPaneGenericImpl::CWgtPaneGenericImpl(QWidget* owner, EGUIMode mode)
     setupUi(this);
     sldrGeneric->setFixedWidth(kSliderWidth);
     const CUserParamsPhotoshop factory(mode);
-    if (mSlider)
-        setUpSliders({mSlider, 1}, factory.mSliderParams);
-    for (const PaneColor& color : PaneTable::colors(mode))
+    if (!mSlider)
+        return;
+    setUpSliders({mSlider, 1}, factory.mSliderParams);
+    mColors = PaneTable::colors(mode);
+    for (const PaneColor& color : mColors)
         addColorPicker(color.object);
-    showColors(PaneTable::colors(mode), factory.mSliderParams);
+    showColors(mColors, factory.mSliderParams);
 }
 
 void CWgtPaneGenericImpl::addColorPicker(const char* object) {
@@ -35,7 +37,7 @@ void CWgtPaneGenericImpl::applyGUIParams(CUserParams& params) {
     CSliderParams& settings = params.mSliderParams;
     if (mSlider)
         settings.*mSlider->slider.value = static_cast<float>(sldrGeneric->value());
-    writeColors(PaneTable::colors(mode()), settings);
+    writeColors(mColors, settings);
 }
 
 CThreadedCore* CWgtPaneGenericImpl::createCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* owner) {

@@ -19,4 +19,5 @@ private:
     void addColorPicker(const char* object);
 
     const orvela::PaneSlider* mSlider;
+    std::span<const orvela::PaneColor> mColors; ///< none without a slider
 };

@@ -81,10 +81,7 @@ QString batchPresetName() {
 }
 
 QStringList listPresets(EGUIMode mode, bool excludeBatch) {
-    QStringList names = PresetTree::names(mode);
-    if (excludeBatch)
-        names.removeAll(batchPresetName());
-    return names;
+    return excludeBatch ? PresetTree::offeredNames(mode) : PresetTree::names(mode);
 }
 
 bool presetExists(EGUIMode mode, const QString& name) {

@@ -82,6 +82,12 @@ TEST(GenericPane, DrivesTheOneFieldOfItsMode) {
     }
 }
 
+TEST(GenericPane, DrivesNothingInAModeWithoutASliderOfItsOwn) {
+    Shown<CWgtPaneGenericImpl> shown(Mode_Advanced);
+    EXPECT_EQ(shown.pane->findChild<CColorPicker*>(), nullptr);
+    expectWrites(shown.pane, {}, "", {});
+}
+
 TEST(GenericPane, ColorFilterStartsWithGreenAndShowsItsPickerWhileOn) {
     Shown<CWgtPaneGenericImpl> shown(Mode_ColorFilter);
     auto* picker = shown.pane->findChild<CColorPicker*>(QStringLiteral("colrPickGeneric"));

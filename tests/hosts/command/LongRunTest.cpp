@@ -98,7 +98,10 @@ TEST_F(LongRunTest, TheTraceShowsEveryStepThatChangedThePicture) {
     ASSERT_GE(traced.size(), 2);
     EXPECT_TRUE(traced[0].startsWith(QStringLiteral("01-")) && traced[0].endsWith(QStringLiteral(".json")));
     const QJsonObject step = QJsonDocument::fromJson(bytes(qPrintable("t/" + traced[0]))).object();
-    EXPECT_TRUE(step["statistics"].toObject().contains(QStringLiteral("m_M_H_L_F_R")));
+    const QJsonObject dark = step["statistics"].toObject()["m_Dark_Acu"].toObject();
+    EXPECT_TRUE(dark["value"].toDouble() > 0 && dark["range"].toArray()[1] == 1) << "a share";
+    EXPECT_EQ(dark["writer"], "CHistogram0");
+    EXPECT_TRUE(dark["meaning"].toString().contains("luma from 1 to 85"));
     EXPECT_EQ(step["histograms"].toObject()["luma"].toArray().size(), 256);
     const Photograph last = readPhotograph(path(qPrintable("t/" + traced.last())).toStdString());
     EXPECT_EQ(last.samples, readPhotograph(path("x.png").toStdString()).samples);

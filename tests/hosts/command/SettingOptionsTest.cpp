@@ -79,6 +79,7 @@ TEST(SettingOptions, FinalTouchRunsApartFromTheMode) {
     EXPECT_EQ(touch.mColor_Touch_Value_B, 7);
     EXPECT_EQ(touch.SaturationValue, 0);
     EXPECT_FALSE(run.params.mSliderParams.mColor_Touch_Enabled);
+    EXPECT_EQ(touch.mMiddle_Touch_Value_B, 500) << "neutral, as in the window";
 }
 
 TEST(SettingOptions, WhatIsOutOfRangeIsRefusedWithTheRange) {
