@@ -1,6 +1,8 @@
 // Every task alone and whole runs at 1, 6 and 24 megapixels: nanoseconds per pixel, and as a ratio to P, a
-// plain row-parallel copy of three planes measured in the same process (machines differ, ratios hardly).
+// plain row-parallel copy of three planes measured in the same process (machines differ, ratios hardly),
+// beside the bar that a task is held to at 24 megapixels. ORVELA_BENCH_THREADS sets the number of threads.
 
+#include "Bars.h"
 #include "Core/CThreadedCore_Orvela.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
 #include "Utility/RowScheduler.h"
@@ -14,6 +16,7 @@
 #include <chrono>
 #include <cmath>
 #include <cstring>
+#include <iostream>
 
 using namespace orvela;
 
@@ -114,6 +117,7 @@ void benchTask(benchmark::State& state, const PipelineTask& task, const Size& si
     CUserParamsPhotoshop measured = tasksettings::paramsFor(task.name);
     Scene& scene = sceneOf(size);
     tasksettings::measure(measured, scene.in, scene.out);
+    state.counters["bar"] = barOf(task.name);
     measure(state, size, [&](Scene& each) {
         CUserParamsPhotoshop params = measured;
         task.make({}, &params, &each.in, &each.out)->Apply();
@@ -146,6 +150,14 @@ void benchBareRun(benchmark::State& state, EGUIMode mode, const Size& size) {
     });
 }
 
+// Every task has a bar, and every bar a task.
+void checkBars() {
+    for (const PipelineTask& task : tasksettings::allTasks())
+        barOf(task.name);
+    for (const Bar& bar : kBars)
+        tasksettings::taskNamed(bar.task);
+}
+
 void registerAll() {
     const std::pair<const char*, EGUIMode> modes[] = {{"Automatic", Mode_Automatic},
                                                       {"LandscapePro", Mode_LandscapePro}};
@@ -155,7 +167,7 @@ void registerAll() {
                 ->UseManualTime()
                 ->Unit(benchmark::kMillisecond);
         };
-        for (const PipelineTask& task : PipelineTable::allTasks())
+        for (const PipelineTask& task : tasksettings::allTasks())
             add(std::string("task/") + task.name,
                 [task, &size](benchmark::State& state) { benchTask(state, task, size); });
         for (const auto& [name, mode] : modes) {
@@ -172,9 +184,14 @@ void registerAll() {
 int main(int argc, char** argv) {
     QCoreApplication application(argc, argv);
     const int threads = qEnvironmentVariableIntValue("ORVELA_BENCH_THREADS");
-    const orvela::RowScheduler scheduler(threads);
+    try {
+        checkBars();
+    } catch (const std::invalid_argument& failure) {
+        std::cerr << failure.what() << '\n';
+        return 1;
+    }
     registerAll();
     benchmark::Initialize(&argc, argv);
-    benchmark::RunSpecifiedBenchmarks();
+    RowScheduler(threads).execute([] { benchmark::RunSpecifiedBenchmarks(); });
     return 0;
 }
