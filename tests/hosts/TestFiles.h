@@ -7,10 +7,29 @@
 #include <filesystem>
 #include <fstream>
 #include <iterator>
+#include <stdexcept>
 #include <string>
 #include <vector>
 
 namespace orvela {
+
+/// The rows of a table in the tests' data: cells parted by " | ", lines that begin with # left out. A table
+/// without rows is an exception.
+inline std::vector<std::vector<std::string>> tableRows(const std::string& name) {
+    std::ifstream file(ORVELA_TEST_DATA "/" + name);
+    std::vector<std::vector<std::string>> rows;
+    for (std::string line; std::getline(file, line);) {
+        if (line.starts_with('#'))
+            continue;
+        std::vector<std::string>& cells = rows.emplace_back();
+        for (std::size_t end; (end = line.find(" | ")) != std::string::npos; line.erase(0, end + 3))
+            cells.push_back(line.substr(0, end));
+        cells.push_back(line);
+    }
+    if (rows.empty())
+        throw std::runtime_error("no rows in " + name);
+    return rows;
+}
 
 /// A folder of its own for one test, removed with everything in it; shell commands run there with $S naming
 /// the sample photographs.

@@ -1,9 +1,7 @@
 #include "SmartAnalyzers/ISmartAnalyzer.h"
 
-#include "Filters/Kernels/HistogramRecount.h"
 #include "Utility/CGenericEx.h"
-#include "support/ParamsText.h"
-#include "support/TaskSettings.h"
+#include "support/TestPlanes.h"
 
 #include <gtest/gtest.h>
 
@@ -35,20 +33,6 @@ TEST(ISmartAnalyzer, FailuresReachTheCaller) {
     EXPECT_EQ(messageOf(nullptr, plane.get()), "The User Settings object was invalid.@26");
     EXPECT_EQ(messageOf(&params, nullptr), "The analyzer has an invalid Input plane.@31");
     ExceptionStack::clear();
-}
-
-// Those of the shadows and highlights leave the histograms that they counted, once they have work.
-TEST(ISmartAnalyzer, ShadowsAndHighlightsLeaveTheirCounts) {
-    const auto plane = testplanes::noise(40, 450);
-    for (const char* level : {"Dark", "Right"}) {
-        CUserParams counted;
-        recountHistograms(*plane, counted, 5, 1);
-        CUserParams params = paramsFrom("PerceptualDarkEnabled");
-        const std::string task = std::string("CSmartAnalyzer_Perceptual_Level_") + level;
-        EXPECT_TRUE(tasksettings::apply(task, params, *plane));
-        EXPECT_EQ(params.pHisto_Luma, counted.pHisto_Luma) << level;
-        EXPECT_EQ(params.pHisto_Blue, counted.pHisto_Blue) << level;
-    }
 }
 
 } // namespace

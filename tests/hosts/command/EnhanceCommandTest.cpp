@@ -157,13 +157,4 @@ TEST_F(EnhanceCommandTest, LoopsOfLinksAreNamed) {
     EXPECT_TRUE(exists("a-enhanced.png"));
 }
 
-TEST_F(EnhanceCommandTest, AnyNumberOfThreadsGivesTheSameBytes) {
-    sample("a.png");
-    for (const std::string count : {"1", "2", "7"})
-        orvela(("enhance a.png --mode landscapepro --threads " + count + " -o " + count + ".png").c_str());
-    EXPECT_FALSE(bytes("1.png").isEmpty());
-    EXPECT_EQ(bytes("1.png"), bytes("2.png"));
-    EXPECT_EQ(bytes("1.png"), bytes("7.png"));
-}
-
 } // namespace

@@ -151,6 +151,17 @@ def case(analyzer, *switches, plane=MIXED, counts=None, **values):
                 *(["pattern"] if counts is None else []), f"writes {numbers(writes)}".strip())
 
 
+def recounted(level, rows, split):
+    """What the analyzer leaves in the histograms: the rows are cut at `split`, samples start anew in each piece."""
+    counts = {y: 15 if (y if y < split else y - split) % 5 == 0 else 0 for y in range(rows)}
+    bins = {f"pHisto_Red[{y}]": count for y, count in counts.items()}
+    bins.update({f"pHisto_Green[{255 - y}]": count for y, count in counts.items()})
+    bins.update({"pHisto_Blue[7]": sum(counts.values()), "pHisto_Luma[87]": sum(counts.values())})
+    picture = " ".join(f"{y},{255 - y},7*3" for y in range(rows))
+    return line("CSmartAnalyzer_Perceptual_Level_" + level, "PerceptualDarkEnabled", f"in 3x{rows} {picture}",
+                "stat " + numbers(bins))
+
+
 FINAL = "Final_Touch_Mode_Enabled"
 TOUCH = {level: [f"mPerceptual_Touch_{level}_{suffix}_Enabled" for suffix in SUFFIXES] for level in LEVELS}
 SLIDERS = ["Brightness2Value", "mPerceptual_Brightness_Touch_Value"]
@@ -195,6 +206,9 @@ def cases():
         yield case(middle, "PerceptualDarkEnabled", counts=counts)
 
     yield case(flash, m_OriginalLuma=100)
+    for level in ("Dark", "Right"):
+        for rows, split in ((200, 200), (201, 100), (202, 101)):
+            yield recounted(level, rows, split)
     for luma in (0, 100, 100.5, 254, 255):
         yield case(flash, "DigitalFlashEnabled", m_OriginalLuma=luma)
     yield case(flash, "DigitalFlashEnabled", m_OriginalLuma=100, counts={})
