@@ -42,6 +42,7 @@ public:
     }
     ~TestFolder() { std::filesystem::remove_all(mPath); }
 
+    const std::filesystem::path& path() const { return mPath; }
     std::filesystem::path operator/(const std::string& name) const { return mPath / name; }
 
     /// A command that fails, or is missing, fails the test.

@@ -107,36 +107,6 @@ TEST(SettingOptions, WhatIsOutOfRangeIsRefusedWithTheRange) {
 
 class SettingCommandTest : public ProgramTest {};
 
-TEST_F(SettingCommandTest, UsageErrorsReachTheUserBeforeAnyWork) {
-    sample("a.png");
-    const Answer unknown = orvela("enhance a.png --mode portrat");
-    EXPECT_EQ(unknown.status, 2);
-    EXPECT_TRUE(unknown.says("did you mean Portrait?"));
-    const Answer range = orvela("enhance a.png --mode smartbrightness --value -256");
-    EXPECT_EQ(range.status, 2);
-    EXPECT_TRUE(range.says("from -255 to 255"));
-    EXPECT_EQ(files().size(), 1);
-}
-
-TEST_F(SettingCommandTest, APresetGivesTheSameResultAndKeepsWhatItDoesNotKnow) {
-    sample("a.png");
-    store("old.json",
-          R"({"version": 1, "mood": "calm", "settings": {"Sparkle": 3, "SaturationValue": 900}})");
-    const Answer saved = orvela("enhance a.png --mode Portrait --preset old.json --set SaturationEnabled=on "
-                                "--final-touch AbsContrast=40 --save-preset new.json -o 1.png");
-    EXPECT_EQ(saved.status, 0);
-    EXPECT_TRUE(saved.says("mood") && saved.says("Sparkle")) << saved.err;
-    EXPECT_TRUE(bytes("new.json").contains("\"mood\": \"calm\""));
-    EXPECT_EQ(orvela("enhance a.png --preset new.json -o 2.png").status, 0);
-    EXPECT_EQ(bytes("1.png"), bytes("2.png"));
-    EXPECT_EQ(
-        orvela("enhance a.png --mode Portrait --preset old.json --set SaturationEnabled=on -o 3.png").status,
-        0);
-    EXPECT_NE(bytes("1.png"), bytes("3.png")) << "the final touch";
-    store("bad.json", "{}");
-    EXPECT_EQ(orvela("enhance a.png --preset bad.json -o 4.png").status, 2);
-}
-
 TEST_F(SettingCommandTest, EveryModeIsListedWithItsSliders) {
     const Answer json = orvela("modes --json");
     ASSERT_EQ(json.status, 0);
