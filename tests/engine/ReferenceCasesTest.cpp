@@ -160,7 +160,6 @@ TEST_P(ReferenceCases, Hold) {
             ADD_FAILURE() << failure.what();
         }
     }
-    ExceptionStack::clear();
 }
 
 INSTANTIATE_TEST_SUITE_P(All, ReferenceCases, testing::ValuesIn(files()), [](const auto& file) {

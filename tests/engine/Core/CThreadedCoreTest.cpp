@@ -173,7 +173,6 @@ TEST(CThreadedCore, AFailedFilterIsReportedAndTheRunGoesOnWithThePictureAsItWas)
     }
     EXPECT_EQ(results[0], results[1]);
     EXPECT_NE(results[0], testplanes::bytes(*testplanes::noise(40, 30)));
-    ExceptionStack::clear();
 }
 
 // A run with threads of its own, which logs a line at every announcement.

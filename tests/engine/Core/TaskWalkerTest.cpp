@@ -239,7 +239,6 @@ TEST(RunWalker, EveryModeHandlesEveryPictureOfEverySmallSize) {
             }
         }
     }
-    ExceptionStack::clear();
 }
 
 // All switches, or one alone.
@@ -272,7 +271,6 @@ TEST(RunWalker, EverySwitchOnAtEveryPosition) {
             }
         }
     }
-    ExceptionStack::clear();
 }
 
 } // namespace

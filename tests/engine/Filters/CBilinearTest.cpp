@@ -20,5 +20,4 @@ TEST(CBilinear, MissingMemoryForEitherTableEndsTheFilter) {
     }
     EXPECT_EQ(ExceptionStack::oldestMessage(),
               "Bilinear filter was unable to declare the m_cBilinear floats array.");
-    ExceptionStack::clear();
 }

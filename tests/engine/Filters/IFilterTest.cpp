@@ -50,7 +50,6 @@ TEST_F(IFilterTest, MissingObjectsAreReportedByTheConstructor) {
     EXPECT_THROW(ScriptedFilter(&params, in.get(), nullptr), CBadPtrEx);
     EXPECT_THAT(log.lines(), testing::ElementsAre("The User Settings object was invalid.",
                                                   "The Output plane was invalid!"));
-    ExceptionStack::clear();
 }
 
 TEST_F(IFilterTest, HostPixelsComeFromTheRunsProxyOrElseTheProcessWideOne) {
@@ -76,7 +75,6 @@ TEST_F(IFilterTest, HostPixelsNeedADirectProxy) {
         EXPECT_EQ(failure.message(), "This version of GetRGBFromHost requires direct proxy.");
         EXPECT_EQ(failure.sourceFile() + ' ' + QByteArray::number(failure.line()), "Filters/IFilter 89");
     }
-    ExceptionStack::clear();
 #else
     EXPECT_DEATH(filter.useHostPicture(),
                  "IFilter::GetRGBFromHost: \"This version of GetRGBFromHost requires direct proxy.\", file "

@@ -77,7 +77,6 @@ TEST(PictureSession, ARefusedRequestGivesTheStepItsCauseAndTheHostsCode) {
         EXPECT_EQ(result, -7);
         EXPECT_EQ(CARGBPlaneProxy::current(), nullptr);
     }
-    ExceptionStack::clear();
 }
 
 } // namespace

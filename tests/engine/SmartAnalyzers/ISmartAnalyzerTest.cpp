@@ -32,7 +32,6 @@ TEST(ISmartAnalyzer, FailuresReachTheCaller) {
     EXPECT_EQ(messageOf(&params, plane.get()), "An error occured while running a SmartAnalyzer object.@40");
     EXPECT_EQ(messageOf(nullptr, plane.get()), "The User Settings object was invalid.@26");
     EXPECT_EQ(messageOf(&params, nullptr), "The analyzer has an invalid Input plane.@31");
-    ExceptionStack::clear();
 }
 
 } // namespace

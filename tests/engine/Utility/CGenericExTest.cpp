@@ -43,7 +43,6 @@ void wrapTwice(const Cause& cause, Check check) {
     }
     EXPECT_EQ(ExceptionStack::entries(),
               QStringList({QStringLiteral("b:2 CGenericEx outer"), QStringLiteral("a:1 CBadPtrEx Größe")}));
-    ExceptionStack::clear();
 }
 
 TEST(CGenericEx, WrappingKeepsTheCauseAndRecordsEachFailureOnce) {
@@ -59,7 +58,6 @@ TEST(CGenericEx, WrappingKeepsTheCauseAndRecordsEachFailureOnce) {
     const COutOfMemoryEx plain(QStringLiteral("plain"), "c", 3);
     EXPECT_TRUE(isOutOfMemory(plain));
     EXPECT_EQ(innermostMessage(plain), "plain");
-    ExceptionStack::clear();
 }
 
 TEST(ExceptionStackDeathTest, RecordsWhenStaticObjectsAreGone) {

@@ -63,7 +63,6 @@ TEST(Logger, FileIsTruncatedAndHoldsEveryLineAtOnce) {
 }
 
 TEST(ExceptionStack, ListsNewestFirstAndKnowsTheOldest) {
-    ExceptionStack::clear();
     LogCapture log;
     try {
         throw CGenericEx(QStringLiteral("A"), "C:\\src\\deep\\a.cpp", 1);
@@ -81,7 +80,6 @@ TEST(ExceptionStack, ListsNewestFirstAndKnowsTheOldest) {
 }
 
 TEST(ExceptionStack, RecordsFromSeveralThreadsWithoutLoss) {
-    ExceptionStack::clear();
     LogCapture log;
     const auto raise = [] {
         for (int i = 0; i < 200; ++i) {
@@ -94,7 +92,6 @@ TEST(ExceptionStack, RecordsFromSeveralThreadsWithoutLoss) {
     other.join();
     EXPECT_EQ(ExceptionStack::entries().size(), 400);
     EXPECT_EQ(log.lines().size(), 400U);
-    ExceptionStack::clear();
 }
 
 } // namespace
