@@ -1,11 +1,7 @@
 #include "ProgramRun.h"
-#include "common/PhotographReader.h"
 #include "common/PhotographWriter.h"
 
 #include <QElapsedTimer>
-#include <QJsonArray>
-#include <QJsonDocument>
-#include <QJsonObject>
 #include <QThread>
 
 #include <pty.h>
@@ -89,28 +85,6 @@ TEST_F(LongRunTest, ATerminalShowsProgressAndAPipeDoesNot) {
     EXPECT_TRUE(text.ends_with("\r\x1b[Ka%1.png -> a%1-enhanced.png\r\n")) << text;
     EXPECT_EQ(onTerminal(mFolder.path(), {"enhance", "a%1.png", "--quiet", "--force"}), "");
     EXPECT_EQ(orvela("enhance a%1.png --force").err, "");
-}
-
-TEST_F(LongRunTest, TheTraceShowsEveryStepThatChangedThePicture) {
-    sample("a.png");
-    ASSERT_EQ(orvela("enhance a.png --mode autocolor -o x.png --trace t").status, 0);
-    const QStringList traced = files("t");
-    ASSERT_GE(traced.size(), 2);
-    EXPECT_TRUE(traced[0].startsWith(QStringLiteral("01-")) && traced[0].endsWith(QStringLiteral(".json")));
-    const QJsonObject step = QJsonDocument::fromJson(bytes(qPrintable("t/" + traced[0]))).object();
-    const QJsonObject dark = step["statistics"].toObject()["m_Dark_Acu"].toObject();
-    EXPECT_TRUE(dark["value"].toDouble() > 0 && dark["range"].toArray()[1] == 1) << "a share";
-    EXPECT_EQ(dark["writer"], "CHistogram0");
-    EXPECT_TRUE(dark["meaning"].toString().contains("luma from 1 to 85"));
-    EXPECT_EQ(step["histograms"].toObject()["luma"].toArray().size(), 256);
-    const Photograph last = readPhotograph(path(qPrintable("t/" + traced.last())).toStdString());
-    EXPECT_EQ(last.samples, readPhotograph(path("x.png").toStdString()).samples);
-    EXPECT_EQ(orvela("enhance a.png -o z.png --trace t").status, 4);
-    EXPECT_EQ(orvela("enhance a.png x.png -d two --trace two-traces").status, 0);
-    EXPECT_EQ(files("two-traces"), QStringList({QStringLiteral("1-a.png"), QStringLiteral("2-x.png")}));
-    // No step, no file.
-    ASSERT_EQ(orvela("enhance a.png --mode advanced -o n.png --trace none").status, 0);
-    EXPECT_EQ(files("none"), QStringList());
 }
 
 } // namespace

@@ -1,25 +1,12 @@
 #include "command/SettingOptions.h"
 
-#include "ProgramRun.h"
-#include "command/ExitStatus.h"
 #include "command/ModeNames.h"
 
-#include <QJsonArray>
-#include <QJsonDocument>
-#include <QJsonObject>
+#include <gtest/gtest.h>
 
 using namespace orvela;
 
 namespace {
-
-std::string refusal(const SettingOptions& options) {
-    try {
-        settle(options);
-    } catch (const UsageError& error) {
-        return error.what();
-    }
-    return {};
-}
 
 CSliderParams settled(const SettingOptions& options) {
     return settle(options).params.mSliderParams;
@@ -80,47 +67,6 @@ TEST(SettingOptions, FinalTouchRunsApartFromTheMode) {
     EXPECT_EQ(touch.SaturationValue, 0);
     EXPECT_FALSE(run.params.mSliderParams.mColor_Touch_Enabled);
     EXPECT_EQ(touch.mMiddle_Touch_Value_B, 500) << "neutral, as in the window";
-}
-
-TEST(SettingOptions, WhatIsOutOfRangeIsRefusedWithTheRange) {
-    const auto says = [](const SettingOptions& options, const char* text) {
-        return refusal(options).find(text) != std::string::npos;
-    };
-    EXPECT_TRUE(says({.mode = "Temperature", .value = "1999"}, "from 2000 to 10000"));
-    EXPECT_TRUE(says({.mode = "Temperature", .value = "nan"}, "from 2000 to 10000"));
-    EXPECT_TRUE(says({.mode = "Temperature", .value = "3000K"}, "from 2000 to 10000"));
-    EXPECT_TRUE(says({.mode = "SmartLevels", .labelled = {{"Highlights", "256"}}}, "from 0 to 255"));
-    EXPECT_TRUE(says({.mode = "SmartLevels", .labelled = {{"Saturation", "1"}}}, "--middle, --dark"));
-    EXPECT_TRUE(says({.mode = "SmartLevels"}, "at least one of"));
-    EXPECT_TRUE(says({.mode = "Portrait", .value = "1"}, "one slider"));
-    EXPECT_TRUE(says({.mode = "ColorFilter", .color = "1,2"}, "three numbers"));
-    EXPECT_TRUE(says({.mode = "ColorFilter", .color = "1,2,256"}, "from 0 to 255"));
-    EXPECT_TRUE(says({.color = "1,2,3"}, "needs a colour filter"));
-    EXPECT_TRUE(says({.fields = {"SaturationValue=1001"}}, "from 0 to 1000"));
-    EXPECT_TRUE(says({.fields = {"SaturationValue=1,maybe"}}, "on or off"));
-    EXPECT_TRUE(says({.fields = {"mColor_Value_R=1,on"}}, "has no switch"));
-    EXPECT_TRUE(says({.fields = {"Saturation=1"}}, "no setting"));
-    EXPECT_TRUE(says({.fields = {"SaturationValue"}}, "NAME=VALUE"));
-    EXPECT_TRUE(says({.finalTouch = "AbsContrast=101"}, "from -100 to 100"));
-    EXPECT_TRUE(says({.finalTouch = "Contrast=1"}, "AbsContrast, PercContrast"));
-}
-
-class SettingCommandTest : public ProgramTest {};
-
-TEST_F(SettingCommandTest, EveryModeIsListedWithItsSliders) {
-    const Answer json = orvela("modes --json");
-    ASSERT_EQ(json.status, 0);
-    const QJsonArray modes =
-        QJsonDocument::fromJson(QByteArray::fromStdString(json.out)).object()["modes"].toArray();
-    ASSERT_EQ(modes.size(), 12 + 1 + 14 + 2); // automatic, Advanced, one slider, three sliders
-    const QJsonObject levels = modes[27].toObject();
-    EXPECT_EQ(levels["identifier"], "SmartLevels");
-    EXPECT_EQ(levels["sliders"].toArray()[0].toObject()["option"], "--highlights");
-    EXPECT_EQ(levels["sliders"].toArray()[0].toObject()["high"], 255);
-    EXPECT_TRUE(levels["sliders"].toArray()[0].toObject()["help"].toString().startsWith("Brightens"));
-    const Answer text = orvela("modes");
-    EXPECT_TRUE(text.says("Temperature: ") && text.says("Temperature, 2000 to 10000"));
-    EXPECT_TRUE(text.says("Makes the light warmer"));
 }
 
 } // namespace

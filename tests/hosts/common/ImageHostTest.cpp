@@ -1,8 +1,5 @@
 #include "common/ImageHost.h"
 
-#include "PluginEntry/CARGBPlanePhotoshop.h"
-#include "Utility/CGenericEx.h"
-
 #include <gtest/gtest.h>
 
 #include <cstdlib>
@@ -84,18 +81,9 @@ TEST(ImageHost, RefusesRequestsOutsideTheImage) {
     }
 }
 
-TEST(ImageHost, FailsOnDemandAndAnswersForTheYoungest) {
+// That it fails on demand is seen by the picture session's tests.
+TEST(ImageHost, AnswersForTheYoungest) {
     ImageHost host(counting(ColorModel::Rgb, 8, 4, 3));
-    host.failAt(3, -108); // the priming call, channel 0, then channel 1
-    CARGBPlanePhotoshop plane(0, 0, QStringLiteral("plane"));
-    std::int16_t result = 0;
-    EXPECT_THROW(plane.FillFrom_Photoshop_Data(&host.record(), &result), CGenericEx);
-    EXPECT_EQ(result, -108);
-    plane.FillFrom_Photoshop_Data(&host.record(), &result);
-    host.failAt(2, -1);
-    std::fill_n(plane.samples(Channel::Red), 12, std::uint8_t{200});
-    EXPECT_THROW(plane.copyPlaneToPS(&host.record(), &result), CGenericEx);
-    EXPECT_EQ(result, -1);
     {
         ImageHost younger(counting(ColorModel::Grey, 8, 1, 1));
         younger.onAbort = [] { return true; };
