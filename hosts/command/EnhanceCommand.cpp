@@ -66,8 +66,9 @@ void Batch::note(const std::string& text) {
 
 ExitStatus Batch::runGuarded(const Job& job) {
     const std::string name = job.source.string() + ": ";
+    ExceptionStack::clear(); // of what earlier photographs left
     try {
-        runJob(job);
+        mScheduler.execute([&] { runJob(job); });
         return ExitStatus::Done;
     } catch (const StoppedError&) {
         return ExitStatus::Done;
@@ -100,7 +101,7 @@ void Batch::runJob(const Job& job) {
     Photograph photograph = read(job.source);
     checkTarget(photograph, job.target, writing);
     const std::optional<Photograph> result =
-        enhance(std::move(photograph), mSettings, traceOf(job), mScheduler, mSignals, mProgress);
+        enhance(std::move(photograph), mSettings, traceOf(job), mSignals, mProgress);
     if (!result)
         return;
     mProgress.step(1, 1, QStringLiteral("Writing"));

@@ -17,8 +17,8 @@ namespace {
 // The runs over one photograph and what watches them.
 class Run {
 public:
-    Run(PictureSession& session, RowScheduler& scheduler, StopSignals& signals, ProgressLine& progress)
-        : mSession(session), mScheduler(scheduler), mSignals(signals), mProgress(progress) {}
+    Run(PictureSession& session, StopSignals& signals, ProgressLine& progress)
+        : mSession(session), mSignals(signals), mProgress(progress) {}
 
     void traceTo(const TraceOptions& trace) {
         mTrace.emplace(trace.folder, trace.overwrite, mSession.input());
@@ -39,7 +39,6 @@ private:
     void connect(CThreadedCore& core);
 
     PictureSession& mSession;
-    RowScheduler& mScheduler;
     StopSignals& mSignals;
     ProgressLine& mProgress;
     std::optional<TraceFolder> mTrace;
@@ -85,9 +84,11 @@ void Run::connect(CThreadedCore& core) {
 
 bool Run::execute(CThreadedCore& core, const CUserParamsPhotoshop& params) {
     connect(core);
+    mSession.prepare(core, params);
     {
+        // After the parameters are set, which forgets an earlier stop.
         const StopAction stopCore(mSignals, [&core] { core.stop(); });
-        mSession.run(core, params, &mScheduler);
+        core.run();
     }
     if (mTraceFailure)
         std::rethrow_exception(mTraceFailure);
@@ -100,15 +101,15 @@ bool Run::execute(CThreadedCore& core, const CUserParamsPhotoshop& params) {
 } // namespace
 
 std::optional<Photograph> enhance(Photograph photograph, const RunSettings& settings,
-                                  const std::optional<TraceOptions>& trace, RowScheduler& scheduler,
-                                  StopSignals& signals, ProgressLine& progress) {
+                                  const std::optional<TraceOptions>& trace, StopSignals& signals,
+                                  ProgressLine& progress) {
     std::int16_t result = 0;
     try {
         ImageHost host(std::move(photograph));
         std::optional<StopAction> leave(std::in_place, signals, [&signals] { signals.leave(); });
         PictureSession session(&host.record(), &result);
         leave.reset();
-        Run run(session, scheduler, signals, progress);
+        Run run(session, signals, progress);
         if (trace)
             run.traceTo(*trace);
         if (!run.enhance(settings))

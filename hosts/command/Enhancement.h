@@ -7,10 +7,10 @@
 
 #include <filesystem>
 #include <optional>
+#include <stdexcept>
+#include <string>
 
 namespace orvela {
-
-class RowScheduler;
 
 /// The engine could not enhance a photograph, or not with every step that applies.
 class EngineFailure : public std::runtime_error {
@@ -34,7 +34,7 @@ struct TraceOptions {
 /// @return the result; none when a signal stopped the run
 /// @throws EngineFailure, CGenericEx, TargetError (the trace cannot be written)
 std::optional<Photograph> enhance(Photograph photograph, const RunSettings& settings,
-                                  const std::optional<TraceOptions>& trace, RowScheduler& scheduler,
-                                  StopSignals& signals, ProgressLine& progress);
+                                  const std::optional<TraceOptions>& trace, StopSignals& signals,
+                                  ProgressLine& progress);
 
 } // namespace orvela

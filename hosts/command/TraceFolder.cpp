@@ -2,6 +2,7 @@
 
 #include "common/PhotographWriter.h"
 
+#include <cstdio>
 #include <cstring>
 #include <fstream>
 #include <nlohmann/json.hpp>

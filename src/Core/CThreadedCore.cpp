@@ -5,7 +5,6 @@
 #include "Settings/SettingsStore.h"
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
-#include "Utility/RowScheduler.h"
 
 #include <QCoreApplication>
 #include <QThread>
@@ -33,13 +32,6 @@ void CThreadedCore::run() {
     const LogDepth ownDepth;
     mContext.dumpsPictures =
         openSettings().value(PresetTree::guiKey(QStringLiteral("dumpImageAfterFile"))).toInt() != 0;
-    if (mContext.scheduler)
-        mContext.scheduler->execute([this] { runAnnounced(); });
-    else
-        runAnnounced();
-}
-
-void CThreadedCore::runAnnounced() {
     mTotalSteps = 0;
     mCurrentStep = 0;
     mRunThread = QThread::currentThread();
@@ -130,11 +122,19 @@ void CThreadedCore::runTask(const PipelineTask& task) {
         QElapsedTimer timer;
         timer.start();
         const std::unique_ptr<TaskBase> made = task.make(mContext, &mParams, mInPlane, mOutPlane);
-        made->Apply();
-        mReports.push_back({task.name, task.kind, made->outcome(), made->failure(),
-                            static_cast<double>(timer.nsecsElapsed()) / 1e6});
-        if (mObserver)
-            mObserver(mReports.back());
+        const auto report = [&] {
+            mReports.push_back({task.name, task.kind, made->outcome(), made->failure(),
+                                static_cast<double>(timer.nsecsElapsed()) / 1e6});
+            if (mObserver)
+                mObserver(mReports.back());
+        };
+        try {
+            made->Apply();
+        } catch (...) { // an analyzer's failure ends the run
+            report();
+            throw;
+        }
+        report();
     }
     if (task.afterwards)
         task.afterwards(mParams);

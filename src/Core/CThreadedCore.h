@@ -47,8 +47,9 @@ public:
     /// The parameters as the last run left them.
     const CUserParamsPhotoshop& params() const { return mParams; }
 
-    /// What the tasks of the next runs share beside parameters and planes.
-    void setContext(const orvela::RunContext& context) { mContext = context; }
+    /// Where the filters of the next runs find the host's unprocessed picture; null for the process-wide
+    /// proxy.
+    void setProxy(const CARGBPlaneProxy* proxy) { mContext.proxy = proxy; }
 
     /// Runs the pipeline; the result is told by lastProcessingDone() and the last announcement, "All Done" or
     /// "Failed". A stopped run walks on through its announcements and ends with "All Done".
@@ -107,7 +108,6 @@ protected:
     CUserParamsPhotoshop mParams;
 
 private:
-    void runAnnounced();
     bool runPipeline();
     bool guarded(const std::function<bool()>& action);
     void reportProgress(int percent);

@@ -15,8 +15,8 @@ CThreadedCore_FinalTouch::CThreadedCore_FinalTouch(CARGBPlane* inPlane, CARGBPla
         mOriginalPlane = std::make_unique<CARGBPlane>(*inPlane, QString());
     } catch (...) {
         Log::log(LogLevel::Error, "Unable to create the Original plane from Input plane.");
-        throw COutOfMemoryEx(QStringLiteral("Unable to create the Original plane from Input plane."), kSource,
-                             11);
+        std::throw_with_nested(COutOfMemoryEx(
+            QStringLiteral("Unable to create the Original plane from Input plane."), kSource, 11));
     }
 }
 
@@ -27,6 +27,7 @@ bool CThreadedCore_FinalTouch::doRun() {
     mParams.Final_Touch_Mode_Enabled = true;
     try {
         mInPlane->copyFrom(*mOriginalPlane);
+        mOutPlane->copyFrom(*mOriginalPlane);
         for (const PipelineTask& task : PipelineTable::finalTouchTasks())
             runTask(task);
     } catch (...) {

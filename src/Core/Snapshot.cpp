@@ -10,13 +10,13 @@ namespace {
 
 // Mean of the pixels of one channel, rounded.
 std::uint8_t meanOf(const CARGBPlane& picture, std::size_t channel, const QRect& block) {
-    unsigned sum = 0;
+    std::uint64_t sum = 0;
     for (int y = block.top(); y <= block.bottom(); ++y) {
         const std::uint8_t* row = picture.row(y)[channel];
         for (int x = block.left(); x <= block.right(); ++x)
             sum += row[x];
     }
-    const auto count = static_cast<unsigned>(block.width()) * static_cast<unsigned>(block.height());
+    const auto count = static_cast<std::uint64_t>(block.width()) * static_cast<std::uint64_t>(block.height());
     return static_cast<std::uint8_t>((sum + count / 2) / count);
 }
 
@@ -39,7 +39,7 @@ void reduceRow(const CARGBPlane& picture, const QRect& part, int reduction, CARG
 
 std::unique_ptr<CARGBPlane> takeSnapshot(const CARGBPlane& picture, const QRect& area, int reduction) {
     const QRect part = area & QRect(0, 0, picture.width(), picture.height());
-    const int step = std::max(reduction, 1);
+    const int step = std::clamp(reduction, 1, std::max({part.width(), part.height(), 1}));
     auto snapshot = std::make_unique<CARGBPlane>(
         (part.width() + step - 1) / step, (part.height() + step - 1) / step, QStringLiteral("Snapshot"));
     snapshot->setColorMode(picture.colorMode());

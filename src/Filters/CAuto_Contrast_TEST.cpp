@@ -47,7 +47,9 @@ void CAuto_Contrast_TEST::prepare() {
         readChannelLimits();
     C_Left_limit = luma.black;
     C_Right_limit = luma.white;
-    mHazyCurve = makeTable([luma](int value) { return TonalStretch::stretchHazy(value, luma); });
+    mHazyCurve = makeTable([this](int value) {
+        return TonalStretch::stretchHazy(value, {C_Left_limit, C_Right_limit});
+    });
 }
 
 void CAuto_Contrast_TEST::readChannelLimits() {

@@ -23,6 +23,11 @@ float sideOf(const CARGBPlane& plane) {
     return static_cast<float>(std::sqrt(static_cast<double>(plane.pixelCount())));
 }
 
+// Null when there is no memory.
+std::unique_ptr<float[]> allocate(std::size_t count) {
+    return std::unique_ptr<float[]>(new (std::nothrow) float[count]);
+}
+
 } // namespace
 
 const TaskDescription& CBilinear::description() const {
@@ -92,16 +97,7 @@ void CBilinear::prepareTables(float spatialVariance) {
     });
 }
 
-CBilinear::Floats CBilinear::allocate(std::size_t count) const {
-    return Floats(new (std::nothrow) float[count]);
-}
-
 void CBilinear::ApplyRow(std::uint32_t row) {
     BilateralKernel(m_cBilinear.get(), m_sBilinear.get())
         .applyRow(*mInPlane, *mOutPlane, static_cast<int>(row));
-}
-
-void CBilinear::complete() {
-    m_cBilinear.reset();
-    m_sBilinear.reset();
 }

@@ -30,8 +30,8 @@ struct FlashContrast {
 /// it toward the unprocessed picture by mFade_Value, the more so the stronger the flash. No light where the
 /// highlights have a cast.
 ///
-///     fade = mFade_Value / 1000 * (a / 5 + 1.1), at most 1,   a = (flash / 1000 - 0.7) / 0.3 above 700, else
-///     0
+///     fade = mFade_Value / 1000 * (a / 5 + 1.1), at most 1
+///     a = (mDigital_Flash_Value / 1000 - 0.7) / 0.3 above 700, 0 up to it
 class CDigital_Flash_Perceptual final : public orvela::PointFilter {
 public:
     using orvela::PointFilter::PointFilter;

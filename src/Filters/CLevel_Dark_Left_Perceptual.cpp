@@ -11,7 +11,6 @@ const TaskDescription& CLevel_Dark_Left_Perceptual::description() const {
         .line = __LINE__,
         .opening = "Applying CLevel_Dark_Left_Perceptual filter from plane at 0x%x to plane at 0x%x...",
         .completion = "CLevel_Dark_Left_Perceptual Filter complete.",
-        .writes = Writes::SomePixels,
     };
     return kDescription;
 }

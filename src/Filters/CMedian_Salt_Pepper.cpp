@@ -4,6 +4,7 @@
 #include "Filters/Kernels/ScaledTile.h"
 
 #include <algorithm>
+#include <utility>
 
 using namespace orvela;
 

@@ -48,7 +48,3 @@ void COrv_II_Iter::prepare() {
 void COrv_II_Iter::ApplyRow(std::uint32_t row) {
     mKernel->applyRow(*mInPlane, *mOutPlane, static_cast<int>(row));
 }
-
-void COrv_II_Iter::complete() {
-    mKernel.reset();
-}

@@ -55,7 +55,3 @@ void COrv_I_Iter::prepare() {
 void COrv_I_Iter::ApplyRow(std::uint32_t row) {
     mKernel->applyRow(*mInPlane, *mOutPlane, static_cast<int>(row));
 }
-
-void COrv_I_Iter::complete() {
-    mKernel.reset();
-}

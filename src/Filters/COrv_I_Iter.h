@@ -17,7 +17,6 @@ protected:
     bool applies() override;
     void prepare() override;
     void ApplyRow(std::uint32_t row) override;
-    void complete() override;
 
 private:
     void storeSharpnessSwitch();

@@ -9,6 +9,7 @@
 
 #include <algorithm>
 #include <atomic>
+#include <utility>
 
 using namespace orvela;
 
@@ -43,11 +44,10 @@ IFilter::IFilter(const RunContext& context, CUserParams* params, CARGBPlane* inP
 }
 
 void IFilter::onPass() {
-    if (description().writes != Writes::SomePixels)
+    if (description().writes == Writes::Nothing)
         return;
     const auto height = static_cast<std::uint32_t>(mInPlane->height());
-    const bool visitsNeighbours = mVertStep == 1;
-    keepRows(0, visitsNeighbours ? std::min(mVertStart, height) : height);
+    keepRows(0, std::min(mVertStart, height));
     keepRows(std::min(passEnd(), height), height);
 }
 
@@ -67,10 +67,12 @@ void IFilter::keepRows(std::uint32_t first, std::uint32_t last) {
 
 void IFilter::onSuccess() {
     Log::log(LogLevel::Debug, "onSuccess copying from out to in");
-    if (description().writes != Writes::Nothing)
-        mInPlane->swapSamples(*mOutPlane);
+    const bool writes = description().writes != Writes::Nothing;
+    // First, so that a dump that fails leaves the input as it was.
     if (mContext.dumpsPictures)
-        dumpAfter(description().dumpName, *mInPlane);
+        dumpAfter(description().dumpName, writes ? *mOutPlane : *mInPlane);
+    if (writes)
+        mInPlane->swapSamples(*mOutPlane);
 }
 
 void IFilter::onStopped() {

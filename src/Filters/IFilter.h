@@ -15,9 +15,9 @@ public:
 protected:
     /// Makes the output the input; dumps it when the run asks for it.
     void onSuccess() override;
-    /// Copies the rows that the pass leaves out, if the filter writes only some pixels.
+    /// Copies the rows that the pass leaves out. A filter that writes visits neighbouring rows.
     void onPass() override;
-    /// Copies the row for the same reason.
+    /// Copies the row if the filter writes only some pixels of it.
     void onRow(std::uint32_t row) override;
     /// Puts the input back into the output, so that no half-written picture shows through.
     void onStopped() override;

@@ -3,6 +3,8 @@
 #include "Filters/IFilter.h"
 #include "Filters/Kernels/PixelRow.h"
 
+#include <utility>
+
 namespace orvela {
 
 /// A filter whose result for a pixel depends on nothing of the picture but that pixel (and the host's

@@ -4,15 +4,12 @@ class CARGBPlaneProxy;
 
 namespace orvela {
 
-class RowScheduler;
-
-/// What the tasks of one run share beside its parameters and planes. Runs with contexts of their own can go
-/// on side by side in one process, each on its thread.
+/// What the tasks of one run share beside its parameters and planes; nothing of a run is shared by the whole
+/// process, so that several can go on side by side, each on a thread of its own. Their passes over rows use
+/// the threads of the scheduler that the run executes in (RowScheduler::execute).
 struct RunContext {
     /// Source of the host's unprocessed pixels; null for the process-wide one.
     const CARGBPlaneProxy* proxy = nullptr;
-    /// The threads that passes over rows use; null for as many as there are processors.
-    RowScheduler* scheduler = nullptr;
     /// Whether the picture is dumped to a file after every filter.
     bool dumpsPictures = false;
 };

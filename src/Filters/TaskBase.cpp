@@ -7,6 +7,8 @@
 
 #include <QElapsedTimer>
 
+#include <new>
+
 using namespace orvela;
 
 namespace {
@@ -33,6 +35,11 @@ private:
     QElapsedTimer mTimer;
 };
 
+void logText(const char* text) {
+    if (text)
+        Log::log(LogLevel::Debug, "%s", text);
+}
+
 } // namespace
 
 TaskBase::TaskBase(const RunContext& context, CUserParams* params, CARGBPlane* inPlane)
@@ -40,20 +47,25 @@ TaskBase::TaskBase(const RunContext& context, CUserParams* params, CARGBPlane* i
       mVertEnd(inPlane ? static_cast<std::uint32_t>(inPlane->height()) : 0) {}
 
 bool TaskBase::Apply() {
-    try {
-        mOutcome = runPhases() ? TaskOutcome::Applied : TaskOutcome::Skipped;
-    } catch (const CanceledEx&) {
-        fail(TaskOutcome::Cancelled, {});
-    } catch (...) {
-        fail(TaskOutcome::Failed, Failure::current());
-    }
+    guarded([this] { return runPhases() ? TaskOutcome::Applied : TaskOutcome::Skipped; });
     if (mOutcome != TaskOutcome::Applied && mPassBegun)
         restore();
     return mOutcome == TaskOutcome::Applied;
 }
 
-void TaskBase::fail(TaskOutcome outcome, const Failure& failure) {
+void TaskBase::guarded(const std::function<TaskOutcome()>& action) {
+    try {
+        mOutcome = action();
+        return;
+    } catch (const CanceledEx&) {
+        setOutcome(TaskOutcome::Cancelled);
+    } catch (...) {
+        setOutcome(TaskOutcome::Failed, Failure::current());
+    }
     Log::scopeExit(LogLevel::Error, "Unable to complete filter block.");
+}
+
+void TaskBase::setOutcome(TaskOutcome outcome, const Failure& failure) {
     mOutcome = outcome;
     mFailure = failure;
 }
@@ -62,8 +74,7 @@ void TaskBase::restore() {
     try {
         onStopped();
     } catch (...) {
-        mOutcome = TaskOutcome::Failed;
-        mFailure = Failure::current();
+        setOutcome(TaskOutcome::Failed, Failure::current());
     }
 }
 
@@ -99,22 +110,22 @@ bool TaskBase::runPhases() {
 
 bool TaskBase::PreApply() {
     const TaskDescription& texts = description();
-    log(texts.start);
+    logPlanes(texts.start);
     if (!applies())
         return false;
-    log(texts.opening);
-    log(texts.matched);
+    logPlanes(texts.opening);
+    logText(texts.matched);
     prepare();
     return true;
 }
 
 bool TaskBase::PostApply() {
     complete();
-    log(description().completion);
+    logText(description().completion);
     return true;
 }
 
-void TaskBase::log(const char* text) const {
+void TaskBase::logPlanes(const char* text) const {
     if (text)
         Log::log(LogLevel::Debug, text, logAddress(mInPlane.get()), logAddress(outPlane()));
 }
@@ -158,11 +169,15 @@ std::uint32_t TaskBase::enterRow(std::uint32_t index) {
     return row;
 }
 
-Failure Failure::current() {
+Failure Failure::current() noexcept {
     try {
-        throw;
-    } catch (const std::exception& failure) {
-        return {innermostMessage(failure), isOutOfMemory(failure)};
+        try {
+            throw;
+        } catch (const std::exception& failure) {
+            return {innermostMessage(failure), isOutOfMemory(failure)};
+        }
+    } catch (const std::bad_alloc&) {
+        return {{}, true};
     } catch (...) {
         return {QStringLiteral("unknown error"), false};
     }

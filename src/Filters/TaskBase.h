@@ -7,6 +7,7 @@
 
 #include <cstdint>
 #include <experimental/propagate_const>
+#include <functional>
 
 class TaskBase;
 
@@ -22,11 +23,11 @@ enum class TaskOutcome {
 
 /// Why a task or a run failed.
 struct Failure {
-    QString cause; ///< in words; empty when it did not
+    QString cause; ///< in words
     bool outOfMemory = false;
 
-    /// From the exception that is being handled.
-    static Failure current();
+    /// From the exception that is being handled. Where even the words find no memory, they are missing.
+    static Failure current() noexcept;
 };
 
 /// A pointer to what a task works on but does not own; a constant task cannot change it.
@@ -107,7 +108,8 @@ protected:
     virtual const orvela::TaskDescription& description() const;
     /// The condition. May store flags that the decision settles for later tasks.
     virtual bool applies() { return true; }
-    /// Turns parameters and statistics into the numbers and tables of the pass, and sets its rows.
+    /// Turns parameters and statistics into the numbers and tables of the pass, and sets its rows. May store
+    /// what it finds for later tasks.
     virtual void prepare() {}
     /// Processes the rows of a band by ApplyRow(); a task may work on neighbouring rows together instead.
     virtual void ApplyBand(const orvela::RowBand& band);
@@ -133,17 +135,18 @@ protected:
     std::uint32_t mVertEnd = 0;
     std::uint32_t mVertStep = 1;
 
+    /// Does `action` and notes the outcome: what it returns, or its failure, which is not passed on.
+    void guarded(const std::function<orvela::TaskOutcome()>& action);
     /// For tasks with a run of their own.
-    void setApplied() { mOutcome = orvela::TaskOutcome::Applied; }
+    void setOutcome(orvela::TaskOutcome outcome, const orvela::Failure& failure = {});
 
 private:
     friend class orvela::RowBand;
 
     bool runPhases();
-    void fail(orvela::TaskOutcome outcome, const orvela::Failure& failure);
     void restore();
     std::uint32_t enterRow(std::uint32_t index);
-    void log(const char* text) const;
+    void logPlanes(const char* text) const;
     /// The second plane whose address the opening lines show.
     virtual const CARGBPlane* outPlane() const { return nullptr; }
 

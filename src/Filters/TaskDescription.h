@@ -4,8 +4,8 @@ namespace orvela {
 
 /// Which pixels a filter writes in its pass.
 enum class Writes {
-    EveryPixel, ///< of every row
-    SomePixels, ///< the frame fills in the others from the input
+    EveryPixel, ///< of every row of its pass; the frame fills in the other rows from the input
+    SomePixels, ///< the frame fills in the others
     Nothing,    ///< it only measures
 };
 
@@ -16,8 +16,8 @@ struct TaskDescription {
     int line = 0;              ///< line that a stop is recorded with
     const char* dumpName = ""; ///< in the names of picture dumps
 
-    const char* start = nullptr;      ///< before the condition is tested; may show both planes' addresses
-    const char* opening = nullptr;    ///< once the condition holds; may show both planes' addresses
+    const char* start = nullptr;      ///< before the condition is tested; a format for both planes' addresses
+    const char* opening = nullptr;    ///< once the condition holds; a format for both planes' addresses
     const char* matched = nullptr;    ///< after the opening
     const char* completion = nullptr; ///< at the end
 

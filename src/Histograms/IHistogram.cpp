@@ -43,8 +43,11 @@ void IHistogram::RowCounts::add(std::uint32_t r, std::uint32_t g, std::uint32_t 
 bool IHistogram::Apply() {
     if (!TaskBase::Apply())
         return false;
-    StoreResults();
-    return true;
+    guarded([this] {
+        StoreResults();
+        return TaskOutcome::Applied;
+    });
+    return outcome() == TaskOutcome::Applied;
 }
 
 void IHistogram::StoreResults() {

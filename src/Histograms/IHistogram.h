@@ -3,6 +3,7 @@
 #include "Filters/TaskBase.h"
 
 #include <algorithm>
+#include <array>
 #include <mutex>
 
 /// A task that counts the samples of a plane into four 256-bin histograms and publishes them, with

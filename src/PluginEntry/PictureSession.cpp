@@ -29,8 +29,8 @@ PictureSession::PictureSession(host::FilterRecord* record, std::int16_t* result)
     logStep("Creating Output CARGBPlanePhotoshop...");
     guarded("Unable to instantiate the Output CARGBPlanePhotoshop.", __LINE__, [this] {
         mOutput = std::make_unique<CARGBPlanePhotoshop>(*mInput, QStringLiteral("PluginMain pOutPlane"));
-        mProxy = std::make_unique<CARGBPlaneProxyDirect>(*mInput);
     });
+    mProxy = std::make_unique<CARGBPlaneProxyDirect>(*mInput);
 }
 
 void PictureSession::read() {
@@ -44,10 +44,9 @@ void PictureSession::read() {
     Log::log(LogLevel::Debug, "pInPlane w=%d h=%d", mInput->width(), mInput->height());
 }
 
-void PictureSession::run(CThreadedCore& core, const CUserParamsPhotoshop& params, RowScheduler* scheduler) {
-    core.setContext({.proxy = mProxy.get(), .scheduler = scheduler});
+void PictureSession::prepare(CThreadedCore& core, const CUserParamsPhotoshop& params) const {
+    core.setProxy(mProxy.get());
     core.setParams(params);
-    core.run();
 }
 
 void PictureSession::writeBack() {

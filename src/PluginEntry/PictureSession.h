@@ -9,8 +9,8 @@
 
 namespace orvela {
 
-/// The planes of one start of the filter over a host's picture, from reading to writing back. While it lives,
-/// its copy of the unprocessed picture is the process-wide plane proxy.
+/// The planes of one start of the filter over a host's picture, from reading to writing back. Its copy of the
+/// unprocessed picture is the process-wide plane proxy until another session is made or this one ends.
 class PictureSession {
 public:
     /// Reads the picture.
@@ -23,9 +23,9 @@ public:
     CARGBPlane& input() { return *mInput; }
     CARGBPlane& output() { return *mOutput; }
 
-    /// Runs `core`, which works on both planes, with these parameters; see its reports for what became of it.
-    /// @param scheduler  null for as many threads as there are processors
-    void run(CThreadedCore& core, const CUserParamsPhotoshop& params, RowScheduler* scheduler = nullptr);
+    /// Readies `core`, which works on both planes, for a run with these parameters over this picture; its
+    /// reports will tell what became of it.
+    void prepare(CThreadedCore& core, const CUserParamsPhotoshop& params) const;
 
     /// Hands the output to the host; there is no input any more then.
     /// @throws CGenericEx as the constructor
@@ -37,8 +37,8 @@ private:
     host::FilterRecord* mRecord;
     std::int16_t* mResult;
     std::unique_ptr<CARGBPlanePhotoshop> mInput;
-    std::unique_ptr<CARGBPlanePhotoshop> mOutput;
     std::unique_ptr<CARGBPlaneProxyDirect> mProxy;
+    std::unique_ptr<CARGBPlanePhotoshop> mOutput;
 };
 
 } // namespace orvela

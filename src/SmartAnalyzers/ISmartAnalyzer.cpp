@@ -10,8 +10,13 @@ constexpr char kSource[] = "SmartAnalyzers/ISmartAnalyzer";
 }
 
 bool ISmartAnalyzer::Apply() {
-    RunAnalyzer();
-    setApplied();
+    try {
+        RunAnalyzer();
+    } catch (...) {
+        setOutcome(TaskOutcome::Failed, Failure::current());
+        throw;
+    }
+    setOutcome(TaskOutcome::Applied);
     return true;
 }
 

@@ -134,7 +134,10 @@ unsigned logAddress(const void* object) {
     return static_cast<unsigned>(reinterpret_cast<std::uintptr_t>(object));
 }
 
-LogDepth::LogDepth() : mOwn(*tDepth), mBefore(std::exchange(tDepth, &mOwn)) {}
+LogDepth::LogDepth() {
+    guarded([this] { mOwn = *tDepth; });
+    mBefore = std::exchange(tDepth, &mOwn);
+}
 
 LogDepth::LogDepth(Binding binding) : mBefore(std::exchange(tDepth, binding)) {}
 

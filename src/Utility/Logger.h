@@ -87,7 +87,7 @@ public:
 
 private:
     int mOwn = 0;
-    Binding mBefore;
+    Binding mBefore = nullptr;
 };
 
 /// The low 32 bits of an address, as log lines show it.

@@ -6,18 +6,20 @@
 /// The engine's one door to parallelism.
 namespace orvela {
 
-/// A number of threads for the passes that run inside execute(). Several can be used side by side, each by a
-/// thread of its own; passes outside of any use the machine's default.
+/// A number of threads for the passes that run inside execute(). Several can be used side by side, each by
+/// one thread at a time; passes outside of any use one thread per processor. More threads than processors are
+/// had as far as every living scheduler that asks for more allows.
 class RowScheduler {
 public:
     /// @param threads  number of threads, or below 1 for the automatic choice (one per processor)
     explicit RowScheduler(int threads);
-    /// Ends the worker threads.
+    /// Ends the worker threads that no other scheduler uses.
     ~RowScheduler();
     RowScheduler(const RowScheduler&) = delete;
     RowScheduler& operator=(const RowScheduler&) = delete;
 
-    /// Calls `action` on the calling thread; the passes in it use this scheduler's threads.
+    /// Calls `action` on the calling thread; the passes in it use this scheduler's threads. An exception of
+    /// the action reaches the caller.
     void execute(const std::function<void()>& action);
 
     /// The automatic number of threads on this machine.

@@ -20,7 +20,7 @@ public:
     /// @param alfa  saturation factor, 0 to 1.2
     SaturationKernel(Change change, float alfa);
 
-    /// Maps a row of `width` pixels.
+    /// Maps a row.
     void applyRow(const PixelRow& row) const;
 
     /// The plain form of applyRow, pixel by pixel. Same results.

@@ -16,14 +16,17 @@ void CARGBPlaneProxy::setCurrent(CARGBPlaneProxy* proxy) {
     gCurrent = proxy;
 }
 
+void CARGBPlaneProxy::leave(CARGBPlaneProxy* proxy) {
+    gCurrent.compare_exchange_strong(proxy, nullptr);
+}
+
 CARGBPlaneProxyDirect::CARGBPlaneProxyDirect(const CARGBPlane& plane)
     : mPlane(plane, QStringLiteral("Proxy to original image")) {
     setCurrent(this);
 }
 
 CARGBPlaneProxyDirect::~CARGBPlaneProxyDirect() {
-    if (current() == this)
-        setCurrent(nullptr);
+    leave(this);
 }
 
 void CARGBPlaneProxyDirect::getPixels(int, int, int, int, void*, int) {

@@ -13,6 +13,8 @@ public:
 
 protected:
     static void setCurrent(CARGBPlaneProxy* proxy);
+    /// Leaves no proxy behind if `proxy` is the current one.
+    static void leave(CARGBPlaneProxy* proxy);
 };
 
 /// Keeps its own copy of a plane and is the process-wide proxy until it is destroyed or another one is made.

@@ -29,7 +29,7 @@ template <typename Core = CThreadedCore_Orvela>
 struct Session {
     Session(std::unique_ptr<CARGBPlane> picture, EGUIMode mode)
         : in(std::move(picture)), out(*in, QStringLiteral("out")), proxy(*in), core(in.get(), &out) {
-        core.setContext({.proxy = &proxy});
+        core.setProxy(&proxy);
         core.setParams(CUserParamsPhotoshop(mode));
         QObject::connect(
             &core, &CThreadedCore::stepDone, &core, [this](int step, int total, const QString& name) {
@@ -145,6 +145,8 @@ TEST(CThreadedCore, AnAnalyzersFailureEndsTheRunAndIsForgottenByTheProcess) {
     EXPECT_FALSE(session.core.lastProcessingDone());
     EXPECT_EQ(session.core.failure().cause, "no room to count");
     EXPECT_TRUE(session.core.failure().outOfMemory);
+    ASSERT_EQ(session.core.reports().size(), 1U);
+    EXPECT_EQ(session.core.reports()[0].outcome, TaskOutcome::Failed);
     EXPECT_TRUE(log.has("Core/CThreadedCore 50"));
     EXPECT_TRUE(ExceptionStack::entries().isEmpty());
 }
@@ -180,10 +182,10 @@ template <typename Core>
 std::vector<std::uint8_t> runWith(int threads, int width, int height, const CUserParamsPhotoshop& params) {
     RowScheduler scheduler(threads);
     Session<Core> session(testplanes::noise(width, height, static_cast<std::uint32_t>(width)), Mode_Advanced);
-    session.core.setContext({.proxy = &session.proxy, .scheduler = &scheduler});
+    session.core.setProxy(&session.proxy);
     session.core.setParams(params);
     session.onStep = [](const QString&) { Log::log(LogLevel::Debug, "a step"); };
-    session.core.run();
+    scheduler.execute([&] { session.core.run(); });
     EXPECT_TRUE(session.core.lastProcessingDone());
     EXPECT_NE(testplanes::bytes(*session.in), testplanes::bytes(session.proxy.plane()));
     return testplanes::bytes(*session.in);
@@ -238,7 +240,6 @@ TEST(CThreadedCore, ASnapshotStaysWhileTheRunGoesOn) {
 TEST(CThreadedCore, ProgressComesOnTheRunsThreadAndItsHandlersCanStop) {
     RowScheduler scheduler(2);
     Session<> session(testplanes::noise(900, 2400), Mode_LandscapePro);
-    session.core.setContext({.scheduler = &scheduler});
     int onOtherThread = 0;
     QObject::connect(&session.core, &CThreadedCore::percentDone, &session.core, [&](int percent) {
         onOtherThread += QThread::currentThread() != session.core.thread();
@@ -248,7 +249,7 @@ TEST(CThreadedCore, ProgressComesOnTheRunsThreadAndItsHandlersCanStop) {
     int applied = 0;
     session.core.setObserver(
         [&](const TaskReport& report) { applied += report.outcome == TaskOutcome::Applied; });
-    session.core.run();
+    scheduler.execute([&] { session.core.run(); });
     EXPECT_EQ(onOtherThread, 0);
     EXPECT_TRUE(session.core.params().mCancelRequested) << "a percentage arrived while rows were worked on";
     EXPECT_LT(applied, 20);

@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
+
 using namespace orvela;
 
 namespace {
@@ -46,6 +48,12 @@ TEST(takeSnapshot, PartsAreCutToThePictureAndBlocksToThePart) {
     EXPECT_EQ(testplanes::at(*blocks, 0, 0), (Pixel{16, 7, 0})); // 11, 21
     EXPECT_EQ(testplanes::at(*blocks, 1, 0), (Pixel{31, 7, 0})); // column 4 is no part of it
     EXPECT_EQ(takeSnapshot(*plane, {7, 7, 2, 2}, 1)->pixelCount(), 0);
+    // 17 million samples of 255 sum up to more than 32 bits hold.
+    CARGBPlane white(17'000'000, 1, QString());
+    for (const Channel channel : kChannels)
+        std::fill_n(white.samples(channel), white.pixelCount(), std::uint8_t{255});
+    EXPECT_EQ(testplanes::at(*takeSnapshot(white, {0, 0, 17'000'000, 1}, 2'000'000'000), 0, 0),
+              (Pixel{255, 255, 255}));
 }
 
 } // namespace

@@ -17,14 +17,12 @@ namespace {
 using IFilterTest = ScriptedFilterTest;
 
 TEST_F(IFilterTest, RowsThatAreNotVisitedComeFromTheInput) {
-    for (const auto& [start, end, step] :
-         {std::tuple{0U, 7U, 1U}, {2U, 5U, 1U}, {0U, 6U, 2U}, {3U, 2U, 1U}}) {
+    for (const auto& [start, end] : {std::pair{0U, 7U}, {2U, 5U}, {3U, 2U}}) {
         const auto plane = testplanes::uniform(4, 7, kColour);
         const auto garbage = testplanes::noise(4, 7);
         ScriptedFilter some(&params, plane.get(), garbage.get());
         some.start = start;
         some.end = end;
-        some.step = step;
         EXPECT_TRUE(some.Apply());
         for (std::uint32_t y = 0; y < 7; ++y)
             EXPECT_EQ(testplanes::at(*plane, 3, static_cast<int>(y)),

@@ -43,7 +43,8 @@ TEST(PictureSession, ReadsRunsAndWritesBack) {
         EXPECT_NE(CARGBPlaneProxy::current(), nullptr);
         CThreadedCore_Orvela core(&session.input(), &session.output());
         QObject::connect(&core, &CThreadedCore::stepDone, &core, [&core] { core.stepHandled(); });
-        session.run(core, CUserParamsPhotoshop(Mode_LandscapePro));
+        session.prepare(core, CUserParamsPhotoshop(Mode_LandscapePro));
+        core.run();
         EXPECT_TRUE(core.lastProcessingDone());
         enhanced = interleaved(session.output());
         EXPECT_NE(enhanced, original);
