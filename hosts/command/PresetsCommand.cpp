@@ -34,9 +34,8 @@ EGUIMode modeOf(const std::string& name) {
 }
 
 QString nameOf(const PresetsOptions& options) {
-    const QString name = options.name.empty()
-                             ? QFileInfo(QString::fromStdString(options.file)).completeBaseName()
-                             : QString::fromStdString(options.name);
+    QString name = options.name.empty() ? QFileInfo(QString::fromStdString(options.file)).completeBaseName()
+                                        : QString::fromStdString(options.name);
     if (name.isEmpty() || name == PresetTree::batchPresetName())
         throw UsageError("\"" + name.toStdString() + "\" cannot be the name of a preset");
     return name;

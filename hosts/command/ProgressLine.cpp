@@ -4,6 +4,7 @@
 #include <unistd.h>
 
 #include <algorithm>
+#include <cmath>
 #include <cstdio>
 
 namespace orvela {
@@ -66,7 +67,7 @@ QString ProgressLine::timeLeft() const {
     if (!mSinceStart.hasExpired(kSettleMilliseconds) || done <= 0)
         return {};
     const double seconds = static_cast<double>(mSinceStart.elapsed()) / 1000 * (mPhotographs - done) / done;
-    const auto whole = static_cast<int>(seconds + 0.5);
+    const auto whole = static_cast<int>(std::lround(seconds));
     return QStringLiteral("  %1:%2 left").arg(whole / 60).arg(whole % 60, 2, 10, QLatin1Char('0'));
 }
 

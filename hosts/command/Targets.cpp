@@ -30,7 +30,7 @@ FileFormat formatOf(const fs::path& source) {
 fs::path targetOf(const fs::path& source, const TargetOptions& options) {
     if (options.file)
         return *options.file;
-    const fs::path beside = defaultTarget(source, formatOf(source));
+    fs::path beside = defaultTarget(source, formatOf(source));
     if (!options.folder)
         return beside;
     fs::path name = source.stem();
@@ -55,7 +55,7 @@ std::vector<Job> planTargets(const std::vector<fs::path>& sources, const TargetO
     std::vector<Job> jobs;
     std::map<fs::path, fs::path> sourceOfTarget;
     for (const fs::path& source : sources) {
-        const Job& job = jobs.emplace_back(source, targetOf(source, options));
+        const Job& job = jobs.emplace_back(Job{source, targetOf(source, options)});
         refuseSources(job, sources);
         const auto [other, isNew] = sourceOfTarget.emplace(realPath(job.target), source);
         if (!isNew)

@@ -51,7 +51,7 @@ bool isPlacement(const Exiv2::Exifdatum& datum) {
                                                "Exif.MakerNote.ByteOrder",
                                                "Exif.Image.ImageResources",
                                                "Exif.Thumbnail.JPEGInterchangeFormat"};
-    return keys.count(datum.key()) != 0;
+    return keys.contains(datum.key());
 }
 
 bool isTiff(FileFormat format) {

@@ -33,7 +33,7 @@ std::vector<std::string> writePhotograph(const Photograph& photograph, const fs:
     const FileFormat format = targetFormat(photograph, target);
     checkTargetPath(target, photograph.source, options.overwrite);
     Bytes encoded = encodePhotograph(photograph, format, target, options);
-    const std::vector<std::string> warnings = copyMetadata(photograph, format, encoded);
+    std::vector<std::string> warnings = copyMetadata(photograph, format, encoded);
     TargetFile file(target);
     file.write(encoded, options.stop);
     file.commit(options.overwrite);

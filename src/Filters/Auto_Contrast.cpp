@@ -38,7 +38,7 @@ bool Auto_Contrast::applies() {
            !sliders.ContrastEnabled && !sliders.BrightnessEnabled && !mParams->Under_Exposed_Picture;
 }
 
-void Auto_Contrast::prepare() {
+void Auto_Contrast::setUp() {
     Log::log(LogLevel::Debug, "IN 2 AUTOCONTRAST MODE DETECTED");
     Log::log(LogLevel::Debug, "Bicromic:%d", mParams->Bicromic);
     mParams->Shift_Level = 1.0F;

@@ -25,7 +25,7 @@ bool Auto_Gamma::applies() {
     return isAutomaticMode(sliders) || sliders.mAuto_Color_Enabled;
 }
 
-void Auto_Gamma::prepare() {
+void Auto_Gamma::setUp() {
     addSamplesToHistogram();
     const float gamma = gammaFor(meanLuma());
     Log::log(LogLevel::Debug, "Level_M %f", static_cast<double>(gamma));

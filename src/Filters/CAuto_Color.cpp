@@ -42,7 +42,7 @@ bool CAuto_Color::applies() {
     return mParams->mSliderParams.mAuto_Color_Enabled;
 }
 
-void CAuto_Color::prepare() {
+void CAuto_Color::setUp() {
     logFlags();
     const float s = mParams->mSliderParams.mAuto_Color_Value / 1000;
     mParams->Shift_Level = s;

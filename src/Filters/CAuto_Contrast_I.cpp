@@ -53,7 +53,7 @@ void CAuto_Contrast_I::storeSharpnessSwitch() {
              p.Switch_TOO_SHARP_ORV_I);
 }
 
-void CAuto_Contrast_I::prepare() {
+void CAuto_Contrast_I::setUp() {
     Log::log(LogLevel::Debug, "CAuto_Contrast_I Condition matched and Soft_Orvela is %d.",
              mParams->Soft_Orvela);
     useHostPicture();

@@ -33,7 +33,7 @@ bool CAuto_Contrast_TEST::applies() {
     return !s.mAuto_Color_Enabled && !purelyAutomatic;
 }
 
-void CAuto_Contrast_TEST::prepare() {
+void CAuto_Contrast_TEST::setUp() {
     Log::log(LogLevel::Debug, "CAuto_Contrast_TEST Condition matched and Soft_Orvela is %d.",
              mParams->Soft_Orvela);
     recountHistograms(*mInPlane, *mParams, 3, 3);

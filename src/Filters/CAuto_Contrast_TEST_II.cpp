@@ -26,7 +26,7 @@ bool CAuto_Contrast_TEST_II::applies() {
     return (mParams->Normal_Picture && automatic) || mParams->mSliderParams.mAuto_Color_Enabled;
 }
 
-void CAuto_Contrast_TEST_II::prepare() {
+void CAuto_Contrast_TEST_II::setUp() {
     Log::log(LogLevel::Debug, "CAuto_Contrast_TEST_II Condition matched and Soft_Orvela is %d.",
              mParams->Soft_Orvela);
     mParams->Shift_Level = 1.0F;

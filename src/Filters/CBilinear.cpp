@@ -61,7 +61,7 @@ void CBilinear::storeSharpnessSwitch() {
     Log::log(LogLevel::Debug, "Switch_TOO_SHARP: %d", mParams->Switch_TOO_SHARP);
 }
 
-void CBilinear::prepare() {
+void CBilinear::setUp() {
     const double position = mParams->mSliderParams.BilinearFilteringValue;
     const auto value = static_cast<float>(sideOf(*mInPlane) > kLargeSide ? position * 0.6 : position);
     const float sigma = value * 4.5F / 1000 + 0.5F;

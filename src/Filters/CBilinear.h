@@ -22,7 +22,7 @@ protected:
     /// Decides also, for later filters, whether the picture counts as too sharp.
     bool applies() override;
     /// @throws COutOfMemoryEx when there is no memory for a table
-    void prepare() override;
+    void setUp() override;
     void ApplyRow(std::uint32_t row) override;
 
 private:

@@ -37,7 +37,7 @@ bool CClarity::applies() {
     return sliders.ClarityFilterEnabled && !isAutomaticMode(sliders);
 }
 
-void CClarity::prepare() {
+void CClarity::setUp() {
     const double value = mParams->mSliderParams.ClarityFilterValue;
     const auto sigma = static_cast<float>(value * 50 / 1000 + 2);
     const float variance = sigma * sigma;

@@ -35,7 +35,7 @@ bool CColor::applies() {
     return sliders.mColor_Effect_Intensity_Enabled || sliders.mColor_Touch_Enabled;
 }
 
-void CColor::prepare() {
+void CColor::setUp() {
     const CSliderParams& sliders = mParams->mSliderParams;
     const bool touch = mParams->Final_Touch_Mode_Enabled;
     Log::log(LogLevel::Debug, "!Final_Touch_Mode_Enabled  %d.", !touch);

@@ -45,7 +45,7 @@ bool CContrast_Brightness_Perceptual::applies() {
     return isWanted(mParams->mSliderParams);
 }
 
-void CContrast_Brightness_Perceptual::prepare() {
+void CContrast_Brightness_Perceptual::setUp() {
     mActive = mParams->Final_Touch_Mode_Enabled ? prepareTouch() : prepareMain();
     if (!mActive)
         return;

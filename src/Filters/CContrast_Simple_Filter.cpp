@@ -22,7 +22,7 @@ bool CContrast_Simple_Filter::applies() {
            s.mBrightness_Touch_Enabled;
 }
 
-void CContrast_Simple_Filter::prepare() {
+void CContrast_Simple_Filter::setUp() {
     const CSliderParams& s = mParams->mSliderParams;
     const bool finalTouch = mParams->Final_Touch_Mode_Enabled;
     if (finalTouch)

@@ -43,7 +43,7 @@ bool CDigital_Flash_Perceptual::applies() {
     return mParams->mSliderParams.DigitalFlashEnabled;
 }
 
-void CDigital_Flash_Perceptual::prepare() {
+void CDigital_Flash_Perceptual::setUp() {
     useHostPicture();
     if (mParams->m_Histo_Light_Exception == 0) {
         const double flash = mParams->mSliderParams.mDigital_Flash_Value;

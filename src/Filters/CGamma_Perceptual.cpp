@@ -22,7 +22,7 @@ bool CGamma_Perceptual::applies() {
     return sliders.PerceptualGammaEnabled && !sliders.mAuto_Color_Enabled;
 }
 
-void CGamma_Perceptual::prepare() {
+void CGamma_Perceptual::setUp() {
     const float gamma = mParams->mSliderParams.GammaCorrectionEnabled ? 1.0F : takeGamma();
     if (gamma != 1)
         Log::log(LogLevel::Debug, "CGamma_Perceptual 2nd Condition matched.");

@@ -20,7 +20,7 @@ bool CGamma_Simple_Filter::applies() {
     return mParams->mSliderParams.GammaCorrectionEnabled;
 }
 
-void CGamma_Simple_Filter::prepare() {
+void CGamma_Simple_Filter::setUp() {
     mTable = GammaCurve::table(LevelMath::sliderToGamma(mParams->mSliderParams.GammaCorrectionValue));
 }
 

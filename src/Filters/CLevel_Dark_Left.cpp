@@ -21,7 +21,7 @@ bool CLevel_Dark_Left::applies() {
            !sliders.mAuto_Color_Enabled;
 }
 
-void CLevel_Dark_Left::prepare() {
+void CLevel_Dark_Left::setUp() {
     const CSliderParams& sliders = mParams->mSliderParams;
     const bool finalTouch = mParams->Final_Touch_Mode_Enabled;
     Log::log(LogLevel::Debug, "!Final_Touch_Mode_Enabled  %d.", !finalTouch);

@@ -19,7 +19,7 @@ public:
 protected:
     const orvela::TaskDescription& description() const override;
     bool applies() override;
-    void prepare() override;
+    void setUp() override;
     void mapRow(const orvela::PixelRow& row) const override;
 
 private:

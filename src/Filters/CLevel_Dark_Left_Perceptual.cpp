@@ -21,7 +21,7 @@ bool CLevel_Dark_Left_Perceptual::applies() {
     return (sliders.PerceptualDarkEnabled || LevelSwitches::touchPerceptualDark(sliders)) && !absolute;
 }
 
-void CLevel_Dark_Left_Perceptual::prepare() {
+void CLevel_Dark_Left_Perceptual::setUp() {
     const CSliderParams& sliders = mParams->mSliderParams;
     const bool touched = LevelSwitches::touchPerceptualDark(sliders);
     const bool finalTouch = mParams->Final_Touch_Mode_Enabled;

@@ -23,7 +23,7 @@ bool CLevel_Light_Right::applies() {
     return (sliders.mAbsolute_Light_Enabled || touched) && !sliders.mAuto_Color_Enabled && !touchedToNothing;
 }
 
-void CLevel_Light_Right::prepare() {
+void CLevel_Light_Right::setUp() {
     const CSliderParams& sliders = mParams->mSliderParams;
     const bool finalTouch = mParams->Final_Touch_Mode_Enabled;
     Log::log(LogLevel::Debug, "!Final_Touch_Mode_Enabled  %d.", !finalTouch);

@@ -19,7 +19,7 @@ bool CLevel_Light_Right_Perceptual::applies() {
     return sliders.PerceptualLightEnabled || LevelSwitches::touchPerceptualLight(sliders);
 }
 
-void CLevel_Light_Right_Perceptual::prepare() {
+void CLevel_Light_Right_Perceptual::setUp() {
     const CSliderParams& sliders = mParams->mSliderParams;
     const bool touched = LevelSwitches::touchPerceptualLight(sliders);
     const bool finalTouch = mParams->Final_Touch_Mode_Enabled;

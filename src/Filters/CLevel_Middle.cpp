@@ -21,7 +21,7 @@ bool CLevel_Middle::applies() {
            !sliders.mAuto_Color_Enabled;
 }
 
-void CLevel_Middle::prepare() {
+void CLevel_Middle::setUp() {
     const CSliderParams& sliders = mParams->mSliderParams;
     const bool finalTouch = mParams->Final_Touch_Mode_Enabled;
     Log::log(LogLevel::Debug, "!Final_Touch_Mode_Enabled  %d.", !finalTouch);

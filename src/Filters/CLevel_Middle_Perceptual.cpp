@@ -105,7 +105,7 @@ bool CLevel_Middle_Perceptual::applies() {
     return sliders.PerceptualMiddleEnabled || LevelSwitches::touchPerceptualMiddle(sliders);
 }
 
-void CLevel_Middle_Perceptual::prepare() {
+void CLevel_Middle_Perceptual::setUp() {
     const CSliderParams& sliders = mParams->mSliderParams;
     const bool finalTouch = mParams->Final_Touch_Mode_Enabled;
     Log::log(LogLevel::Debug, "!Final_Touch_Mode_Enabled  %d.", !finalTouch);

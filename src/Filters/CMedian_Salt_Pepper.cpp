@@ -38,7 +38,7 @@ bool CMedian_Salt_Pepper::applies() {
     return mParams->mSliderParams.SaltPepperEnabled && !mParams->Switch_TOO_SHARP;
 }
 
-void CMedian_Salt_Pepper::prepare() {
+void CMedian_Salt_Pepper::setUp() {
     const double factor = 2 - static_cast<double>(mParams->mSliderParams.SaltPepperValue) * 1.9 / 1000;
     mSpotFactor = mParams->Dark_middle ? 0.5F : static_cast<float>(factor);
     mVertStart = mRadius;

@@ -21,7 +21,7 @@ bool CMoire::applies() {
            !mParams->Under_Exposed_Picture;
 }
 
-void CMoire::prepare() {
+void CMoire::setUp() {
     useHostPicture();
     mKernel.emplace(mParams->mSliderParams.mMoire_Value);
 }

@@ -30,7 +30,7 @@ void COrv_II_Iter::storeSharpnessSwitch() {
     Log::log(LogLevel::Debug, "Switch_TOO_SHARP_ORV_II %d", mParams->Switch_TOO_SHARP_ORV_II);
 }
 
-void COrv_II_Iter::prepare() {
+void COrv_II_Iter::setUp() {
     const double level = static_cast<double>(mParams->mSliderParams.OrvelaLevel2Value) * 31 / 1000 + 30;
     const auto lightness = static_cast<float>(PixelMath::trunc(level));
     const auto dEpsilon2 = static_cast<float>(PixelMath::trunc(2 * lightness));

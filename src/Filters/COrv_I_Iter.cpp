@@ -34,7 +34,7 @@ void COrv_I_Iter::storeSharpnessSwitch() {
     Log::log(LogLevel::Debug, "Switch_TOO_SHARP ORV I %d", mParams->Switch_TOO_SHARP_ORV_I);
 }
 
-void COrv_I_Iter::prepare() {
+void COrv_I_Iter::setUp() {
     const CSliderParams& sliders = mParams->mSliderParams;
     Log::log(LogLevel::Debug, "Orvela_Level_Value Second Iteration: %f",
              static_cast<double>(sliders.OrvelaLevelValue));

@@ -35,7 +35,7 @@ bool CSpecial_Contrast_Perceptual::applies() {
     return sliders.Contrast2Enabled && !sliders.mAuto_Color_Enabled && !mParams->Under_Exposed_Picture;
 }
 
-void CSpecial_Contrast_Perceptual::prepare() {
+void CSpecial_Contrast_Perceptual::setUp() {
     findTint();
     const double keep = 1 - mTint;
     for (std::size_t channel = 0; channel < mTables.size(); ++channel) {

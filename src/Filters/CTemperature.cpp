@@ -37,7 +37,7 @@ bool CTemperature::applies() {
     return mParams->mSliderParams.Temperature_Enabled;
 }
 
-void CTemperature::prepare() {
+void CTemperature::setUp() {
     const double position = mParams->mSliderParams.Temperature_Value;
     const auto kelvin = static_cast<float>(position * 8000 / 1000 + 2000);
     mInterval = intervalOf(PixelMath::trunc(kelvin));

@@ -22,7 +22,7 @@ protected:
     /// Puts the input back into the output, so that no half-written picture shows through.
     void onStopped() override;
 
-    /// Looks the host's picture up, for the two below; to be called in prepare().
+    /// Looks the host's picture up, for the two below; to be called in setUp().
     void useHostPicture();
     /// The unprocessed host pixel at column x, row y.
     void GetRGBFromHost(int x, int y, std::uint32_t& r, std::uint32_t& g, std::uint32_t& b) const;

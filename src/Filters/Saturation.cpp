@@ -33,7 +33,7 @@ bool Saturation::applies() {
     return mParams->mSliderParams.SaturationEnabled;
 }
 
-void Saturation::prepare() {
+void Saturation::setUp() {
     chooseStrength(mParams->mSliderParams.SaturationValue);
     Log::log(LogLevel::Debug, " Saturation alfa: %f", static_cast<double>(mAlfa));
     mStep = PixelMath::samplingStep(mInPlane->width(), mInPlane->height());

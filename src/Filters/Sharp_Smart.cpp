@@ -43,7 +43,7 @@ const TaskDescription& Sharp_Smart::description() const {
     return kDescription;
 }
 
-void Sharp_Smart::prepare() {
+void Sharp_Smart::setUp() {
     const int width = mInPlane->width();
     const int height = mInPlane->height();
     Log::log(LogLevel::Debug, "Size_Factor: %f", std::sqrt(static_cast<double>(mInPlane->pixelCount())));

@@ -21,7 +21,7 @@ bool Super_ORV::applies() {
     return mParams->mSliderParams.OrvelaLevel3Enabled && !tooSmall;
 }
 
-void Super_ORV::prepare() {
+void Super_ORV::setUp() {
     Log::log(LogLevel::Debug, "Gauss_denominator%f", static_cast<double>(SmoothingKernel::Gauss_denominator));
     const float level = mParams->mSliderParams.OrvelaLevel3Value / 1000;
     mKernel.emplace(level * 0.3 + 0.05F);

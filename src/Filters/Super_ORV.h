@@ -15,7 +15,7 @@ public:
 protected:
     const orvela::TaskDescription& description() const override;
     bool applies() override;
-    void prepare() override;
+    void setUp() override;
     void ApplyRow(std::uint32_t row) override;
 
 private:

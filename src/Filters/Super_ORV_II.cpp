@@ -18,7 +18,7 @@ bool Super_ORV_II::applies() {
     return sliders.OrvelaLevelEnabled || sliders.OrvelaLevel2Enabled;
 }
 
-void Super_ORV_II::prepare() {
+void Super_ORV_II::setUp() {
     useHostPicture();
     const CSliderParams& sliders = mParams->mSliderParams;
     const double level = (static_cast<double>(sliders.OrvelaLevelValue) + sliders.OrvelaLevel2Value) / 2;

@@ -115,7 +115,7 @@ bool TaskBase::PreApply() {
         return false;
     logPlanes(texts.opening);
     logText(texts.matched);
-    prepare();
+    setUp();
     return true;
 }
 

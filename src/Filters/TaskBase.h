@@ -71,7 +71,7 @@ private:
 } // namespace orvela
 
 /// One unit of image work: a filter, a histogram or an analyzer. Created for its step, applied once,
-/// destroyed. A task states its condition (applies), its numbers (prepare), its formula (ApplyRow) and its
+/// destroyed. A task states its condition (applies), its numbers (setUp), its formula (ApplyRow) and its
 /// texts (description); the frame does the rest.
 ///
 /// Apply() runs PreApply(), a pass over the rows in bands that the scheduler spreads over the processors,
@@ -110,7 +110,7 @@ protected:
     virtual bool applies() { return true; }
     /// Turns parameters and statistics into the numbers and tables of the pass, and sets its rows. May store
     /// what it finds for later tasks.
-    virtual void prepare() {}
+    virtual void setUp() {}
     /// Processes the rows of a band by ApplyRow(); a task may work on neighbouring rows together instead.
     virtual void ApplyBand(const orvela::RowBand& band);
     /// What is left to do after the pass.

@@ -24,7 +24,7 @@ const TaskDescription& CHistogram0::description() const {
     return kDescription;
 }
 
-void CHistogram0::prepare() {
+void CHistogram0::setUp() {
     mWhite = 0;
     mBlack = 0;
     mSampleCount = 0;

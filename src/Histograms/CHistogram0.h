@@ -10,7 +10,7 @@ public:
 
 protected:
     const orvela::TaskDescription& description() const override;
-    void prepare() override;
+    void setUp() override;
     void ApplyRow(std::uint32_t row) override;
     void complete() override;
 

@@ -11,7 +11,7 @@ const TaskDescription& CHistogram_III::description() const {
     return kDescription;
 }
 
-void CHistogram_III::prepare() {
+void CHistogram_III::setUp() {
     mParams->Dark_Ave = 0;
     mParams->Middle_Ave = 0;
     mParams->Light_Ave = 0;

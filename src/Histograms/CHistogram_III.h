@@ -10,6 +10,6 @@ public:
 
 protected:
     const orvela::TaskDescription& description() const override;
-    void prepare() override;
+    void setUp() override;
     void complete() override;
 };

@@ -17,7 +17,7 @@ bool CHistogram_IV::applies() {
     return mParams->mSliderParams.mAuto_Color_Enabled;
 }
 
-void CHistogram_IV::prepare() {
+void CHistogram_IV::setUp() {
     logFlags();
     mParams->Dark_Ave = 0;
     mParams->Middle_Ave = 0;

@@ -11,7 +11,7 @@ public:
 protected:
     const orvela::TaskDescription& description() const override;
     bool applies() override;
-    void prepare() override;
+    void setUp() override;
     void complete() override;
     void StoreResults() override;
 

@@ -17,7 +17,7 @@ const TaskDescription& CHistogram_Luma_Final::description() const {
     return kDescription;
 }
 
-void CHistogram_Luma_Final::prepare() {
+void CHistogram_Luma_Final::setUp() {
     mSumLuma = 0;
     mSampleCount = 0;
 }

@@ -18,7 +18,7 @@ bool CHistogram_Luma_after_Orv::applies() {
     return iterated && mParams->Normal_Picture && !mParams->Under_Exposed_Picture;
 }
 
-void CHistogram_Luma_after_Orv::prepare() {
+void CHistogram_Luma_after_Orv::setUp() {
     prepareSampling();
 }
 

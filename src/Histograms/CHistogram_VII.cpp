@@ -13,7 +13,7 @@ const TaskDescription& CHistogram_VII::description() const {
     return kDescription;
 }
 
-void CHistogram_VII::prepare() {
+void CHistogram_VII::setUp() {
     prepareSampling();
 }
 

@@ -9,7 +9,7 @@ public:
 
 protected:
     const orvela::TaskDescription& description() const override;
-    void prepare() override;
+    void setUp() override;
     void complete() override;
     void StoreResults() override;
 

@@ -15,7 +15,7 @@ bool CHistogram_VIII::applies() {
     return mParams->mSliderParams.DigitalFlashEnabled;
 }
 
-void CHistogram_VIII::prepare() {
+void CHistogram_VIII::setUp() {
     prepareSampling();
 }
 

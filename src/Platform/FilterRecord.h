@@ -215,8 +215,11 @@ enum ImageMode : std::int16_t {
 };
 
 // The layout is the host's: each field is checked for 32-bit and 64-bit pointers.
-#define ORVELA_CHECK_OFFSET(field, offset32, offset64)                                                       \
-    static_assert(offsetof(FilterRecord, field) == (sizeof(void*) == 4 ? offset32 : offset64))
+constexpr std::size_t offsetHere(std::size_t on32, std::size_t on64) {
+    return sizeof(void*) == 4 ? on32 : on64;
+}
+#define ORVELA_CHECK_OFFSET(field, on32, on64)                                                               \
+    static_assert(offsetof(FilterRecord, field) == offsetHere(on32, on64))
 ORVELA_CHECK_OFFSET(serialNumber, 0, 0);
 ORVELA_CHECK_OFFSET(abortProc, 4, 4);
 ORVELA_CHECK_OFFSET(progressProc, 8, 12);

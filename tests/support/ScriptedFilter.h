@@ -42,7 +42,7 @@ protected:
         phases.emplace_back("pre");
         return pre;
     }
-    void prepare() override {
+    void setUp() override {
         if (end != 0) {
             mVertStart = start;
             mVertEnd = end;
