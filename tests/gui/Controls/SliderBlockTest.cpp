@@ -47,9 +47,6 @@ protected:
         QTest::keyClick(block.txtValue, Qt::Key_Return);
         return text();
     }
-    void doubleClick(const QPoint& point) {
-        QTest::mouseDClick(window.windowHandle(), Qt::LeftButton, {}, block.mapTo(&window, point));
-    }
     void wheel(int angle) {
         const QPointF middle = QRectF(slider()->rect()).center();
         QWheelEvent event(middle, slider()->mapToGlobal(middle), {}, {0, angle}, Qt::NoButton, {},
@@ -82,35 +79,38 @@ TEST_F(SliderBlock, PositionsSnapToWhatOneDecimalTells) {
 TEST_F(SliderBlock, DraggingMovesTheTextAndAnnouncesOnceAtRelease) {
     QSignalSpy changed(&block, &COrvelaSliderBlockImpl::valueChanged);
     const int last = slider()->width() - 1;
+    const auto shown = [last](int x) { return QString::number(100.0 / last * x, 'f', 1).toStdString(); };
     QTest::mousePress(slider(), Qt::LeftButton, {}, QPoint(1 + last / 4, 3));
-    EXPECT_TRUE(slider()->isDragging());
-    EXPECT_EQ(text(), QString::number(100.0 / last * (last / 4), 'f', 1).toStdString());
+    EXPECT_EQ(text(), shown(last / 4));
     QTest::mouseMove(slider(), QPoint(1 + last / 2, 3));
-    EXPECT_EQ(text(), QString::number(100.0 / last * (last / 2), 'f', 1).toStdString());
+    EXPECT_EQ(text(), shown(last / 2));
     EXPECT_EQ(changed.count(), 0);
     QTest::mouseRelease(slider(), Qt::LeftButton, {}, QPoint(1 + last / 2, 3));
-    EXPECT_FALSE(slider()->isDragging());
-    EXPECT_FALSE(slider()->hasMouseTracking());
+    EXPECT_FALSE(slider()->isDragging() || slider()->hasMouseTracking());
     ASSERT_EQ(changed.count(), 1);
     EXPECT_DOUBLE_EQ(changed[0][0].toDouble(), 1000.0 / last * (last / 2));
     QTest::mousePress(slider(), Qt::LeftButton, {}, QPoint(0, 3)); // left of the scale's first pixel
     EXPECT_EQ(block.value(), 0);
     QTest::mouseRelease(slider(), Qt::LeftButton, {}, QPoint(last + 50, 3));
     EXPECT_EQ(block.value(), 1000);
+    QTest::mousePress(slider(), Qt::LeftButton, {}, QPoint(0, 3));
+    block.setEnabled(false);
+    EXPECT_FALSE(slider()->isDragging()) << "a release will not come any more";
 }
 
 TEST_F(SliderBlock, TheWholeHeightOfTheRowTakesTheMouse) {
     const QRect thin = slider()->geometry();
     ASSERT_GT(thin.top(), 2);
+    block.txtValue->setFocus();
     QTest::mousePress(&block, Qt::LeftButton, {}, QPoint(thin.right(), 1));
-    EXPECT_TRUE(slider()->isDragging());
-    EXPECT_TRUE(slider()->hasFocus());
-    QTest::mouseRelease(&block, Qt::LeftButton, {}, QPoint(thin.left() + 1, block.height() - 1));
+    EXPECT_TRUE(slider()->isDragging() && slider()->hasFocus());
+    QTest::mouseRelease(&block, Qt::LeftButton, {}, QPoint(thin.center().x(), block.height() - 1));
     EXPECT_FALSE(slider()->isDragging());
+    const std::string middle = text();
     QTest::mouseClick(&block, Qt::LeftButton, {}, QPoint(thin.left() - 3, 1)); // beside the slider
     block.setEnabled(false);
     QTest::mouseClick(&block, Qt::LeftButton, {}, QPoint(thin.right(), 1));
-    EXPECT_EQ(text(), "0.0");
+    EXPECT_EQ(text(), middle);
 }
 
 TEST_F(SliderBlock, TypedTextMovesTheSliderAtEveryKey) {
@@ -133,8 +133,8 @@ TEST_F(SliderBlock, FinishingCutsToOneDecimalAndResetsOutOfRangeToTheBottom) {
     EXPECT_EQ(block.value(), 0);
     EXPECT_EQ(QToolTip::text(), QStringLiteral("Fade shall be in range: 0 to 100"));
     EXPECT_EQ(enter("12.75"), "12.8");
-    EXPECT_EQ(enter("5000.75"), "0");
     type("1e999");
+    EXPECT_EQ(block.value(), 0);
     next.txtValue->setFocus();
     EXPECT_EQ(text(), "0");
     EXPECT_TRUE(block.txtValue->hasFocus()) << "the field takes the focus back";
@@ -147,21 +147,16 @@ TEST_F(SliderBlock, FinishingCutsToOneDecimalAndResetsOutOfRangeToTheBottom) {
 
 TEST_F(SliderBlock, DoubleClickAnywhereSwitchesOnAndOff) {
     QSignalSpy state(&block, &COrvelaSliderBlockImpl::stateChanged);
-    bool on = true;
-    for (QWidget* part : {static_cast<QWidget*>(block.lblName), static_cast<QWidget*>(slider()),
-                          static_cast<QWidget*>(block.txtValue)}) {
-        for (int round = 0; round < 2; ++round) {
-            doubleClick(part->geometry().center());
-            on = !on;
-            ASSERT_FALSE(state.isEmpty());
-            EXPECT_EQ(state.takeLast()[0].toBool(), on) << qPrintable(part->objectName());
-            EXPECT_TRUE(state.isEmpty());
-            EXPECT_EQ(slider()->isEnabled(), on);
-            EXPECT_EQ(block.txtValue->isEnabled(), on);
-            EXPECT_EQ(block.txtValue->font().italic(), !on);
-            EXPECT_TRUE(block.lblName->isEnabled());
-            EXPECT_FALSE(slider()->isDragging());
-        }
+    const QPoint parts[] = {block.lblName->geometry().center(), slider()->geometry().center(),
+                            block.txtValue->geometry().center()};
+    for (int round = 0; round < 6; ++round) {
+        const bool on = round % 2 == 1;
+        QTest::mouseDClick(window.windowHandle(), Qt::LeftButton, {}, block.mapTo(&window, parts[round / 2]));
+        ASSERT_EQ(state.count(), 1) << round;
+        EXPECT_EQ(state.takeLast()[0].toBool(), on) << round;
+        EXPECT_TRUE(slider()->isEnabled() == on && block.txtValue->isEnabled() == on);
+        EXPECT_EQ(block.txtValue->font().italic(), !on);
+        EXPECT_TRUE(block.lblName->isEnabled() && !slider()->isDragging());
     }
     window.setEnabled(false); // the surroundings do not count
     block.setEnabled(true);
@@ -207,7 +202,7 @@ TEST_F(SliderBlock, AKeyAlwaysMovesTheShownNumber) {
 
 TEST_F(SliderBlock, TabVisitsSliderThenTextThenTheNextBlock) {
     slider()->setFocus();
-    for (QWidget* widget : std::initializer_list<QWidget*>{block.txtValue, next.sldrValue, next.txtValue}) {
+    for (QWidget* widget : QList<QWidget*>{block.txtValue, next.sldrValue, next.txtValue}) {
         QTest::keyClick(QApplication::focusWidget(), Qt::Key_Tab);
         EXPECT_EQ(QApplication::focusWidget(), widget);
     }
