@@ -2,6 +2,7 @@
 #include "Settings/PresetConversion.h"
 #include "Settings/SettingsStore.h"
 #include "Utility/CGenericEx.h"
+#include "support/SettingsMap.h"
 
 #include <QElapsedTimer>
 #include <QPoint>
@@ -67,10 +68,8 @@ TEST_F(PresetTreeTest, EveryNameComesBack) {
 }
 
 TEST_F(PresetTreeTest, GarbageReadsAsZeroAndOff) {
-    const QVariantList garbage = {
-        QVariant(),   "abc",        "nan", "-inf", QStringList{"1", "2"}, QByteArray("\0\1", 2),
-        QPoint(3, 4), "@Variant(x", ""};
-    for (const QVariant& value : garbage) {
+    for (const QVariant& value : QVariantList{QVariant(), "abc", "nan", "-inf", QStringList{"1", "2"},
+                                              QByteArray("\0\1", 2), QPoint(3, 4), "@Variant(x", ""}) {
         QSettings settings = openSettings();
         settings.beginGroup("2000/UserPresets/Advanced/x");
         for (const char* key : {"Sliders/s/Value", "Sliders/s/Enabled", "ColorPickers/c/Red",
@@ -105,21 +104,14 @@ TEST_F(PresetTreeTest, TenThousandPresetsAreListedSoon) {
 TEST_F(PresetTreeTest, SettingsBecomeControlsAndComeBack) {
     for (const ModeDescription& mode : ModeTable::all()) {
         SCOPED_TRACE(mode.displayName);
-        CSliderParams sliders;
-        float value = 0;
-        for (const SliderField& field : sliderFields())
-            field.flag ? void(sliders.*field.flag = true) : void(sliders.*field.value = ++value);
+        const CSliderParams sliders = distinctSettings();
         const PresetContent content = PresetConversion::contentOf(mode.mode, sliders);
-        const CSliderParams back = PresetConversion::paramsOf(mode.mode, content);
-        int kept = 0;
-        for (const SliderField& field : sliderFields())
-            if (field.flag ? back.*field.flag : back.*field.value != 0) {
-                ++kept;
-                EXPECT_TRUE(field.flag || back.*field.value == sliders.*field.value) << field.name;
-            }
+        const auto back = settingsOf(PresetConversion::paramsOf(mode.mode, content));
+        for (const auto& [name, value] : back)
+            EXPECT_EQ(value, settingsOf(sliders)[name]) << name;
         // A position and a switch each, the automatic contrast only its switch, three parts of a colour.
         const auto count = 2 * content.sliders.size() + 3 * content.colors.size();
-        EXPECT_EQ(kept, mode.mode == Mode_Advanced ? count - 1 : count);
+        EXPECT_EQ(back.size(), size_t(mode.mode == Mode_Advanced ? count - 1 : count));
         EXPECT_EQ(PresetConversion::hasControls(mode.mode),
                   mode.mode == Mode_Advanced || mode.mode > Mode_Batch);
     }

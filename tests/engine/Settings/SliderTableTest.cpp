@@ -64,8 +64,8 @@ TEST(SliderTable, EveryFieldIsDrivenOnceAndByItsStage) {
 
 TEST(PaneTable, EverySliderHasOneControlInThePaneOfItsStageAndAHelp) {
     std::map<const SliderDescription*, int> controls;
+    std::set<std::string> objects;
     for (const EGUIMode mode : {Mode_Advanced, Mode_FinalTouch}) {
-        std::set<std::string> objects;
         for (const PaneSlider& each : PaneTable::sliders(mode)) {
             EXPECT_TRUE(objects.insert(each.object).second) << each.object;
             EXPECT_EQ(each.slider.stage == SettingStage::FinalTouch, mode == Mode_FinalTouch);
@@ -78,13 +78,6 @@ TEST(PaneTable, EverySliderHasOneControlInThePaneOfItsStageAndAHelp) {
         EXPECT_TRUE(std::isupper(help.front()) && help.find('.') > 20 && help.back() == '.') << help;
     }
     EXPECT_EQ(controls.size(), SliderTable::sliders().size());
-    for (int mode = Mode_Automatic; mode <= Mode_Adjustments; ++mode) {
-        const auto sliders = PaneTable::sliders(static_cast<EGUIMode>(mode));
-        const bool single = mode >= Mode_SmartSharpness && mode <= Mode_ColorFilter;
-        EXPECT_EQ(PaneTable::single(static_cast<EGUIMode>(mode)) != nullptr, single);
-        EXPECT_EQ(sliders.empty(), mode < Mode_Advanced || (mode > Mode_Advanced && mode < Mode_FinalTouch) ||
-                                       mode == 16 || mode == 31);
-    }
 }
 
 // The text is the same at every tenth of a position; a filter takes the gamma as a float.
