@@ -143,11 +143,10 @@ INSTANTIATE_TEST_SUITE_P(All, SliderBlockTable, testing::ValuesIn(QDir(kTables).
                          [](const auto& file) { return file.param.chopped(4).toStdString(); });
 
 TEST_F(SliderBlock, AKeyAlwaysMovesTheShownNumber) {
-    slider()->setFocus();
-    for (const SliderScale* scale :
-         {&SliderScales::Thousandth, &SliderScales::Gamma, &SliderScales::Highlights}) {
+    using namespace SliderScales;
+    for (const SliderScale* scale : {&Thousandth, &Gamma, &Highlights}) {
         block.setScale(*scale);
-        for (const auto& [key, end] : {std::pair(Qt::Key_Left, 0.0), std::pair(Qt::Key_Right, 1000.0)}) {
+        for (const auto& [key, end] : {std::pair(Qt::Key_Left, 0.0), {Qt::Key_Right, 1000.0}}) {
             for (int count = 0; std::abs(block.value() - end) > 0.01 && count < 300; ++count) {
                 const QString before = text();
                 QTest::keyClick(slider(), key);

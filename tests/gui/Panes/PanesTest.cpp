@@ -90,7 +90,8 @@ void Pane::expectFirst() const {
     }
 }
 
-// Gives every control a state of its own and expects those, and nothing else, among the settings.
+// Gives every control a state of its own and expects the owner to be told of it, and those states, and
+// nothing else, among the settings.
 void Pane::expectWrites(bool odd) {
     CUserParams params;
     for (const SliderField& field : sliderFields())
@@ -103,15 +104,21 @@ void Pane::expectWrites(bool odd) {
     double position = odd ? 4 : -11;
     for (const auto& [object, first, value, enabled] : controls) {
         if (CColorPicker* found = picker(object)) {
-            found->setColor(QColor(9, odd ? 80 : 12, 200));
-            expect(value + 'R', 9);
-            expect(value + 'G', odd ? 80 : 12);
-            expect(value + 'B', 200);
+            const QColor color(9, odd ? 80 : 12, 200);
+            found->setColor(color);
+            EXPECT_TRUE(owner.colors.endsWith(color));
+            expect(value + 'R', color.red());
+            expect(value + 'G', color.green());
+            expect(value + 'B', color.blue());
             continue;
         }
         const bool on = (int(position += 31) % 2 == 1) == odd;
-        block(object)->setValue(position);
+        for (const double each : {0.0, 1000.0, position})
+            block(object)->setValue(each);
+        block(object)->setEnabled(!on);
         block(object)->setEnabled(on);
+        EXPECT_TRUE(owner.values.endsWith(block(object)->value()) && owner.states.endsWith(on))
+            << qPrintable(object);
         expect(value, block(object)->value());
         expect(enabled, on);
     }
@@ -209,25 +216,6 @@ TEST(GenericPane, PickerShowsWhileItsSliderIsOn) {
     shown.pane->setSliders(QString()); // no factory preset of this pane: only the reset
     EXPECT_FALSE(shown.pane->sldrGeneric->isEnabled());
     EXPECT_EQ(shown.pane->sldrGeneric->value(), 500);
-    picker->setColor(Qt::blue);
-    EXPECT_EQ(shown.owner.colors.last(), QColor(Qt::blue));
-}
-
-TEST(AdvancedPane, TellsItsOwnerOfEveryChange) {
-    Shown<CWgtPaneAdvancedImpl> shown(Mode_Advanced);
-    CWgtPaneAdvancedImpl* const pane = shown.pane;
-    shown.owner.values.clear();
-    shown.owner.states.clear();
-    pane->sldrFade->setValue(420);
-    pane->sldrFade->setEnabled(true);
-    pane->colrPickAutoColor->setColor(Qt::red);
-    EXPECT_EQ(shown.owner.values, QList<double>{420});
-    EXPECT_EQ(shown.owner.states, QList<bool>{true});
-    EXPECT_EQ(shown.owner.colors.last(), QColor(Qt::red));
-    pane->setSliders(QStringLiteral("Automatic"));
-    shown.owner.values.clear();
-    pane->sldrFade->setValue(430);
-    EXPECT_EQ(shown.owner.values, (QList<double>{430, 430})) << "set up twice, told twice";
 }
 
 TEST(AdvancedPane, FoldsTheRarelyUsedGroupsAway) {

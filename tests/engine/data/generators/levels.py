@@ -1,12 +1,7 @@
 """The level filters over twelve pixels; the host's pixels are 255 minus the input's."""
-import itertools
-import pathlib
-import re
-from collections import defaultdict
 from math import cosh
-from string import Template
 
-from reference import case, f, keep_hue
+from reference import case, f, keep_hue, parsed, table
 
 PIXELS = [(0, 0, 0), (1, 2, 3), (20, 60, 10), (40, 40, 40), (90, 110, 100), (100, 100, 100), (101, 100, 100),
           (180, 30, 220), (250, 128, 5), (200, 210, 190), (255, 255, 200), (255, 255, 255)]
@@ -164,30 +159,11 @@ MODELS = {"CLevel_Dark_Left": dark_left, "CLevel_Middle": middle, "CLevel_Light_
           "CLevel_Light_Right_Perceptual": light_perceptual}
 
 
-def each_suffix(setting):
-    values = zip(("RGB", "R", "G", "B"), setting[3].split(","))
-    return " ".join(f"{setting[1]}{suffix}{setting[2]}={value}" for suffix, value in values)
-
-
-def settings():
-    """The cases of levels.txt, spelt out."""
-    given = {}
-    for line in pathlib.Path(__file__).with_name("levels.txt").read_text().splitlines()[2:]:
-        name, _, text = Template(line).substitute(given).partition(" ")
-        text = re.sub(r"(\S*)\*(\S*)=(\S+)", each_suffix, text)
-        if text.startswith("= "):
-            given[name] = text[2:]
-        elif name:
-            for words in itertools.product(*(part.split(";") for part in re.split("[{}]", text))):
-                yield name, "".join(words)
-
-
 def cases():
     text = lambda rows: " ".join(",".join(str(int(x)) for x in pixel) for pixel in rows)
     host = text([255 - x for x in pixel] for pixel in PIXELS)
-    for name, setting in settings():
-        p = defaultdict(float, Normal_Picture=1)
-        p.update((k, f(float(v))) for k, v in (s.split("=") for s in setting.split()))
+    for name, setting in table("levels.txt"):
+        p = parsed("Normal_Picture=1 " + setting)
         new = MODELS[name](p)
         # Two equal rows; one of the filters leaves the last one alone.
         last = PIXELS if name == "CLevel_Dark_Left_Perceptual" else []
