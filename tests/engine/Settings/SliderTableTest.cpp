@@ -1,11 +1,11 @@
 #include "Settings/PaneTable.h"
 #include "Settings/SettingFields.h"
+#include "support/SettingsMap.h"
 
 #include <gtest/gtest.h>
 
-#include <map>
+#include <algorithm>
 #include <set>
-#include <string>
 
 using namespace orvela;
 
@@ -22,6 +22,9 @@ TEST(SliderTable, ScalesShowTheDocumentedNumbersAndComeBack) {
         {&Contrast, {-100, 0, 100}},   {&Brightness, {-255, 0, 255}},
         {&Gamma, {0.1, 1, 10}},        {&Shadows, {0, 127.5, 255}},
         {&Highlights, {255, 127.5, 0}}};
+    EXPECT_EQ(Gamma.text(575), "2.3"); // 2.35 lies between two texts
+    EXPECT_EQ(Gamma.text(250), "0.6"); // 0.55
+    EXPECT_NEAR(Noise.told(250), (1.6 - 0.5) / 0.0045, 1e-9);
     std::set<const SliderScale*> used;
     for (const SliderDescription& slider : SliderTable::sliders())
         used.insert(slider.scale);
@@ -37,35 +40,30 @@ TEST(SliderTable, ScalesShowTheDocumentedNumbersAndComeBack) {
 
 TEST(SliderTable, EveryFieldIsDrivenOnceAndByItsStage) {
     for (const SliderField& field : sliderFields()) {
-        SCOPED_TRACE(field.name);
         const std::string name = field.name;
         int drivers = 0;
         for (const SliderDescription& slider : SliderTable::sliders())
             drivers += field.value ? slider.value == field.value : slider.enabled == field.flag;
         for (const ColorDescription& color : SliderTable::colors())
-            for (float CSliderParams::*part : color.parts)
-                drivers += field.value && part == field.value;
+            drivers += field.value && std::count(color.parts.begin(), color.parts.end(), field.value);
         const bool idle = name == "mPerceptual_Touch_Dark_Enabled" || name == "Noise_Cleaner_Off";
-        EXPECT_EQ(drivers, idle ? 0 : 1);
-        if (idle)
-            continue;
-        const bool touch = name.find("_Touch_") != std::string::npos;
-        EXPECT_EQ(SettingFields::stageOf(field) == SettingStage::FinalTouch, touch);
+        EXPECT_EQ(drivers, idle ? 0 : 1) << name;
+        const bool touch = !idle && name.find("_Touch_") != std::string::npos;
         CSliderParams sliders;
         field.value ? void(sliders.*field.value = 3) : void(sliders.*field.flag = true);
-        for (const SettingStage stage : {SettingStage::Main, SettingStage::FinalTouch}) {
-            const CSliderParams kept = SettingFields::ofStage(sliders, stage);
-            const bool isKept = field.value ? kept.*field.value == 3 : kept.*field.flag;
-            EXPECT_EQ(isKept, touch == (stage == SettingStage::FinalTouch));
+        for (const bool other : {false, true}) {
+            const auto stage = touch != other ? SettingStage::FinalTouch : SettingStage::Main;
+            EXPECT_EQ(settingsOf(SettingFields::ofStage(sliders, stage)).count(name), other ? 0U : 1U)
+                << name;
+            EXPECT_EQ(SettingFields::anyOn(sliders, stage), !other && !idle && field.flag) << name;
         }
-        EXPECT_EQ(SettingFields::anyOn(sliders, SettingStage::FinalTouch), touch && field.flag);
     }
 }
 
 TEST(PaneTable, EverySliderHasOneControlInThePaneOfItsStageAndAHelp) {
     std::map<const SliderDescription*, int> controls;
+    std::set<std::string> objects;
     for (const EGUIMode mode : {Mode_Advanced, Mode_FinalTouch}) {
-        std::set<std::string> objects;
         for (const PaneSlider& each : PaneTable::sliders(mode)) {
             EXPECT_TRUE(objects.insert(each.object).second) << each.object;
             EXPECT_EQ(each.slider.stage == SettingStage::FinalTouch, mode == Mode_FinalTouch);
@@ -78,25 +76,6 @@ TEST(PaneTable, EverySliderHasOneControlInThePaneOfItsStageAndAHelp) {
         EXPECT_TRUE(std::isupper(help.front()) && help.find('.') > 20 && help.back() == '.') << help;
     }
     EXPECT_EQ(controls.size(), SliderTable::sliders().size());
-    for (int mode = Mode_Automatic; mode <= Mode_Adjustments; ++mode) {
-        const auto sliders = PaneTable::sliders(static_cast<EGUIMode>(mode));
-        const bool single = mode >= Mode_SmartSharpness && mode <= Mode_ColorFilter;
-        EXPECT_EQ(PaneTable::single(static_cast<EGUIMode>(mode)) != nullptr, single);
-        EXPECT_EQ(sliders.empty(), mode < Mode_Advanced || (mode > Mode_Advanced && mode < Mode_FinalTouch) ||
-                                       mode == 16 || mode == 31);
-    }
-}
-
-// The text is the same at every tenth of a position; a filter takes the gamma as a float.
-TEST(SliderScales, GammaIsOneMapForControlsAndFilters) {
-    for (int tenth = 0; tenth <= 10000; ++tenth) {
-        const double p = tenth / 10.0;
-        const double gamma = p < 500 ? p * 0.9 / 500 + 0.1 : (p - 500) * 9 / 500 + 1;
-        EXPECT_EQ(static_cast<float>(SliderScales::gammaAt(p)), static_cast<float>(gamma)) << p;
-    }
-    EXPECT_EQ(SliderScales::Gamma.text(575), "2.3"); // 2.35 lies between two texts
-    EXPECT_EQ(SliderScales::Gamma.text(250), "0.6"); // 0.55
-    EXPECT_NEAR(SliderScales::Noise.told(250), (1.6 - 0.5) / 0.0045, 1e-9);
 }
 
 } // namespace

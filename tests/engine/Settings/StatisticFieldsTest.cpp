@@ -3,7 +3,7 @@
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
 #include "Settings/ModeTable.h"
 #include "support/StatisticMap.h"
-#include "support/TestPlanes.h"
+#include "support/TaskSettings.h"
 
 #include <QStringList>
 
@@ -25,21 +25,20 @@ void expectHolds(const CARGBPlane& picture, CUserParamsPhotoshop params, Written
     CARGBPlane out(picture, QString());
     const CARGBPlaneProxyDirect proxy(picture);
     Core core(&in, &out);
-    QObject::connect(&core, &CThreadedCore::stepDone, &core, [&core] { core.stepHandled(); });
+    QObject::connect(&core, &CThreadedCore::stepDone, &core, &CThreadedCore::stepHandled);
     std::map<std::string, double> before = statistics(params);
     core.setParams(params);
     core.setObserver([&](const TaskReport& report) {
         for (const StatisticField& field : statisticFields()) {
             const double value = field.valueIn(core.params());
-            EXPECT_GE(value, field.low) << field.name << " after " << report.name;
-            EXPECT_LE(value, field.high) << field.name << " after " << report.name;
+            EXPECT_TRUE(value >= field.low && value <= field.high)
+                << field.name << ' ' << value << " after " << report.name;
             if (value == std::exchange(before[field.name], value))
                 continue;
             written[field.name].insert(report.name);
             const QStringList writers = QString::fromLatin1(field.writer).split(QStringLiteral(", "));
             // What the pipeline itself writes between tasks shows after the next one.
-            EXPECT_TRUE(writers.contains(QLatin1String(report.name)) ||
-                        writers.contains(QStringLiteral("main pipeline")))
+            EXPECT_TRUE(writers.contains(report.name) || writers.contains("main pipeline"))
                 << field.name << " by " << report.name;
         }
     });
@@ -57,13 +56,10 @@ std::unique_ptr<CARGBPlane> dusk() {
 
 // Every slider on, or only those whose switch begins with `name`: the absolute levels keep the others away.
 CUserParamsPhotoshop on(float position, const std::string& name = {}) {
-    CUserParamsPhotoshop params;
-    for (const SliderField& field : sliderFields()) {
-        if (field.value)
-            params.mSliderParams.*field.value = position;
-        else
+    CUserParamsPhotoshop params = tasksettings::paramsFor("", position);
+    for (const SliderField& field : sliderFields())
+        if (field.flag)
             params.mSliderParams.*field.flag = std::string(field.name).starts_with(name);
-    }
     return params;
 }
 

@@ -26,13 +26,18 @@ protected:
 TEST_F(ColorPicker, SetColorFillsTheFieldsAndAnnounces) {
     QSignalSpy changed(&picker, &CColorPicker::colorChanged);
     picker.setColor(QColor(1, 20, 255));
-    EXPECT_EQ(field("redValue")->text(), QStringLiteral("1"));
-    EXPECT_EQ(field("greenValue")->text() + field("blueValue")->text(), QStringLiteral("20255"));
+    QStringList shown;
+    for (const QLineEdit* field : picker.findChildren<QLineEdit*>())
+        shown << field->objectName() + field->text();
+    EXPECT_EQ(shown, QStringList({"redValue1", "greenValue20", "blueValue255"}));
     for (const QList<QVariant>& call : changed)
         EXPECT_EQ(call[0].value<QColor>(), QColor(1, 20, 255));
     changed.clear();
     picker.setColor(QColor(1, 20, 255)); // no field changes: just the announcement itself
     EXPECT_EQ(changed.count(), 1);
+    QAccessibleInterface* access = QAccessible::queryAccessibleInterface(&picker);
+    EXPECT_EQ(access->role(), QAccessible::ColorChooser);
+    EXPECT_EQ(access->text(QAccessible::Value), "#0114ff");
 }
 
 TEST_F(ColorPicker, TypedComponentsAreKeptWithin255) {
@@ -69,13 +74,6 @@ TEST_F(ColorPicker, ThePopupPicksThePixelUnderTheMouse) {
     QTest::mouseRelease(popup(), Qt::LeftButton, {}, QPoint(60, 53));
     EXPECT_FALSE(popup()->isVisible());
     EXPECT_FALSE(popup()->hasMouseTracking());
-}
-
-TEST_F(ColorPicker, TellsItsColor) {
-    picker.setColor(QColor(200, 30, 40));
-    QAccessibleInterface* access = QAccessible::queryAccessibleInterface(&picker);
-    EXPECT_EQ(access->role(), QAccessible::ColorChooser);
-    EXPECT_EQ(access->text(QAccessible::Value), QStringLiteral("#c81e28"));
 }
 
 } // namespace

@@ -1,6 +1,7 @@
 #include "GUI/Controls/CGridCell.h"
 #include "GUI/Controls/CSignaledGraphicsView.h"
 #include "GUI/Controls/PreviewScene.h"
+#include "support/TestPlanes.h"
 
 #include <QGraphicsScene>
 #include <QPainter>
@@ -10,21 +11,15 @@
 
 #include <gtest/gtest.h>
 
-#include <cstdlib>
-
 using namespace orvela;
 
 namespace {
 
-/// A plane whose samples tell their place: red 10 x, green 10 y, blue x + y.
-void fillByPlace(CARGBPlane& plane) {
-    plane.setColorMode(CARGBPlane::Color);
-    for (int at = 0; at < plane.pixelCount(); ++at) {
-        const std::div_t place = std::div(at, plane.width());
-        plane.samples(Channel::Red)[at] = static_cast<std::uint8_t>(10 * place.rem);
-        plane.samples(Channel::Green)[at] = static_cast<std::uint8_t>(10 * place.quot);
-        plane.samples(Channel::Blue)[at] = static_cast<std::uint8_t>(place.rem + place.quot);
-    }
+/// A plane whose samples tell their place.
+std::unique_ptr<CARGBPlane> places(int width, int height) {
+    return testplanes::make(width, height, [](int x, int y) {
+        return testplanes::Pixel{std::uint8_t(10 * x), std::uint8_t(10 * y), std::uint8_t(x + y)};
+    });
 }
 
 QImage rendered(QGraphicsScene& scene) {
@@ -45,11 +40,10 @@ QString cellsOf(const QGraphicsScene& scene) {
 }
 
 TEST(PreviewScene, TilesThePlaneAndShowsEveryPixel) {
-    CARGBPlane plane(7, 5, QStringLiteral("plane"));
-    fillByPlace(plane);
+    const auto plane = places(7, 5);
     QGraphicsScene scene;
     scene.addRect(0, 0, 900, 900);
-    PreviewScene::show(scene, plane, {4, 3});
+    PreviewScene::show(scene, *plane, {4, 3});
     EXPECT_EQ(scene.sceneRect(), QRectF(0, 0, 7, 5));
     EXPECT_EQ(cellsOf(scene).toStdString(), "1:0,0,4x3 1:4,0,3x3 1:0,3,4x2 1:4,3,3x2");
     const QImage image = rendered(scene);
@@ -59,15 +53,14 @@ TEST(PreviewScene, TilesThePlaneAndShowsEveryPixel) {
 }
 
 TEST(PreviewScene, OneCellReadsThePlaneWhenFirstPainted) {
-    CARGBPlane plane(3, 2, QStringLiteral("plane"));
-    fillByPlace(plane);
-    plane.setColorMode(CARGBPlane::Grayscale);
+    const auto plane = places(3, 2);
+    plane->setColorMode(CARGBPlane::Grayscale);
     QGraphicsScene scene;
-    PreviewScene::show(scene, plane);
+    PreviewScene::show(scene, *plane);
     EXPECT_EQ(cellsOf(scene).toStdString(), "1:0,0,3x2");
-    plane.row(1)[0][2] = 77;
+    plane->row(1)[0][2] = 77;
     EXPECT_EQ(rendered(scene).pixel(2, 1), qRgb(77, 77, 77));
-    plane.row(1)[0][2] = 1;
+    plane->row(1)[0][2] = 1;
     EXPECT_EQ(rendered(scene).pixel(2, 1), qRgb(77, 77, 77)) << "kept until shown anew";
     const CARGBPlane empty(0, 0, QStringLiteral("empty"));
     PreviewScene::show(scene, empty);
@@ -89,8 +82,7 @@ TEST(CSignaledGraphicsView, TellsWhereItWasDraggedToAndItsSize) {
     view.verticalScrollBar()->setValue(400);
     QSignalSpy scrolled(&view, &CSignaledGraphicsView::scrolledBy);
     QTest::mousePress(view.viewport(), Qt::LeftButton, {}, QPoint(100, 100));
-    QMouseEvent move(QEvent::MouseMove, QPointF(90, 75), view.viewport()->mapToGlobal(QPointF(90, 75)),
-                     Qt::NoButton, Qt::LeftButton, {});
+    QMouseEvent move(QEvent::MouseMove, {90, 75}, {}, Qt::NoButton, Qt::LeftButton, {});
     QCoreApplication::sendEvent(view.viewport(), &move);
     ASSERT_EQ(scrolled.count(), 1);
     EXPECT_EQ(scrolled[0], (QList<QVariant>{310, 425}));

@@ -1,9 +1,12 @@
+// What a slider block does as a user works with it: data/slider_block/*.txt. A line is an action and what is
+// so after it: the text, the position (dragged; off), where the focus is, and what the block told meanwhile.
+
 #include "GUI/Controls/COrvelaSliderBlockImpl.h"
 
 #include <QAccessible>
 #include <QApplication>
 #include <QClipboard>
-#include <QSignalSpy>
+#include <QDir>
 #include <QTest>
 #include <QToolTip>
 #include <QVBoxLayout>
@@ -12,204 +15,145 @@
 #include <gtest/gtest.h>
 
 #include <cmath>
+#include <functional>
+#include <map>
 
 using namespace orvela;
 
 namespace {
 
+const QString kTables = QStringLiteral(ORVELA_TEST_DATA "/slider_block/");
+
 /// A block with the scale "tenth" (0 to 100), shown in an active window with a second block below it.
 class SliderBlock : public testing::Test {
 protected:
-    void SetUp() override {
+    SliderBlock() {
         auto* layout = new QVBoxLayout(&window);
         layout->addWidget(&block);
         layout->addWidget(&next);
         block.setScale(SliderScales::Tenth);
         block.setMinMax(0, 100);
         block.setText(QStringLiteral("Fade"));
-        window.resize(400, 120);
+        slider()->setFixedWidth(101);
+        QObject::connect(&block, &COrvelaSliderBlockImpl::valueChanged,
+                         [this](double value) { told << QString::number(value); });
+        QObject::connect(&block, &COrvelaSliderBlockImpl::stateChanged,
+                         [this](bool on) { told << (on ? "on" : "off"); });
         window.show();
         window.activateWindow();
-        ASSERT_TRUE(QTest::qWaitForWindowActive(&window));
+        EXPECT_TRUE(QTest::qWaitForWindowActive(&window));
+        slider()->setFocus();
     }
 
-    CThinHorizontalSlider* slider() { return block.sldrValue; }
-    std::string text() { return block.txtValue->text().toStdString(); }
-    /// Replaces the text as a user does.
-    void type(const char* keys) {
-        block.txtValue->setFocus();
-        block.txtValue->selectAll();
-        QTest::keyClicks(block.txtValue, QString::fromUtf8(keys));
-    }
-    /// Types, presses Enter and tells what the field then holds.
-    std::string enter(const char* keys) {
-        type(keys);
-        QTest::keyClick(block.txtValue, Qt::Key_Return);
-        return text();
-    }
-    void doubleClick(const QPoint& point) {
-        QTest::mouseDClick(window.windowHandle(), Qt::LeftButton, {}, block.mapTo(&window, point));
-    }
-    void wheel(int angle) {
-        const QPointF middle = QRectF(slider()->rect()).center();
-        QWheelEvent event(middle, slider()->mapToGlobal(middle), {}, {0, angle}, Qt::NoButton, {},
-                          Qt::NoScrollPhase, false);
-        QCoreApplication::sendEvent(slider(), &event);
-    }
+    CThinHorizontalSlider* slider() const { return block.sldrValue; }
+    QString text() const { return block.txtValue->text(); }
+    void setScale(const QString& what);
+    void select();
+    void doubleClick(QWidget* part);
+    void wheel(int angle);
+    /// A pixel of the slider as a point of the row, above it.
+    QPoint inRow(const QString& x) const { return {slider()->x() + x.toInt(), 1}; }
+    std::string state() const;
 
+    QStringList told;
     QWidget window;
     COrvelaSliderBlockImpl block{&window};
     COrvelaSliderBlockImpl next{&window};
+    const std::map<QString, QWidget*> parts = {{"name", block.lblName},
+                                               {"slider", slider()},
+                                               {"text", block.txtValue},
+                                               {"next slider", next.sldrValue},
+                                               {"next text", next.txtValue}};
+    using Text = const QString&;
+    static constexpr Qt::MouseButton kLeft = Qt::LeftButton;
+    const std::map<QString, std::function<void(Text)>> actions = {
+        {"scale", [this](Text what) { setScale(what); }},
+        {"set", [this](Text position) { block.setValue(position.toDouble()); }},
+        {"show", [this](Text number) { block.setVirtualValue(number.toDouble()); }},
+        {"switch", [this](Text to) { block.setEnabled(to == "on"); }},
+        {"window", [this](Text to) { window.setEnabled(to == "on"); }},
+        {"focus", [this](Text part) { parts.at(part)->setFocus(); }},
+        {"key",
+         [](Text key) { QTest::keyClick(QApplication::focusWidget(), Qt::Key(QKeySequence(key)[0].key())); }},
+        {"type", [this](Text keys) { select(), QTest::keyClicks(block.txtValue, keys); }},
+        {"paste",
+         [this](Text text) { select(), QApplication::clipboard()->setText(text), block.txtValue->paste(); }},
+        {"tip", [this](Text) { told << QToolTip::text(); }},
+        {"double", [this](Text part) { doubleClick(parts.at(part)); }},
+        {"wheel", [this](Text angle) { wheel(angle.toInt()); }},
+        {"press", [this](Text x) { QTest::mousePress(slider(), kLeft, {}, QPoint(x.toInt(), 3)); }},
+        {"move", [this](Text x) { QTest::mouseMove(slider(), QPoint(x.toInt(), 3)); }},
+        {"release", [this](Text x) { QTest::mouseRelease(slider(), kLeft, {}, QPoint(x.toInt(), 3)); }},
+        {"row-press", [this](Text x) { QTest::mousePress(&block, kLeft, {}, inRow(x)); }},
+        {"row-move", [this](Text x) { QTest::mouseMove(&block, inRow(x)); }},
+        {"row-release", [this](Text x) { QTest::mouseRelease(&block, kLeft, {}, inRow(x)); }}};
 };
 
-TEST_F(SliderBlock, PositionsSnapToWhatOneDecimalTells) {
-    QSignalSpy changed(&block, &COrvelaSliderBlockImpl::valueChanged);
-    block.setScale(SliderScales::Shadows);
-    block.setValue(500); // shows 127.5, which is position 500 (up to rounding)
-    EXPECT_EQ(text(), "127.5");
-    EXPECT_NEAR(block.value(), 500, 1e-9);
-    block.setValue(501); // shows 127.755 as 127.8, which is 501.176...
-    EXPECT_EQ(text(), "127.8");
-    EXPECT_NEAR(block.value(), 127.8 / 0.255, 1e-9);
-    block.setValue(501.1); // the same text: nothing is derived anew
-    EXPECT_EQ(block.value(), 501.1);
-    EXPECT_EQ(changed.count(), 2);
-    block.setVirtualValue(63.75);
-    EXPECT_EQ(text(), "63.8");
-    EXPECT_NEAR(block.value(), 63.8 / 0.255, 1e-9);
+void SliderBlock::setScale(const QString& what) {
+    const QStringList words = what.split(' ');
+    block.setScale(words[0] == "Shadows" ? SliderScales::Shadows : SliderScales::Temperature);
+    block.setMinMax(words.at(1).toDouble(), words.at(2).toDouble());
 }
 
-TEST_F(SliderBlock, DraggingMovesTheTextAndAnnouncesOnceAtRelease) {
-    QSignalSpy changed(&block, &COrvelaSliderBlockImpl::valueChanged);
-    const int last = slider()->width() - 1;
-    QTest::mousePress(slider(), Qt::LeftButton, {}, QPoint(1 + last / 4, 3));
-    EXPECT_TRUE(slider()->isDragging());
-    EXPECT_EQ(text(), QString::number(100.0 / last * (last / 4), 'f', 1).toStdString());
-    QTest::mouseMove(slider(), QPoint(1 + last / 2, 3));
-    EXPECT_EQ(text(), QString::number(100.0 / last * (last / 2), 'f', 1).toStdString());
-    EXPECT_EQ(changed.count(), 0);
-    QTest::mouseRelease(slider(), Qt::LeftButton, {}, QPoint(1 + last / 2, 3));
-    EXPECT_FALSE(slider()->isDragging());
-    EXPECT_FALSE(slider()->hasMouseTracking());
-    ASSERT_EQ(changed.count(), 1);
-    EXPECT_DOUBLE_EQ(changed[0][0].toDouble(), 1000.0 / last * (last / 2));
-    QTest::mousePress(slider(), Qt::LeftButton, {}, QPoint(0, 3)); // left of the scale's first pixel
-    EXPECT_EQ(block.value(), 0);
-    QTest::mouseRelease(slider(), Qt::LeftButton, {}, QPoint(last + 50, 3));
-    EXPECT_EQ(block.value(), 1000);
-}
-
-TEST_F(SliderBlock, TheWholeHeightOfTheRowTakesTheMouse) {
-    const QRect thin = slider()->geometry();
-    ASSERT_GT(thin.top(), 2);
-    QTest::mousePress(&block, Qt::LeftButton, {}, QPoint(thin.right(), 1));
-    EXPECT_TRUE(slider()->isDragging());
-    EXPECT_TRUE(slider()->hasFocus());
-    QTest::mouseRelease(&block, Qt::LeftButton, {}, QPoint(thin.left() + 1, block.height() - 1));
-    EXPECT_FALSE(slider()->isDragging());
-    QTest::mouseClick(&block, Qt::LeftButton, {}, QPoint(thin.left() - 3, 1)); // beside the slider
-    block.setEnabled(false);
-    QTest::mouseClick(&block, Qt::LeftButton, {}, QPoint(thin.right(), 1));
-    EXPECT_EQ(text(), "0.0");
-}
-
-TEST_F(SliderBlock, TypedTextMovesTheSliderAtEveryKey) {
-    QSignalSpy changed(&block, &COrvelaSliderBlockImpl::valueChanged);
-    type("42.5");
-    EXPECT_EQ(changed.count(), 4); // 4, 42, 42., 42.5
-    EXPECT_EQ(block.value(), 425);
-    type("-1");
-    EXPECT_EQ(text(), "1") << "the range has nothing negative";
-    QApplication::clipboard()->setText(QStringLiteral("12.5"));
+void SliderBlock::select() {
+    block.txtValue->setFocus();
     block.txtValue->selectAll();
-    QTest::keySequence(block.txtValue, QKeySequence::Paste);
-    EXPECT_EQ(block.value(), 125);
 }
 
-TEST_F(SliderBlock, FinishingCutsToOneDecimalAndResetsOutOfRangeToTheBottom) {
-    type("5000");
-    EXPECT_EQ(block.value(), 50000);
-    EXPECT_EQ(enter("5000"), "0");
-    EXPECT_EQ(block.value(), 0);
-    EXPECT_EQ(QToolTip::text(), QStringLiteral("Fade shall be in range: 0 to 100"));
-    EXPECT_EQ(enter("12.75"), "12.8");
-    EXPECT_EQ(enter("5000.75"), "0");
-    type("1e999");
-    next.txtValue->setFocus();
-    EXPECT_EQ(text(), "0");
-    EXPECT_TRUE(block.txtValue->hasFocus()) << "the field takes the focus back";
-    block.setScale(SliderScales::Temperature);
-    block.setMinMax(10000, 2000.5);
-    for (const char* typed : {"2000", "10001", "e", "-"})
-        EXPECT_EQ(enter(typed), "2000.5") << typed;
-    EXPECT_EQ(enter("10000"), "10000");
+void SliderBlock::doubleClick(QWidget* part) {
+    const QPoint point = part->mapTo(&window, part->rect().center());
+    QTest::mouseDClick(window.windowHandle(), Qt::LeftButton, {}, point);
 }
 
-TEST_F(SliderBlock, DoubleClickAnywhereSwitchesOnAndOff) {
-    QSignalSpy state(&block, &COrvelaSliderBlockImpl::stateChanged);
-    bool on = true;
-    for (QWidget* part : {static_cast<QWidget*>(block.lblName), static_cast<QWidget*>(slider()),
-                          static_cast<QWidget*>(block.txtValue)}) {
-        for (int round = 0; round < 2; ++round) {
-            doubleClick(part->geometry().center());
-            on = !on;
-            ASSERT_FALSE(state.isEmpty());
-            EXPECT_EQ(state.takeLast()[0].toBool(), on) << qPrintable(part->objectName());
-            EXPECT_TRUE(state.isEmpty());
-            EXPECT_EQ(slider()->isEnabled(), on);
-            EXPECT_EQ(block.txtValue->isEnabled(), on);
-            EXPECT_EQ(block.txtValue->font().italic(), !on);
-            EXPECT_TRUE(block.lblName->isEnabled());
-            EXPECT_FALSE(slider()->isDragging());
-        }
+void SliderBlock::wheel(int angle) {
+    QWheelEvent event({50, 3}, slider()->mapToGlobal(QPointF(50, 3)), {}, {0, angle}, Qt::NoButton, {},
+                      Qt::NoScrollPhase, false);
+    QCoreApplication::sendEvent(slider(), &event);
+}
+
+std::string SliderBlock::state() const {
+    const bool on = block.isEnabled();
+    EXPECT_TRUE(slider()->isEnabledTo(&block) == on && block.txtValue->font().italic() != on);
+    EXPECT_TRUE(block.lblName->isEnabledTo(&block));
+    EXPECT_EQ(slider()->hasMouseTracking(), slider()->isDragging());
+    const auto focused =
+        std::find_if(parts.begin(), parts.end(), [](const auto& part) { return part.second->hasFocus(); });
+    const QString position = QString::number(block.value()) + (slider()->isDragging() ? " dragged" : "");
+    const QString focus = focused == parts.end() ? QStringLiteral("-") : focused->first;
+    const QStringList words = {text(), position + (on ? "" : " off"), focus, told.join(' ')};
+    return words.join(" | ").trimmed().toStdString();
+}
+
+class SliderBlockTable : public SliderBlock, public testing::WithParamInterface<QString> {};
+
+TEST_P(SliderBlockTable, TellsWhatItDoes) {
+    QFile file(kTables + GetParam());
+    ASSERT_TRUE(file.open(QIODevice::ReadOnly));
+    for (const QString& line : QString::fromUtf8(file.readAll()).split('\n', Qt::SkipEmptyParts)) {
+        if (line.startsWith('#'))
+            continue;
+        const QString action = line.section(" | ", 0, 0);
+        told.clear();
+        actions.at(action.section(' ', 0, 0))(action.section(' ', 1));
+        EXPECT_EQ(state(), line.section(" | ", 1).toStdString()) << qPrintable(action);
     }
-    window.setEnabled(false); // the surroundings do not count
-    block.setEnabled(true);
-    EXPECT_TRUE(state.isEmpty()) << "no change, no signal";
-    block.setEnabled(false);
-    window.setEnabled(true);
-    EXPECT_FALSE(slider()->isEnabled());
 }
 
-TEST_F(SliderBlock, KeysAndWheelMoveTheFocusedSlider) {
-    slider()->setFocus();
-    const std::pair<Qt::Key, double> steps[] = {
-        {Qt::Key_End, 1000},  {Qt::Key_PageDown, 900}, {Qt::Key_Left, 890},    {Qt::Key_Down, 880},
-        {Qt::Key_Right, 890}, {Qt::Key_Up, 900},       {Qt::Key_PageUp, 1000}, {Qt::Key_Home, 0}};
-    for (const auto& [key, position] : steps) {
-        QTest::keyClick(slider(), key);
-        EXPECT_EQ(block.value(), position) << key;
-    }
-    wheel(60);
-    EXPECT_EQ(block.value(), 0) << "half a notch";
-    wheel(60);
-    EXPECT_EQ(block.value(), 10);
-    next.sldrValue->setFocus();
-    wheel(120);
-    EXPECT_EQ(block.value(), 10) << "without the focus";
-}
+INSTANTIATE_TEST_SUITE_P(All, SliderBlockTable, testing::ValuesIn(QDir(kTables).entryList(QDir::Files)),
+                         [](const auto& file) { return file.param.chopped(4).toStdString(); });
 
 TEST_F(SliderBlock, AKeyAlwaysMovesTheShownNumber) {
-    slider()->setFocus();
-    for (const SliderScale* scale :
-         {&SliderScales::Thousandth, &SliderScales::Gamma, &SliderScales::Highlights}) {
+    using namespace SliderScales;
+    for (const SliderScale* scale : {&Thousandth, &Gamma, &Highlights}) {
         block.setScale(*scale);
-        for (const auto& [key, end] : {std::pair(Qt::Key_Left, 0.0), std::pair(Qt::Key_Right, 1000.0)}) {
+        for (const auto& [key, end] : {std::pair(Qt::Key_Left, 0.0), {Qt::Key_Right, 1000.0}}) {
             for (int count = 0; std::abs(block.value() - end) > 0.01 && count < 300; ++count) {
-                const std::string before = text();
+                const QString before = text();
                 QTest::keyClick(slider(), key);
                 EXPECT_NE(text(), before);
             }
             EXPECT_NEAR(block.value(), end, 0.01);
         }
-    }
-}
-
-TEST_F(SliderBlock, TabVisitsSliderThenTextThenTheNextBlock) {
-    slider()->setFocus();
-    for (QWidget* widget : std::initializer_list<QWidget*>{block.txtValue, next.sldrValue, next.txtValue}) {
-        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Tab);
-        EXPECT_EQ(QApplication::focusWidget(), widget);
     }
 }
 

@@ -1,13 +1,13 @@
-#include "../Panes/PaneFixture.h"
 #include "GUI/Controls/CColorPicker.h"
+#include "GUI/Controls/COrvelaSliderBlockImpl.h"
 #include "GUI/Panes/CWgtPaneAdvancedImpl.h"
 #include "GUI/Presets/CBatchMode.h"
 #include "GUI/Presets/CPresetStore.h"
 #include "Platform/Keyboard.h"
-#include "Settings/ModeTable.h"
-#include "Settings/PresetConversion.h"
 #include "Settings/SettingsStore.h"
 #include "Utility/CGenericEx.h"
+#include "gui/Panes/PaneFixture.h"
+#include "support/BoxRecorder.h"
 #include "support/LogCapture.h"
 
 #include <QApplication>
@@ -141,41 +141,7 @@ TEST_F(PresetStore, ReportsWhatCannotBeWritten) {
     ASSERT_TRUE(QDir().rmdir(path));
 }
 
-TEST_F(PresetStore, FactoryPresetsAreThoseOfTheModes) {
-    CPresetStore::ensureFactoryPresets(&pane);
-    int modes = 0;
-    for (const ModeDescription& mode : ModeTable::all()) {
-        EXPECT_EQ(CPresetStore::isFactoryMode(mode.mode), mode.mode < Mode_Advanced);
-        if (!CPresetStore::isFactoryMode(mode.mode))
-            continue;
-        ++modes;
-        const QString name = CPresetStore::factoryPresetName(mode.mode);
-        SCOPED_TRACE(qPrintable(name));
-        EXPECT_TRUE(CPresetStore::isFactoryPresetName(name) &&
-                    !CPresetStore::isFactoryPresetName(name.toLower()));
-        EXPECT_EQ(CPresetStore::factoryPresetMode(name), mode.mode);
-        const auto content = PresetTree::read(Mode_Advanced, name);
-        ASSERT_TRUE(content && content->sliders.size() == 26 && content->colors.size() == 1);
-        const CSliderParams stored = PresetConversion::paramsOf(Mode_Advanced, *content);
-        const CUserParamsPhotoshop factory(mode.mode);
-        for (const SliderDescription& slider : SliderTable::sliders()) {
-            EXPECT_EQ(stored.*slider.enabled, factory.mSliderParams.*slider.enabled);
-            const float position = slider.value ? factory.mSliderParams.*slider.value : 0;
-            EXPECT_NEAR(slider.value ? stored.*slider.value : 0, position, snapping(*slider.scale, position));
-        }
-        EXPECT_EQ(stored.mColor_Value_R + stored.mColor_Value_G + stored.mColor_Value_B, 0);
-    }
-    EXPECT_EQ(modes, 12);
-    EXPECT_EQ(boxes([] {
-                  EXPECT_EQ(CPresetStore::factoryPresetMode("portrait"), Mode_Portrait);
-                  EXPECT_EQ(CPresetStore::factoryPresetName(Mode_Custom), QString(QChar(0xFFFF)));
-              }),
-              QStringList({"Note:|Unknown preset:portrait", "Note:|Unknown preset:13"}));
-}
-
-TEST_F(PresetStore, FactoryPresetsAreWhatTheirPaneWouldSave) {
-    Shown<CWgtPaneAdvancedImpl> shown(Mode_Advanced);
-    CPresetStore::ensureFactoryPresets(&pane);
+TEST_F(PresetStore, FactoryPresetsAreTheModesAsTheirPaneWouldSaveThem) {
     const auto lines = [] {
         const QSettings settings = openSettings();
         QStringList lines;
@@ -183,14 +149,33 @@ TEST_F(PresetStore, FactoryPresetsAreWhatTheirPaneWouldSave) {
             lines << key + '=' + settings.value(key).toString();
         return lines;
     };
+    Shown<CWgtPaneAdvancedImpl> shown(Mode_Advanced);
+    CPresetStore::ensureFactoryPresets(&pane);
     const QStringList written = lines();
     EXPECT_EQ(written.size(), 12 * (26 * 2 + 3));
     openSettings().clear();
-    for (const QString& name : FactoryPresets::names()) {
+    for (int number = Mode_Automatic; number < Mode_Advanced; ++number) {
+        const CUserParamsPhotoshop factory(static_cast<EGUIMode>(number));
+        const QString name = CPresetStore::factoryPresetName(static_cast<EGUIMode>(number));
+        EXPECT_EQ(CPresetStore::factoryPresetMode(name), number);
         shown.pane->setSliders(name);
         CPresetStore::savePreset(shown.pane, Mode_Advanced, name, saved, isNew, false);
+        CUserParams params;
+        shown.pane->applyGUIParams(params);
+        for (const auto& [object, slider, initial, zones, mirror] : PaneTable::sliders(Mode_Advanced)) {
+            const auto text = [&slider = slider](const CSliderParams& settings) {
+                return (slider.value ? slider.scale->text(settings.*slider.value) : QString()) +
+                       (settings.*slider.enabled ? " on" : " off");
+            };
+            EXPECT_EQ(text(params.mSliderParams), text(factory.mSliderParams)) << object;
+        }
     }
     EXPECT_EQ(lines(), written);
+    EXPECT_EQ(boxes([] {
+                  EXPECT_EQ(CPresetStore::factoryPresetMode("portrait"), Mode_Portrait);
+                  EXPECT_EQ(CPresetStore::factoryPresetName(Mode_Custom), QString(QChar(0xFFFF)));
+              }),
+              QStringList({"Note:|Unknown preset:portrait", "Note:|Unknown preset:13"}));
 }
 
 TEST_F(PresetStore, OneMissingFactoryPresetBringsAllBack) {

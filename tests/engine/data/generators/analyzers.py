@@ -1,13 +1,11 @@
 """The smart analyzers: every field that they write; all others stay as they are."""
+import itertools
 import math
 
-from reference import case as line, f as single, numbers
+from reference import case as line, f as single, numbers, parsed, table
 
 WIDTH, HEIGHT = 40, 450
 N = WIDTH * HEIGHT
-# power, step, modulus and the first values of the channels: value = first + step * ((x + 3y)^power % modulus)
-MIXED, GAPS = (1, 1, 190, 20, 35, 41), (2, 1, 101, 10, 50, 90)
-EVEN, DARK = (1, 2, 100, 0, 10, 20), (1, 1, 1, 50, 51, 52)
 SUFFIXES, ENDS = ["RGB", "R", "G", "B"], ["", "_R", "_G", "_B"]
 LEVELS = ["Dark", "Middle", "Light"]
 
@@ -137,18 +135,15 @@ def digital_flash(on, bins, _):
     return out if on["DigitalFlashEnabled"] else {}
 
 
-def case(analyzer, *switches, plane=MIXED, counts=None, **values):
-    """One case; without counts (bin of the luma: count) the histograms hold a fixed pattern."""
-    bins = [[float((i * 37 + 11 * k) % 101) for i in range(256)] for k in range(4)]
-    values.update(dict.fromkeys(switches, 1))
-    on = type("Settings", (dict,), {"__missing__": lambda self, key: 0})(values)
-    if counts is not None:
-        bins = [[float(counts.get(i, 0)) for i in range(256)]] + [[0.0] * 256] * 3
-        values.update({f"pHisto_Luma[{i}]": count for i, count in counts.items()})
-    writes = {name: float(value) for name, value in analyzer(on, bins, plane).items()}
-    return line("CSmartAnalyzer_" + analyzer.__name__.title(), numbers(values),
-                f"in {WIDTH}x{HEIGHT} wave " + " ".join(map(str, plane)),
-                *(["pattern"] if counts is None else []), f"writes {numbers(writes)}".strip())
+def case(task, rest):
+    settings, picture, *pattern = rest.split(" | ")
+    on = parsed(settings)
+    bins = [[float((i * 37 + 11 * k) % 101) if pattern else 0.0 for i in range(256)] for k in range(4)]
+    bins[0] = [on.get(f"pHisto_Luma[{i}]", bins[0][i]) for i in range(256)]
+    analyzer = globals()[task.removeprefix("CSmartAnalyzer_").lower()]
+    writes = analyzer(on, bins, [int(number) for number in picture.split()[3:]])
+    expected = numbers({name: float(value) for name, value in writes.items()})
+    return line(task, settings, picture, *pattern, f"writes {expected}".strip())
 
 
 def recounted(level, rows, split):
@@ -162,57 +157,8 @@ def recounted(level, rows, split):
                 "stat " + numbers(bins))
 
 
-FINAL = "Final_Touch_Mode_Enabled"
-TOUCH = {level: [f"mPerceptual_Touch_{level}_{suffix}_Enabled" for suffix in SUFFIXES] for level in LEVELS}
-SLIDERS = ["Brightness2Value", "mPerceptual_Brightness_Touch_Value"]
-contrast, dark, middle = perceptual_contrast_brightness, perceptual_level_dark, perceptual_level_middle
-right, flash = perceptual_level_right, digital_flash
-
-
 def cases():
-    yield case(contrast, m_OriginalLuma=100)
-    for luma in (120, 127, 128):
-        yield case(contrast, "Brightness2Enabled", m_OriginalLuma=luma)
-        yield case(contrast, "mPerceptual_Brightness_Touch_Enabled", m_OriginalLuma=luma, counts={100: 9000})
-    for pair in ((500, 0), (499, 1000)):
-        yield case(contrast, "Contrast2Enabled", m_OriginalLuma=100, **dict(zip(SLIDERS, pair)))
-        touch = dict(zip(SLIDERS[::-1], pair))
-        yield case(contrast, "mPerceptual_Contrast_Touch_Enabled", FINAL, m_OriginalLuma=130, **touch)
-    for counts in ({}, {110: 9000}):
-        yield case(contrast, "Contrast2Enabled", Brightness2Value=500, m_OriginalLuma=120, counts=counts)
-
-    for plane in (MIXED, GAPS, EVEN, DARK):
-        yield case(dark, "PerceptualDarkEnabled", plane=plane)
-        yield case(dark, FINAL, *TOUCH["Dark"], plane=plane)
-        yield case(right, "PerceptualMiddleEnabled", plane=plane)
-        yield case(right, *TOUCH["Light"], plane=plane)
-    yield case(dark, "PerceptualMiddleEnabled", *TOUCH["Dark"])
-    yield case(dark, "PerceptualDarkEnabled", "mAbsolute_Dark_Enabled")
-    yield case(dark, "PerceptualDarkEnabled", FINAL)
-    for k, suffix in enumerate(SUFFIXES):
-        yield case(dark, FINAL, TOUCH["Dark"][k])
-        yield case(dark, FINAL, TOUCH["Dark"][0], f"mDark_Touch_{suffix}_Enabled")
-        yield case(middle, FINAL, *TOUCH["Middle"][:k + 1])
-        yield case(right, FINAL, TOUCH["Light"][k], "PerceptualLightEnabled")
-        yield case(right, TOUCH["Light"][0], f"mLight_Touch_{suffix}_Enabled")
-    for level in LEVELS:
-        for analyzer in (middle, right):
-            yield case(analyzer, f"Perceptual{level}Enabled")
-            yield case(analyzer, "PerceptualLightEnabled", f"mAbsolute_{level}_Enabled")
-    for others in ([], ["GammaCorrectionEnabled"], [FINAL], TOUCH["Middle"]):
-        yield case(middle, "PerceptualGammaEnabled", *others)
-    yield case(right, "PerceptualGammaEnabled")
-    for counts in ({0: 2 * N}, {}):
-        yield case(middle, "PerceptualDarkEnabled", counts=counts)
-
-    yield case(flash, m_OriginalLuma=100)
+    yield from itertools.starmap(case, table("analyzers.txt"))
     for level in ("Dark", "Right"):
         for rows, split in ((200, 200), (201, 100), (202, 101)):
             yield recounted(level, rows, split)
-    for luma in (0, 100, 100.5, 254, 255):
-        yield case(flash, "DigitalFlashEnabled", m_OriginalLuma=luma)
-    yield case(flash, "DigitalFlashEnabled", m_OriginalLuma=100, counts={})
-    for limit in (70.5, 71.5):
-        low, high = 0.2 * 30 / limit / (1 - step(0, 30, 30)), 0.077 * 50 / limit / step(255, 225, 30)
-        counts = {0: round(low * N), 255: round(high * N)}
-        yield case(flash, "DigitalFlashEnabled", m_OriginalLuma=128, counts=counts)

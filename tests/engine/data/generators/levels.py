@@ -1,8 +1,7 @@
 """The level filters over twelve pixels; the host's pixels are 255 minus the input's."""
-from collections import defaultdict
 from math import cosh
 
-from reference import case, f, keep_hue
+from reference import case, f, keep_hue, parsed, table
 
 PIXELS = [(0, 0, 0), (1, 2, 3), (20, 60, 10), (40, 40, 40), (90, 110, 100), (100, 100, 100), (101, 100, 100),
           (180, 30, 220), (250, 128, 5), (200, 210, 190), (255, 255, 200), (255, 255, 255)]
@@ -159,84 +158,12 @@ MODELS = {"CLevel_Dark_Left": dark_left, "CLevel_Middle": middle, "CLevel_Light_
           "CLevel_Dark_Left_Perceptual": dark_perceptual, "CLevel_Middle_Perceptual": middle_perceptual,
           "CLevel_Light_Right_Perceptual": light_perceptual}
 
-MEAN = "m_OriginalLuma=100"
-MEANS = MEAN + " m_OriginalLumaR=110 m_OriginalLumaG=95.5 m_OriginalLumaB=70"
-BALANCED = MEAN + " m_OriginalLumaR=90 m_OriginalLumaG=85 m_OriginalLumaB=95"
-BRIGHT = MEAN + " m_OriginalLumaR=150 m_OriginalLumaG=120 m_OriginalLumaB=101"
-TOUCH = " Final_Touch_Mode_Enabled=1 "
-
-
-def four(name, *numbers):
-    return " ".join(f"{name % c}={n}" for c, n in zip(("RGB", "R", "G", "B"), numbers))
-
-
-def side(name, tone):
-    on, touch = f"{MEAN} mAbsolute_{tone}_Enabled=1 ", f"m{tone}_Touch_%s"
-    return [(name, s) for s in (
-        MEAN, on, on + f"mAbsolute_{tone}_Value=600", on + f"mAbsolute_{tone}_Value=1000",
-        on + f"mAbsolute_{tone}_Value=600 mAuto_Color_Enabled=1", on + f"mAbsolute_{tone}_Value=600" + TOUCH,
-        MEAN + " " + four(touch % "%s_Enabled", 0, 0, 1, 0) + f" m{tone}_Touch_Value_RGB=300",
-        *(MEAN + TOUCH + four(touch % "%s_Enabled", *flags) + " " + four(touch % "Value_%s", *v)
-          for flags, v in (((1, 0, 0, 0), (300, 0, 0, 0)), ((0, 1, 0, 0), (0, 250, 0, 900)),
-                           ((0, 0, 1, 0), (500, 100, 800, 0)), ((0, 0, 0, 1), (0, 0, 0, 0)))))]
-
-
-def settings():
-    yield from side("CLevel_Dark_Left", "Dark") + side("CLevel_Light_Right", "Light")
-    m, on = "CLevel_Middle", "mAbsolute_Middle_Enabled=1 mAbsolute_Middle_Value="
-    for v in (0, 200, 500, 501, 700, 1000):
-        yield m, f"{MEANS} {on}{v}"
-    yield m, f"m_OriginalLuma=0 {on}1000"
-    yield m, f"{MEANS} {on}1000 mAuto_Color_Enabled=1"
-    yield m, f"{MEANS}{TOUCH}{on}1000"
-    for flags, v in (((1, 0, 0, 0), (650, 500, 500, 500)), ((0, 1, 0, 0), (500, 300, 600, 500)),
-                     ((0, 0, 1, 0), (520, 480, 550, 450)), ((0, 0, 0, 1), (300, 900, 1000, 0))):
-        touch = four("mMiddle_Touch_%s_Enabled", *flags) + " " + four("mMiddle_Touch_Value_%s", *v)
-        yield m, f"{MEANS}{TOUCH}{touch}"
-        yield m, f"{MEANS} {touch}"
-    for tone, name, c in (("Dark", "CLevel_Dark_Left_Perceptual", "m_L_H_L_F"),
-                          ("Light", "CLevel_Light_Right_Perceptual", "m_R_L_L_F")):
-        on = f"{MEAN} Perceptual{tone}Enabled=1 {c}=80 Perceptual{tone}="
-        for v in (0, 400, 899, 900, 901, 1000):
-            yield name, f"{on}{v}"
-        for more in ("mAbsolute_Dark_Enabled=1", "mAbsolute_Light_Enabled=1", "Normal_Picture=0", TOUCH,
-                     f"mPerceptual_Touch_{tone}_B_Enabled=1", f"m{tone}_Touch_G_Enabled=1"):
-            yield name, f"{on}400 {more}"
-        yield name, f"{MEAN} Perceptual{tone}Enabled=1 {c}=509 Perceptual{tone}=500"
-        rgb = c + ("_RGB" if tone == "Dark" else "")
-        touch = f"{MEAN} {rgb}=90 {c}_R=120 {c}_G=100 {c}_B=60 Perceptual{tone}=950 "
-        for flags, v in (((1, 0, 0, 0), (700, 0, 0, 0)), ((0, 1, 0, 0), (0, 600, 0, 0)),
-                         ((0, 0, 1, 0), (300, 600, 1000, 800)), ((0, 0, 0, 1), (0, 0, 0, 0))):
-            t = four(f"mPerceptual_Touch_{tone}_%s_Enabled", *flags) + " "
-            yield name, touch + TOUCH + t + four(f"mPerceptual_Touch_{tone}_Value_%s", *v)
-        for more in (f"m{tone}_Touch_R_Enabled=1", "Normal_Picture=0", f"Perceptual{tone}Enabled=1"):
-            yield name, touch + TOUCH + t + f"mPerceptual_Touch_{tone}_Value_RGB=500 {more}"
-    m, on = "CLevel_Middle_Perceptual", f"{MEANS} PerceptualMiddleEnabled=1 m_M_H_L_F=0.4 m_M_H_H_F="
-    for high, v in ((0.5, 0), (0.5, 250), (0.5, 499), (0.5, 500), (0.5, 750), (1, 1000), (1.25, 1000), (1.4, 900)):
-        yield m, f"{on}{high} PerceptualMiddle={v}"
-    for more in ("mAbsolute_Middle_Enabled=1", "mAbsolute_Light_Enabled=1", "PerceptualGammaEnabled=1",
-                 "Normal_Picture=0", TOUCH, "mPerceptual_Touch_Middle_R_Enabled=1"):
-        yield m, f"{on}0.5 PerceptualMiddle=750 {more}"
-    yield m, f"{MEANS} PerceptualMiddleEnabled=1 m_M_H_L_F=0 PerceptualMiddle=0"
-    high = "m_M_H_H_F=0.4 m_M_H_H_F_R=0.6 m_M_H_H_F_G=1.5 m_M_H_H_F_B=1"
-    low = "m_M_H_L_F=0.7 m_M_H_L_F_R=0.5 m_M_H_L_F_G=0.6 m_M_H_L_F_B=0.9"
-    for means in (MEANS, BRIGHT, BALANCED, MEAN, "m_OriginalLumaR=90"):
-        for flags, v in (((1, 0, 0, 0), (800, 0, 0, 0)), ((1, 1, 1, 1), (600, 900, 700, 650)),
-                         ((0, 1, 1, 1), (0, 99, 50, 0)), ((0, 1, 1, 1), (0, 100, 300, 499)),
-                         ((1, 0, 0, 1), (200, 900, 900, 1000)), ((1, 1, 1, 1), (500, 500, 500, 500))):
-            yield m, (f"{means}{TOUCH}{high} {low} " + four("mPerceptual_Touch_Middle_%s_Enabled", *flags) + " "
-                      + four("mPerceptual_Touch_Middle_Value_%s", *v))
-    for more in ("mMiddle_Touch_B_Enabled=1", "Normal_Picture=0"):
-        yield m, (f"{MEANS}{TOUCH}{high} {low} mPerceptual_Touch_Middle_RGB_Enabled=1 "
-                  f"mPerceptual_Touch_Middle_Value_RGB=800 {more}")
-
 
 def cases():
     text = lambda rows: " ".join(",".join(str(int(x)) for x in pixel) for pixel in rows)
     host = text([255 - x for x in pixel] for pixel in PIXELS)
-    for name, setting in settings():
-        p = defaultdict(float, Normal_Picture=1)
-        p.update((k, f(float(v))) for k, v in (s.split("=") for s in setting.split()))
+    for name, setting in table("levels.txt"):
+        p = parsed("Normal_Picture=1 " + setting)
         new = MODELS[name](p)
         # Two equal rows; one of the filters leaves the last one alone.
         last = PIXELS if name == "CLevel_Dark_Left_Perceptual" else []

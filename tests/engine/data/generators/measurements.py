@@ -1,5 +1,5 @@
 """The histograms: which pixels they sample, what they make of the counts, and when they run."""
-from reference import case, numbers
+from reference import case, numbers, table
 
 SAMPLED = {"CHistogram0": "", "CHistogram_III": "", "CHistogram_IV": "mAuto_Color_Enabled", "CHistogram_VII": "",
            "CHistogram_VIII": "DigitalFlashEnabled", "CHistogram_Luma_after_Orv": "OrvelaLevelEnabled"}
@@ -20,13 +20,6 @@ def grid(task, width, height, step, columns, rows):
                 "stat " + numbers({**bins, **means}))
 
 
-def greys(settings, values, **expected):
-    """The pixels stand in the one sampled row."""
-    pixels = " ".join(",".join(map(str, v)) if isinstance(v, tuple) else str(v) for v in values)
-    return case(settings.split()[0], " ".join(settings.split()[1:]), f"in {len(values) + 1}x2 {pixels} 7",
-                "stat " + numbers(expected))
-
-
 def highlights(task, counts, flag, level):
     """So many of 100 samples per channel at `level`, the others one below the highlights."""
     columns = [",".join(str(level if x < n else 219) for n in counts) for x in range(101)]
@@ -35,8 +28,9 @@ def highlights(task, counts, flag, level):
 
 def cast(task, means, flag, before=""):
     """40000 of 40401 pixels are sampled, so a sample is one above its mean."""
+    means = [int(mean) for mean in means.split(",")]
     sample = ",".join(str(m + 1 if m else 0) for m in means)
-    expected = dict(zip(("m_OriginalLumaR", "m_OriginalLumaG", "m_OriginalLumaB"), means), Bicromic=flag)
+    expected = dict(zip(("m_OriginalLumaR", "m_OriginalLumaG", "m_OriginalLumaB"), means), Bicromic=int(flag))
     return case(task, f"{SAMPLED[task]} {before}", f"in 201x201 {sample}", "stat " + numbers(expected))
 
 
@@ -45,20 +39,9 @@ def cases():
         for task in SAMPLED:
             yield grid(task, *size)
 
-    yield greys("CHistogram0", [230, 231, 255], WhiteCount=2)
-    yield greys("CHistogram0", [0, 19, 20], BlackCount=2)
-    # A range of 44 between the channels is a spread of 29.3, one of 45 a spread of 30.
-    yield greys("CHistogram0", [(255, 211, 240), (255, 210, 240)], WhiteCount=1)
-    yield greys("CHistogram0", [(0, 44, 10), (45, 0, 10)], BlackCount=1)
-    yield greys("CHistogram0", [0, 1, 85, 86, 170, 171, 219, 220, 255],
-                m_Dark_Acu=2 / 20, m_Middle_Acu=2 / 20, m_Light_Acu=2 / 20)
-    # Means are whole numbers: (20 + 21 + 21) / 3, 35 / 3, 62 / 3, 91 / 3.
-    yield greys("CHistogram0", [(10, 20, 30), (13, 20, 31), (12, 22, 30)], m_OriginalLuma0=20, m_OriginalLumaR0=11,
-                m_OriginalLumaG0=20, m_OriginalLumaB0=30)
-    for task in ("CHistogram_III", "CHistogram_IV mAuto_Color_Enabled"):
-        # (1 + 85 + 85) / 3, (86 + 170) / 2, (171 + 255 + 255) / 3
-        yield greys(task, [0, 1, 85, 85, 86, 170, 171, 255, 255], Dark_Ave=57, Middle_Ave=128, Light_Ave=227)
-        yield greys(task, [0, 0], Dark_Ave=0, Middle_Ave=0, Light_Ave=0)
+    for task, rest in table("greys.txt"):
+        settings, row, expected = rest.split("|")
+        yield case(task, settings, f"in {len(row.split()) + 1}x2{row}7", f"stat{expected}")
 
     # Highlights that lack a colour have one channel's share below half of both others'.
     for flag, a, b, c, level in ((1, 20, 20, 5, 220), (0, 20, 20, 10, 220), (0, 20, 9, 10, 220), (0, 0, 0, 30, 220),
@@ -67,17 +50,8 @@ def cases():
             for counts in ((a, b, c), (c, a, b), (b, c, a)):
                 yield highlights(task, counts, flag, level)
 
-    # A cast has one mean below half (III) or a quarter (IV) of both others; VII flags all but black.
-    for low, half, quarter in ((45, 0, 0), (44, 1, 0), (23, 1, 0), (22, 1, 1)):
-        for means in ((90, 90, low), (90, low, 90), (low, 90, 90)):
-            yield cast("CHistogram_III", means, half)
-            yield cast("CHistogram_IV", means, quarter)
-    yield cast("CHistogram_III", (90, 40, 50), 0)
-    yield cast("CHistogram_IV", (88, 88, 22), 0)
-    yield cast("CHistogram_III", (50, 50, 50), 1, before="Bicromic")
-    yield cast("CHistogram_VII", (0, 0, 0), 0)
-    for means in ((1, 0, 0), (0, 90, 0), (0, 0, 9), (70, 50, 80), (90, 90, 20)):
-        yield cast("CHistogram_VII", means, 1)
+    for task, rest in table("casts.txt"):
+        yield cast(task, *rest.split(" | "))
 
     for bits in range(16):
         names = ("OrvelaLevelEnabled", "OrvelaLevel2Enabled", "Normal_Picture", "Under_Exposed_Picture")

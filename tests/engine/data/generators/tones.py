@@ -4,31 +4,7 @@ The host's pixels are the same with the channels turned.
 """
 from math import cosh
 
-from reference import case, f, keep_hue, pixels
-
-CASES = [
-    # settings; pivot, contrast below, above, brightness
-    ("Contrast2Enabled Contrast2Value=600 Brightness2Enabled Brightness2Value=100 m_OriginalLuma=121 "
-     "m_P_C_H_C_Low=40 m_P_C_H_C_High=70 m_B_H_C_F_Low=11", (121, 24, 42, -8.8)),
-    ("Contrast2Enabled Contrast2Value=600 Brightness2Enabled Brightness2Value=800 m_OriginalLuma=90 "
-     "m_P_C_H_C_Low=100 m_P_C_H_C_High=70 m_B_H_C_F_High=20 pHisto_Luma[255]=1.5", (90, 60, 0, 12)),
-    ("Contrast2Enabled Contrast2Value=600 m_OriginalLuma=90 m_P_C_H_C_Low=100 m_P_C_H_C_High=70 "
-     "pHisto_Luma[0]=0.5 pHisto_Luma[255]=1", (90, 0, 42, 0)),
-    ("mPerceptual_Contrast_Touch_Enabled mPerceptual_Contrast_Touch_Value=600 Final_Touch_Mode_Enabled "
-     "mPerceptual_Brightness_Touch_Enabled mPerceptual_Brightness_Touch_Value=100 m_OriginalLuma=121 "
-     "m_P_C_H_C_Low=40 m_P_C_H_C_High=70 m_B_H_C_F_Low=11 pHisto_Luma[0]=9 pHisto_Luma[255]=9",
-     (121, 24, 42, -8.8)),
-    # flash; pivot, factor below, above, flash, fade
-    ("mDigital_Flash_Value=1000 m_OriginalLuma=127 m_P_C_H_C_F_L=70 m_P_C_H_C_F_H=60", (127, 70, 60, 1000, 0)),
-    ("mDigital_Flash_Value=700 mFade_Value=300 m_OriginalLuma=80 m_P_C_H_C_F_L=31.5 m_P_C_H_C_F_H=70",
-     (80, 31.5, 70, 700, 300)),
-    ("mDigital_Flash_Value=850 mFade_Value=600 m_OriginalLuma=150 m_P_C_H_C_F_L=70 m_P_C_H_C_F_H=70",
-     (150, 70, 70, 850, 600)),
-    # cast; missing channel, its shadows and highlights
-    ("C_H_F_High_R=90 C_H_F_High_G=90 C_H_F_High_B=10 C_H_F_Low_B=300", (2, 300, 10)),
-    ("C_H_F_High_R=90 C_H_F_High_G=4 C_H_F_High_B=90 C_H_F_Low_G=99", (1, 99, 4)),
-    ("C_H_F_High_R=1 C_H_F_High_G=90 C_H_F_High_B=90 C_H_F_Low_R=20.5", (0, 20.5, 1)),
-]
+from reference import case, f, keep_hue, pixels, table
 
 
 def pivot(b, p, k):  # every operation rounded to single precision
@@ -60,16 +36,15 @@ def tint(rgb, _, channel, low, high):
     return keep_hue([int(f(c * (f(sum(rgb) // 3 / mean) if mean > 0 else 1.0))) for c in mixed])
 
 
-KINDS = {4: ("CContrast_Brightness_Perceptual", "", perceptual),
-         5: ("CDigital_Flash_Perceptual", "DigitalFlashEnabled ", flash),
-         3: ("CSpecial_Contrast_Perceptual", "Contrast2Enabled ", tint)}
+PIXELS = {"CContrast_Brightness_Perceptual": perceptual, "CDigital_Flash_Perceptual": flash,
+          "CSpecial_Contrast_Perceptual": tint}
 PICTURE = [(17 * x, 17 * (x + y) // 2, 17 * y) for y in range(16) for x in range(16)]
 HOST = [rgb[1:] + rgb[:1] for rgb in PICTURE]
 
 
 def cases():
-    for settings, numbers in CASES:
-        name, switch, pixel = KINDS[len(numbers)]
-        out = [pixel(rgb, host, *numbers) for rgb, host in zip(PICTURE, HOST)]
-        yield case(name, switch + settings, f"in 16x16 {pixels(PICTURE)}", f"host {pixels(HOST)}",
-                   f"out {pixels(out)}")
+    for name, rest in table("tones.txt"):
+        settings, numbers = rest.split(" | ")
+        numbers = [float(number) for number in numbers.split()]
+        out = [PIXELS[name](rgb, host, *numbers) for rgb, host in zip(PICTURE, HOST)]
+        yield case(name, settings, f"in 16x16 {pixels(PICTURE)}", f"host {pixels(HOST)}", f"out {pixels(out)}")

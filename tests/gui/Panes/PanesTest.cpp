@@ -1,0 +1,282 @@
+#include "Core/CThreadedCore.h"
+#include "GUI/Controls/CColorPicker.h"
+#include "GUI/Controls/COrvelaSliderBlockImpl.h"
+#include "GUI/Panes/CWgtPane3SlidersImpl.h"
+#include "GUI/Panes/CWgtPaneAdvancedImpl.h"
+#include "GUI/Panes/CWgtPaneFinalTouchImpl.h"
+#include "GUI/Panes/CWgtPaneGenericImpl.h"
+#include "PaneFixture.h"
+#include "Settings/ModeTable.h"
+#include "Utility/CARGBPlane.h"
+#include "support/BoxRecorder.h"
+#include "support/ParamsText.h"
+#include "support/SettingsMap.h"
+
+#include <QAccessible>
+#include <QComboBox>
+#include <QFile>
+#include <QRegularExpression>
+#include <QSignalSpy>
+#include <QTest>
+
+#include <gtest/gtest.h>
+
+using namespace orvela;
+
+namespace {
+
+/// A control of a pane, as data/panes.txt lists it; fields that it does not drive are "-".
+struct Control {
+    QString object;
+    QString first; ///< what it shows before anything was set
+    QString position;
+    QString enabled;
+};
+
+std::vector<Control> controlsOf(EGUIMode mode) {
+    QFile file(ORVELA_TEST_DATA "/panes.txt");
+    EXPECT_TRUE(file.open(QIODevice::ReadOnly));
+    std::vector<Control> controls;
+    for (const QString& line : QString::fromUtf8(file.readAll()).split('\n')) {
+        const QStringList parts = line.split(QStringLiteral(" | "));
+        if (parts[0] == getModeAsString(mode))
+            controls.push_back({parts.at(1), parts.at(2), parts.at(3), parts.at(4)});
+    }
+    return controls;
+}
+
+std::vector<EGUIMode> modesWithPanes() {
+    std::vector<EGUIMode> modes;
+    for (const ModeDescription& mode : ModeTable::all())
+        if (!PaneTable::sliders(mode.mode).empty())
+            modes.push_back(mode.mode);
+    return modes;
+}
+
+class Pane : public testing::TestWithParam<EGUIMode> {
+protected:
+    IWgtPane* make() {
+        if (GetParam() == Mode_Advanced)
+            return new CWgtPaneAdvancedImpl(&owner, GetParam());
+        if (GetParam() == Mode_FinalTouch)
+            return new CWgtPaneFinalTouchImpl(&owner, GetParam());
+        if (isSingle)
+            return new CWgtPaneGenericImpl(&owner, GetParam());
+        return new CWgtPane3SlidersImpl(&owner, GetParam());
+    }
+    COrvelaSliderBlockImpl* block(const QString& object) const {
+        return pane->findChild<COrvelaSliderBlockImpl*>(object);
+    }
+    CColorPicker* picker(const QString& object) const { return pane->findChild<CColorPicker*>(object); }
+    void expectFirst() const;
+    void expectWrites(bool odd);
+
+    const bool isSingle = PaneTable::single(GetParam());
+    const std::vector<Control> controls = controlsOf(GetParam());
+    RecordingOwner owner;
+    IWgtPane* pane = make();
+};
+
+void Pane::expectFirst() const {
+    for (const Control& control : controls) {
+        SCOPED_TRACE(qPrintable(control.object));
+        if (const CColorPicker* found = picker(control.object)) {
+            EXPECT_EQ(found->color().name(), control.first);
+            continue;
+        }
+        ASSERT_TRUE(block(control.object));
+        EXPECT_EQ(block(control.object)->txtValue->text(), control.first);
+        EXPECT_EQ(block(control.object)->isEnabled(), isSingle);
+    }
+}
+
+// Gives every control a state of its own and expects the owner to be told of it, and those states, and
+// nothing else, among the settings.
+void Pane::expectWrites(bool odd) {
+    CUserParams params;
+    for (const SliderField& field : sliderFields())
+        setField(params, field.name, field.value ? 3 : odd);
+    CUserParams expected = params;
+    const auto expect = [&expected](const QString& field, double value) {
+        if (field != "-")
+            setField(expected, field, value);
+    };
+    double position = odd ? 4 : -11;
+    for (const auto& [object, first, value, enabled] : controls) {
+        if (CColorPicker* found = picker(object)) {
+            const QColor color(9, odd ? 80 : 12, 200);
+            found->setColor(color);
+            EXPECT_TRUE(owner.colors.endsWith(color));
+            expect(value + 'R', color.red());
+            expect(value + 'G', color.green());
+            expect(value + 'B', color.blue());
+            continue;
+        }
+        const bool on = (int(position += 31) % 2 == 1) == odd;
+        for (const double each : {0.0, 1000.0, position})
+            block(object)->setValue(each);
+        block(object)->setEnabled(!on);
+        block(object)->setEnabled(on);
+        EXPECT_TRUE(owner.values.endsWith(block(object)->value()) && owner.states.endsWith(on))
+            << qPrintable(object);
+        expect(value, block(object)->value());
+        expect(enabled, on);
+    }
+    pane->applyGUIParams(params);
+    EXPECT_EQ(settingsOf(params.mSliderParams), settingsOf(expected.mSliderParams));
+}
+
+TEST_P(Pane, ShowsItsControlsAndWritesTheirFieldsAlone) {
+    expectFirst();
+    if (GetParam() != Mode_Advanced && !isSingle) { // there a preset brings factory settings, or nothing
+        block(controls[0].object)->setEnabled(true);
+        pane->setSliders(QStringLiteral("Automatic"));
+        expectFirst();
+    }
+    expectWrites(false);
+    expectWrites(true);
+}
+
+TEST_P(Pane, SlidersShowEveryPositionAndTellWhatTheyDo) {
+    const auto sliders = PaneTable::sliders(GetParam());
+    EXPECT_EQ(sliders.size() + PaneTable::colors(GetParam()).size(), controls.size());
+    for (const PaneSlider& slider : sliders) {
+        SCOPED_TRACE(slider.object);
+        const SliderScale& scale = *slider.slider.scale;
+        COrvelaSliderBlockImpl* shown = block(slider.object);
+        for (int position = 0; position <= 1000; ++position) {
+            shown->setValue(position);
+            const QString text = shown->txtValue->text();
+            EXPECT_NEAR(text.toDouble(), scale.toShown(position), 0.05 + 1e-9);
+            EXPECT_EQ(scale.text(shown->value()), text);
+            Q_EMIT shown->txtValue->editingFinished();
+            EXPECT_EQ(shown->txtValue->text(), text) << "inside the range";
+        }
+        EXPECT_EQ(shown->toolTip(), slider.slider.label);
+        EXPECT_EQ(shown->whatsThis(), slider.slider.help);
+        EXPECT_EQ(shown->sldrValue->toolTip(), slider.slider.help);
+        EXPECT_EQ(shown->sldrValue->accessibleDescription(), slider.slider.help);
+    }
+}
+
+TEST_P(Pane, MakesItsCoreAndLeadsOnOnceARunWasCompleted) {
+    const bool advanced = GetParam() == Mode_Advanced;
+    const bool touch = GetParam() == Mode_FinalTouch;
+    EXPECT_EQ(pane->showsPresets(), advanced);
+    EXPECT_TRUE(pane->autoRefresh() == touch && pane->takesProcessedImage() == touch);
+    QSignalSpy changed(pane, &IWgtPane::changeMode);
+    CARGBPlane in(16, 16, QStringLiteral("in"));
+    CARGBPlane out(16, 16, QStringLiteral("out"));
+    CThreadedCore* core = pane->createCore(&in, &out, pane);
+    EXPECT_STREQ(core->metaObject()->className(),
+                 touch ? "CThreadedCore_FinalTouch" : "CThreadedCore_Orvela");
+    EXPECT_EQ(core->parent(), pane);
+    auto* button = pane->findChild<QAbstractButton*>(touch ? "btnBack" : "btnFinalTouch");
+    ASSERT_EQ(button != nullptr, touch || advanced);
+    if (!button)
+        return;
+    Q_EMIT core->started();
+    button->click();
+    Q_EMIT core->finished();
+    button->click();
+    EXPECT_EQ(changed.count(), 0) << "no run was completed";
+    QObject::connect(core, &CThreadedCore::stepDone, core, &CThreadedCore::stepHandled);
+    core->setParams(CUserParamsPhotoshop(GetParam()));
+    core->run();
+    Q_EMIT core->terminated();
+    button->click();
+    ASSERT_EQ(changed.count(), 1);
+    EXPECT_EQ(changed[0][0].value<EGUIMode>(), touch ? Mode_Advanced : Mode_FinalTouch);
+}
+
+INSTANTIATE_TEST_SUITE_P(All, Pane, testing::ValuesIn(modesWithPanes()), [](const auto& mode) {
+    return getModeAsString(mode.param).remove(QRegularExpression("\\W")).toStdString();
+});
+
+TEST(PaneOfAnotherMode, ReportsItOrDrivesNothing) {
+    std::unique_ptr<Shown<CWgtPane3SlidersImpl>> three;
+    CUserParams params;
+    EXPECT_EQ(boxes([&] { three = std::make_unique<Shown<CWgtPane3SlidersImpl>>(Mode_FinalTouch); }),
+              QStringList("Note:|invalid mode in CWgtPane3SlidersImpl::setSliders"));
+    EXPECT_EQ(boxes([&] { three->pane->applyGUIParams(params); }),
+              QStringList("Note:|invalid mode in CWgtPane3SlidersImpl::applyGUIParams"));
+    const Shown<CWgtPaneGenericImpl> generic(Mode_Advanced);
+    EXPECT_EQ(generic.pane->findChild<CColorPicker*>(), nullptr);
+    generic.pane->applyGUIParams(params);
+    EXPECT_TRUE(settingsOf(params.mSliderParams).empty());
+}
+
+TEST(GenericPane, PickerShowsWhileItsSliderIsOn) {
+    Shown<CWgtPaneGenericImpl> shown(Mode_ColorFilter);
+    auto* picker = shown.pane->findChild<CColorPicker*>();
+    EXPECT_TRUE(picker->isVisible());
+    shown.pane->sldrGeneric->setEnabled(false);
+    EXPECT_FALSE(picker->isVisible());
+    shown.pane->sldrGeneric->setEnabled(true);
+    shown.pane->setSliders(QString()); // no factory preset of this pane: only the reset
+    EXPECT_FALSE(shown.pane->sldrGeneric->isEnabled());
+    EXPECT_EQ(shown.pane->sldrGeneric->value(), 500);
+}
+
+TEST(AdvancedPane, FoldsTheRarelyUsedGroupsAway) {
+    const Shown<CWgtPaneAdvancedImpl> shown(Mode_Advanced);
+    CWgtPaneAdvancedImpl* const pane = shown.pane;
+    const auto expectExtended = [pane](bool extended) {
+        for (const QWidget* part :
+             std::initializer_list<QWidget*>{pane->grpBxPerceptualAbsolute, pane->grpBxArtefacts,
+                                             pane->grpBxColor, pane->btnCollapseSettings})
+            EXPECT_EQ(part->isVisible(), extended) << qPrintable(part->objectName());
+        EXPECT_EQ(pane->btnExtendSettings->isVisible(), !extended);
+        EXPECT_TRUE(pane->sldrFade->isVisible() && pane->sldrAutoContrast->isHidden());
+    };
+    expectExtended(false);
+    QTest::mouseClick(pane->btnExtendSettings, Qt::LeftButton);
+    expectExtended(true);
+    pane->sldrColorFilter->setEnabled(true);
+    EXPECT_TRUE(pane->colrPickAutoColor->isVisible());
+    pane->sldrColorFilter->setEnabled(false);
+    EXPECT_FALSE(pane->colrPickAutoColor->isVisible());
+    QTest::mouseClick(pane->btnCollapseSettings, Qt::LeftButton);
+    expectExtended(false);
+}
+
+TEST(FinalTouchPane, ColorFiltersAndPickersMirrorEachOther) {
+    const Shown<CWgtPaneFinalTouchImpl> shown(Mode_FinalTouch);
+    CWgtPaneFinalTouchImpl* const pane = shown.pane;
+    COrvelaSliderBlockImpl* const sliders[] = {pane->sldrPercColorFilter, pane->sldrAbsColorFilter};
+    CColorPicker* const pickers[] = {pane->colrPickPercColorFilter, pane->colrPickAbsColorFilter};
+    for (const int from : {0, 1}) {
+        const int to = 1 - from;
+        pane->tabCtnrFinalTouch->setCurrentIndex(from);
+        EXPECT_FALSE(pickers[from]->isVisible());
+        sliders[from]->setEnabled(true);
+        EXPECT_TRUE(sliders[to]->isEnabled());
+        EXPECT_TRUE(pickers[from]->isVisible());
+        sliders[from]->txtValue->selectAll();
+        QTest::keyClicks(sliders[from]->txtValue, from == 0 ? "12.3" : "45.6");
+        EXPECT_EQ(sliders[from]->txtValue->text(), QLatin1String(from == 0 ? "12.3" : "45.6"));
+        EXPECT_NEAR(sliders[to]->value(), from == 0 ? 123 : 456, 1e-9);
+        CThinHorizontalSlider* thin = sliders[from]->sldrValue;
+        QTest::mouseClick(thin, Qt::LeftButton, {}, QPoint(thin->width() / 3, 3));
+        EXPECT_GT(sliders[to]->value(), 300);
+        EXPECT_EQ(sliders[to]->value(), sliders[from]->value());
+        pickers[from]->setColor(QColor(from, 20, 30));
+        EXPECT_EQ(pickers[to]->color(), QColor(from, 20, 30));
+        sliders[from]->setEnabled(false);
+        EXPECT_FALSE(sliders[to]->isEnabled() || pickers[from]->isVisible());
+        pane->setSliders(QString());
+    }
+}
+
+TEST(FinalTouchPane, NamesItsPresetAndItsTabs) {
+    const Shown<CWgtPaneFinalTouchImpl> shown(Mode_FinalTouch);
+    QComboBox list;
+    shown.pane->fillPresetList(&list);
+    ASSERT_EQ(list.count(), 1);
+    EXPECT_EQ(list.itemText(0), "Automatic");
+    EXPECT_FALSE(list.itemIcon(0).isNull());
+    QTabBar* const tabs = shown.pane->tabCtnrAbsRGB->tabBar();
+    EXPECT_EQ(QAccessible::queryAccessibleInterface(tabs)->child(3)->text(QAccessible::Name), "All channels");
+}
+
+} // namespace
