@@ -41,7 +41,7 @@ QJsonObject parse(const QString& path, const QByteArray& text) {
     const QJsonDocument document = QJsonDocument::fromJson(text, &error);
     if (document.isNull())
         fail(path, QStringLiteral("is not JSON (%1 at byte %2)").arg(error.errorString()).arg(error.offset));
-    const QJsonObject root = document.object();
+    QJsonObject root = document.object();
     if (!root.value(kVersionKey).isDouble() || !root.value(kSettingsKey).isObject())
         fail(path, QStringLiteral("is not a preset (\"version\" and \"settings\" are missing)"));
     if (root.value(kVersionKey).toDouble() != kVersion)

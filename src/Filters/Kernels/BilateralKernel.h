@@ -26,7 +26,7 @@ private:
     struct Tile;
 
     void smoothTile(Tile& tile) const;
-    void weigh(Tile& tile, int wy, int wx, int count) const;
+    void weigh(Tile& tile, int wy, int wx, int pixels) const;
 
     const float* mSpatial;
     const float* mRange;
