@@ -2,6 +2,7 @@
 
 #include "Settings/PaneTable.h"
 #include "Settings/PresetConversion.h"
+#include "Settings/SettingFields.h"
 
 #include <algorithm>
 #include <cctype>
@@ -79,6 +80,16 @@ std::vector<NamedSlider> slidersOf(EGUIMode mode) {
         sliders.push_back({"--value", single->slider});
     for (const PaneSlider& each : PaneTable::threeSliders(mode))
         sliders.push_back({"--" + plain(each.slider.label), each.slider});
+    return sliders;
+}
+
+std::vector<NamedSlider> settings() {
+    std::vector<NamedSlider> sliders;
+    for (const SliderField& field : sliderFields()) {
+        const SliderDescription* slider = SettingFields::sliderOf(field);
+        if (slider && slider->stage == SettingStage::Main && (field.value || !slider->value))
+            sliders.push_back({field.name, *slider});
+    }
     return sliders;
 }
 

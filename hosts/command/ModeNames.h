@@ -38,6 +38,10 @@ std::vector<std::string> nearest(std::string_view name);
 /// The sliders that the mode itself has, by their options: "--value" of a single one, or "--" and the label.
 std::vector<NamedSlider> slidersOf(EGUIMode mode);
 
+/// Every slider of the main stage by the setting that --set takes: the name of its position, or of its switch
+/// where it has no position.
+std::vector<NamedSlider> settings();
+
 /// The sliders of the final touch, such as "AbsContrast".
 std::vector<NamedSlider> finalTouchSliders();
 

@@ -20,16 +20,25 @@ double highest(const SliderDescription& slider) {
     return std::max(slider.scale->low(), slider.scale->high());
 }
 
-void print(const std::string& option, const std::string& range, const char* help) {
-    std::cout << "      " << option << "  " << range << "\n          " << help << '\n';
+void print(const std::string& heading, const char* help) {
+    std::cout << "      " << heading << "\n          " << help << '\n';
+}
+
+std::string range(double from, double to) {
+    return TextValues::shortest(from) + " to " + TextValues::shortest(to);
 }
 
 void print(const std::vector<NamedSlider>& sliders) {
     for (const auto& [name, slider] : sliders)
-        print(name,
-              std::string(slider.label) + ", " + TextValues::shortest(lowest(slider)) + " to " +
-                  TextValues::shortest(highest(slider)),
+        print(name + "  " + slider.label + ", " + range(lowest(slider), highest(slider)), slider.help);
+}
+
+void printSettings() {
+    for (const auto& [name, slider] : ModeNames::settings()) {
+        const std::string shown = "=POSITION,on  " + std::string(slider.label) + ", ";
+        print(name + (slider.value ? shown + range(slider.scale->low(), slider.scale->high()) : "=on"),
               slider.help);
+    }
 }
 
 nlohmann::ordered_json describe(const std::vector<NamedSlider>& sliders) {
@@ -50,8 +59,11 @@ void listText() {
         print(sliders);
         for (const PaneColor& each : PaneTable::colors(mode->mode))
             if (!sliders.empty())
-                print("--colour", "R,G,B, 0 to 255 each", each.color.help);
+                print("--colour  R,G,B, 0 to 255 each", each.color.help);
     }
+    std::cout
+        << "\nEvery setting, for any mode (--set; positions from 0, the first number, to 1000, the last):\n";
+    printSettings();
     std::cout << "\nFinal touch, after any mode (--final-touch NAME=NUMBER,...):\n";
     print(ModeNames::finalTouchSliders());
 }
@@ -65,6 +77,7 @@ void listJson() {
                          {"summary", mode->summary},
                          {"sliders", describe(ModeNames::slidersOf(mode->mode))}});
     const nlohmann::ordered_json list = {{"modes", modes},
+                                         {"settings", describe(ModeNames::settings())},
                                          {"finalTouch", describe(ModeNames::finalTouchSliders())}};
     std::cout << list.dump(2) << '\n';
 }

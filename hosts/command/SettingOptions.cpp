@@ -81,7 +81,7 @@ void applyField(CSliderParams& sliders, const std::string& text) {
     const SliderField* field = SettingFields::find(name);
     if (!field)
         throw UsageError("--set " + text + ": there is no setting \"" + name +
-                         "\"; --save-preset writes a file with all names");
+                         "\"; `orvela modes` lists them");
     if (field->flag) {
         sliders.*field->flag = TextValues::onOrOff("--set " + name, given);
         return;

@@ -13,12 +13,6 @@ const Entry* firstOf(std::span<const Entry> entries, Holds holds) {
     return found == entries.end() ? nullptr : &*found;
 }
 
-const SliderDescription* sliderOf(const SliderField& field) {
-    return firstOf(SliderTable::sliders(), [&field](const SliderDescription& each) {
-        return field.value ? each.value == field.value : each.enabled == field.flag;
-    });
-}
-
 const ColorDescription* colorOf(const SliderField& field) {
     return firstOf(SliderTable::colors(), [&field](const ColorDescription& each) {
         return std::find(each.parts.begin(), each.parts.end(), field.value) != each.parts.end();
@@ -35,6 +29,12 @@ const SliderField* find(std::string_view name) {
 
 float highest(const SliderField& field) {
     return colorOf(field) ? 255.0F : 1000.0F;
+}
+
+const SliderDescription* sliderOf(const SliderField& field) {
+    return firstOf(SliderTable::sliders(), [&field](const SliderDescription& each) {
+        return field.value ? each.value == field.value : each.enabled == field.flag;
+    });
 }
 
 bool CSliderParams::*switchOf(const SliderField& field) {

@@ -16,6 +16,9 @@ const SliderField* find(std::string_view name);
 /// Largest value of a value field: 255 for a part of a colour, 1000 for a position. The smallest is 0.
 float highest(const SliderField& field);
 
+/// The slider whose position the field holds, or whose switch it is; null for any other field.
+const SliderDescription* sliderOf(const SliderField& field);
+
 /// The switch that turns the slider of a value field on; null for parts of colours and flags.
 bool CSliderParams::*switchOf(const SliderField& field);
 
