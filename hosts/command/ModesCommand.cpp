@@ -35,9 +35,11 @@ void print(const std::vector<NamedSlider>& sliders) {
 
 void printSettings() {
     for (const auto& [name, slider] : ModeNames::settings()) {
-        const std::string shown = "=POSITION,on  " + std::string(slider.label) + ", ";
-        print(name + (slider.value ? shown + range(slider.scale->low(), slider.scale->high()) : "=on"),
-              slider.help);
+        std::string heading = name + "=on";
+        if (slider.value)
+            heading = name + "=POSITION,on  " + slider.label + ", " +
+                      range(slider.scale->low(), slider.scale->high());
+        print(heading, slider.help);
     }
 }
 
