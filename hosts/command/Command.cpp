@@ -9,6 +9,7 @@
 #include <QCoreApplication>
 
 #include <CLI/CLI.hpp>
+#include <algorithm>
 #include <iostream>
 
 namespace orvela {
@@ -72,7 +73,9 @@ int runProgram(int argc, char** argv) {
         const bool answered = program.exit(error) == 0; // --help and --version come this way, too
         return static_cast<int>(answered ? ExitStatus::Done : ExitStatus::WrongUsage);
     }
-    const ExitStatus status = perform(action);
+    ExitStatus status = perform(action);
+    if (!std::cout.flush())
+        status = std::max(status, refuse(ExitStatus::TargetTrouble, "the output cannot be written"));
     return signals.received() ? kSignalBase + signals.received() : static_cast<int>(status);
 }
 

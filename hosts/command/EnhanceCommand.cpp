@@ -4,6 +4,7 @@
 #include "Utility/Logger.h"
 #include "Utility/RowScheduler.h"
 #include "command/Enhancement.h"
+#include "command/PresetTargets.h"
 #include "command/ProgressLine.h"
 #include "command/Sources.h"
 #include "common/PhotographReader.h"
@@ -94,9 +95,6 @@ void Batch::runJob(const Job& job) {
     makeFolder();
     WriteOptions writing = mOptions.writing;
     writing.stop = &mSignals.stopRequested();
-    std::error_code error;
-    if (!writing.overwrite && fs::exists(fs::symlink_status(job.target, error)))
-        throw TargetError(job.target.string() + ": exists already; use --force to overwrite it");
     checkTargetPath(job.target, job.source, writing.overwrite);
     Photograph photograph = read(job.source);
     checkTarget(photograph, job.target, writing);
@@ -134,28 +132,49 @@ std::optional<TraceOptions> Batch::traceOf(const Job& job) const {
     return TraceOptions{folder, mOptions.writing.overwrite};
 }
 
-// The log and a saved preset must not fall on a photograph or a result.
+// The log and a saved preset must not fall on a photograph, a result or each other.
 void refuseOverlap(const EnhanceOptions& options, const std::vector<Job>& jobs) {
-    for (const auto& file : {options.log, options.savePreset})
-        for (const Job& job : jobs)
-            if (file && (isSameFile(*file, job.source) || isSameFile(*file, job.target)))
-                throw UsageError(*file + ": is a photograph or a result; name another file");
+    FileSet taken;
+    for (const Job& job : jobs) {
+        taken.add(job.source);
+        taken.add(job.target);
+    }
+    if (options.savePreset && taken.contains(*options.savePreset))
+        throw UsageError(*options.savePreset + ": is a photograph or a result; name another file");
+    for (const auto& preset : {options.savePreset, options.settings.preset})
+        if (preset)
+            taken.add(*preset);
+    if (options.log && taken.contains(*options.log))
+        throw UsageError(*options.log + ": is a photograph, a result or a preset; name another file");
 }
 
 void savePreset(const EnhanceOptions& options, const RunSettings& settings) {
-    if (options.savePreset)
-        settings.preset.write(QString::fromLocal8Bit(options.savePreset->c_str()));
+    if (!options.savePreset)
+        return;
+    const QString path = QString::fromLocal8Bit(options.savePreset->c_str());
+    static_cast<void>(presetToWriteInto(path, options.writing.overwrite));
+    settings.preset.write(path);
 }
 
-bool openLog(const EnhanceOptions& options) {
+void openLog(const EnhanceOptions& options) {
     if (!options.log)
-        return true;
+        return;
+    checkTargetPath(*options.log, {}, options.writing.overwrite);
     auto logger = std::make_unique<CLoggerFile>(QByteArray::fromStdString(*options.log));
     if (!logger->isOpen())
-        return false;
+        throw TargetError(*options.log + ": the log cannot be written; check the folder");
     Log::setThreshold(LogLevel::Debug);
     Log::install(std::move(logger));
-    return true;
+}
+
+ExitStatus report(const Sources& sources) {
+    for (const std::string& failure : sources.failures)
+        std::cerr << "orvela: " << failure << std::endl;
+    for (const std::string& argument : sources.unmatched)
+        std::cerr << "orvela: " << argument << ": no photograph matches" << std::endl;
+    if (!sources.failures.empty())
+        return ExitStatus::PhotographFailed;
+    return sources.unmatched.empty() ? ExitStatus::Done : ExitStatus::NothingMatched;
 }
 
 ExitStatus targetTrouble(const std::string& text) {
@@ -176,20 +195,15 @@ ExitStatus enhancePhotographs(const EnhanceOptions& options, StopSignals& signal
         std::cerr << "orvela: " << note << std::endl;
     try {
         savePreset(options, settings);
-    } catch (const PresetError& error) {
+        openLog(options);
+    } catch (const std::runtime_error& error) { // of a preset or of a target
         return targetTrouble(error.what());
     }
-    for (const std::string& argument : sources.unmatched)
-        std::cerr << "orvela: " << argument << ": no photograph matches" << std::endl;
-    const ExitStatus unmatched = sources.unmatched.empty() ? ExitStatus::Done : ExitStatus::NothingMatched;
-    if (jobs.empty())
-        return unmatched;
-    if (!openLog(options))
-        return targetTrouble(*options.log + ": the log cannot be written; check the folder");
+    const ExitStatus found = report(sources);
     const ExitStatus worst = Batch(options, settings, jobs, signals).run();
     Log::install(nullptr);
     // A photograph that failed says more than an argument that matched nothing.
-    return worst == ExitStatus::Done ? unmatched : worst;
+    return worst == ExitStatus::Done ? found : worst;
 }
 
 } // namespace orvela

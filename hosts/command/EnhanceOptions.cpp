@@ -16,7 +16,7 @@ void declareTargets(CLI::App& app, EnhanceOptions& options) {
                    "folder for the results, under the names of the photographs; made when missing")
         ->option_text("FOLDER");
     app.add_flag("--force", options.writing.overwrite,
-                 "overwrite results of earlier runs (never a photograph that is read)");
+                 "overwrite results, presets and logs of earlier runs (never a photograph that is read)");
 }
 
 void declareEncoding(CLI::App& app, WriteOptions& writing) {

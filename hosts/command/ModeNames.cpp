@@ -1,6 +1,5 @@
 #include "command/ModeNames.h"
 
-#include "Settings/PaneTable.h"
 #include "Settings/PresetConversion.h"
 #include "Settings/SettingFields.h"
 
@@ -81,6 +80,10 @@ std::vector<NamedSlider> slidersOf(EGUIMode mode) {
     for (const PaneSlider& each : PaneTable::threeSliders(mode))
         sliders.push_back({"--" + plain(each.slider.label), each.slider});
     return sliders;
+}
+
+std::span<const PaneColor> colorsOf(EGUIMode mode) {
+    return slidersOf(mode).empty() ? std::span<const PaneColor>() : PaneTable::colors(mode);
 }
 
 std::vector<NamedSlider> settings() {

@@ -1,8 +1,9 @@
 #pragma once
 
 #include "Settings/ModeTable.h"
-#include "Settings/SliderTable.h"
+#include "Settings/PaneTable.h"
 
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -37,6 +38,9 @@ std::vector<std::string> nearest(std::string_view name);
 
 /// The sliders that the mode itself has, by their options: "--value" of a single one, or "--" and the label.
 std::vector<NamedSlider> slidersOf(EGUIMode mode);
+
+/// The colours that --colour picks for the mode: those of its own pane.
+std::span<const PaneColor> colorsOf(EGUIMode mode);
 
 /// Every slider of the main stage by the setting that --set takes: the name of its position, or of its switch
 /// where it has no position.

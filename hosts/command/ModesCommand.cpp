@@ -1,6 +1,5 @@
 #include "command/ModesCommand.h"
 
-#include "Settings/PaneTable.h"
 #include "command/ModeNames.h"
 #include "command/TextValues.h"
 
@@ -43,6 +42,24 @@ void printSettings() {
     }
 }
 
+nlohmann::ordered_json describeSettings() {
+    auto list = nlohmann::ordered_json::array();
+    for (const auto& [name, slider] : ModeNames::settings()) {
+        auto& row = list.emplace_back(nlohmann::ordered_json{{"name", name}, {"label", slider.label}});
+        if (slider.value)
+            row.update({{"shownAt0", slider.scale->low()}, {"shownAt1000", slider.scale->high()}});
+        row["help"] = slider.help;
+    }
+    return list;
+}
+
+nlohmann::ordered_json describeColors(EGUIMode mode) {
+    auto list = nlohmann::ordered_json::array();
+    for (const PaneColor& each : ModeNames::colorsOf(mode))
+        list.push_back({{"option", "--colour"}, {"help", each.color.help}});
+    return list;
+}
+
 nlohmann::ordered_json describe(const std::vector<NamedSlider>& sliders) {
     auto list = nlohmann::ordered_json::array();
     for (const auto& [name, slider] : sliders)
@@ -57,11 +74,9 @@ nlohmann::ordered_json describe(const std::vector<NamedSlider>& sliders) {
 void listText() {
     for (const ModeDescription* mode : ModeNames::selectable()) {
         std::cout << ModeNames::identifierOf(*mode) << ": " << mode->summary << '\n';
-        const std::vector<NamedSlider> sliders = ModeNames::slidersOf(mode->mode);
-        print(sliders);
-        for (const PaneColor& each : PaneTable::colors(mode->mode))
-            if (!sliders.empty())
-                print("--colour  R,G,B, 0 to 255 each", each.color.help);
+        print(ModeNames::slidersOf(mode->mode));
+        for (const PaneColor& each : ModeNames::colorsOf(mode->mode))
+            print("--colour  R,G,B, 0 to 255 each", each.color.help);
     }
     std::cout
         << "\nEvery setting, for any mode (--set; positions from 0, the first number, to 1000, the last):\n";
@@ -77,9 +92,10 @@ void listJson() {
                          {"identifier", ModeNames::identifierOf(*mode)},
                          {"name", mode->displayName},
                          {"summary", mode->summary},
-                         {"sliders", describe(ModeNames::slidersOf(mode->mode))}});
+                         {"sliders", describe(ModeNames::slidersOf(mode->mode))},
+                         {"colours", describeColors(mode->mode)}});
     const nlohmann::ordered_json list = {{"modes", modes},
-                                         {"settings", describe(ModeNames::settings())},
+                                         {"settings", describeSettings()},
                                          {"finalTouch", describe(ModeNames::finalTouchSliders())}};
     std::cout << list.dump(2) << '\n';
 }
@@ -88,7 +104,6 @@ void listJson() {
 
 ExitStatus listModes(bool asJson) {
     asJson ? listJson() : listText();
-    std::cout.flush();
     return ExitStatus::Done;
 }
 

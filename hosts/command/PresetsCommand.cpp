@@ -5,6 +5,7 @@
 #include "Settings/PresetFile.h"
 #include "Utility/CGenericEx.h"
 #include "command/ModeNames.h"
+#include "command/PresetTargets.h"
 #include "command/TextValues.h"
 
 #include <QFileInfo>
@@ -55,13 +56,28 @@ ExitStatus commit(const SettingsEdit& edit) {
     }
 }
 
-// An overwritten preset keeps the names that this version does not know.
-PresetFile fileToWrite(const QString& path) {
-    try {
-        return QFileInfo::exists(path) ? PresetFile::read(path) : PresetFile();
-    } catch (const PresetError&) {
-        return {};
-    }
+// A factory preset need not be in the store.
+std::optional<PresetContent> contentOf(EGUIMode mode, const QString& name) {
+    std::optional<PresetContent> stored = PresetTree::read(mode, name);
+    if (!stored && FactoryPresets::isFactoryPreset(mode, name))
+        stored = FactoryPresets::contentOf(name);
+    return stored;
+}
+
+// What is on and has no control in the mode's pane does not come with the stored preset.
+QStringList withoutControl(EGUIMode mode, const CSliderParams& sliders) {
+    const CSliderParams kept = PresetConversion::paramsOf(mode, PresetConversion::contentOf(mode, sliders));
+    QStringList names;
+    for (const SliderField& field : sliderFields())
+        if (field.flag && sliders.*field.flag && !(kept.*field.flag))
+            names.append(QString::fromLatin1(field.name));
+    return names;
+}
+
+void reportLeftOut(const char* cause, const QStringList& names) {
+    if (!names.isEmpty())
+        report(ExitStatus::Done, QStringLiteral("left out, as %1: %2")
+                                     .arg(QLatin1String(cause), names.join(QStringLiteral(", "))));
 }
 
 } // namespace
@@ -90,7 +106,6 @@ void PresetsOptions::declare(CLI::App& app, const std::function<void(std::functi
 ExitStatus listPresets(const PresetsOptions& options) {
     for (const QString& name : PresetTree::offeredNames(modeOf(options.mode)))
         std::cout << name.toStdString() << '\n';
-    std::cout.flush();
     return ExitStatus::Done;
 }
 
@@ -98,15 +113,12 @@ ExitStatus exportPreset(const PresetsOptions& options) {
     const EGUIMode mode = modeOf(options.mode);
     const QString name = nameOf(options);
     const QString path = QString::fromStdString(options.file);
-    const std::optional<PresetContent> stored = PresetTree::read(mode, name);
+    const std::optional<PresetContent> stored = contentOf(mode, name);
     if (!stored)
         return reportMissing(mode, name);
-    if (QFileInfo::exists(path) && !options.overwrite)
-        return report(ExitStatus::TargetTrouble,
-                      QStringLiteral("%1 exists; --force overwrites it").arg(path));
-    PresetFile preset = fileToWrite(path);
-    preset.take(PresetConversion::paramsOf(mode, *stored));
     try {
+        PresetFile preset = presetToWriteInto(path, options.overwrite);
+        preset.take(PresetConversion::paramsOf(mode, *stored));
         preset.write(path);
     } catch (const PresetError& error) {
         return report(ExitStatus::TargetTrouble, QString::fromStdString(error.what()));
@@ -123,11 +135,10 @@ ExitStatus importPreset(const PresetsOptions& options) {
         return report(
             ExitStatus::TargetTrouble,
             QStringLiteral("%1 has a preset \"%2\"; --force overwrites it").arg(getModeAsString(mode), name));
-    if (const QStringList unknown = preset.unknownNames(); !unknown.isEmpty())
-        report(ExitStatus::Done, QStringLiteral("left out, as this version does not know them: ") +
-                                     unknown.join(QStringLiteral(", ")));
     CSliderParams sliders;
     preset.applyTo(sliders);
+    reportLeftOut("this version does not know them", preset.unknownNames());
+    reportLeftOut("the presets of this mode do not hold them", withoutControl(mode, sliders));
     SettingsEdit edit;
     PresetTree::remove(edit, mode, name);
     PresetTree::write(edit, mode, name, PresetConversion::contentOf(mode, sliders));
@@ -138,9 +149,7 @@ ExitStatus removePreset(const PresetsOptions& options) {
     const EGUIMode mode = modeOf(options.mode);
     const QString name = nameOf(options);
     if (FactoryPresets::isFactoryPreset(mode, name))
-        return report(ExitStatus::PhotographFailed,
-                      QStringLiteral("The current preset cannot be deleted, since it's one of the factory "
-                                     "presets."));
+        throw UsageError("\"" + name.toStdString() + "\" comes with the program and cannot be removed");
     if (!PresetTree::names(mode).contains(name))
         return reportMissing(mode, name);
     SettingsEdit edit;

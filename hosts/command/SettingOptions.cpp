@@ -97,16 +97,14 @@ void applyField(CSliderParams& sliders, const std::string& text) {
     sliders.*enabled = TextValues::onOrOff("--set " + name, given.substr(comma + 1));
 }
 
-// Puts the final-touch sliders that are off to their neutral positions: a midtone filter that one of them
-// switches on reads the others' too.
-void neutralizeFinalTouch(CSliderParams& sliders) {
+// Puts the final-touch sliders to where their pane starts: a midtone filter that one of them switches on
+// reads the others' positions too.
+void startFinalTouch(CSliderParams& sliders) {
     for (const PaneSlider& each : PaneTable::sliders(Mode_FinalTouch))
-        if (!(sliders.*each.slider.enabled))
-            sliders.*each.slider.value = static_cast<float>(each.initial);
+        sliders.*each.slider.value = static_cast<float>(each.initial);
 }
 
 void applyFinalTouch(CSliderParams& sliders, const std::string& text) {
-    neutralizeFinalTouch(sliders);
     const std::vector<NamedSlider> known = ModeNames::finalTouchSliders();
     for (const std::string& part : TextValues::split(text, ',')) {
         const auto [name, given] = TextValues::assignment("--final-touch", part);
@@ -155,6 +153,7 @@ RunSettings settle(const SettingOptions& options) {
     RunSettings run;
     run.params = CUserParamsPhotoshop(mode.mode);
     CSliderParams sliders = run.params.mSliderParams;
+    startFinalTouch(sliders);
     if (options.preset)
         applyPreset(run, sliders, *options.preset);
     if (options.value)

@@ -14,13 +14,13 @@ namespace fs = std::filesystem;
 
 namespace {
 
+// @throws fs::filesystem_error when not all of the folder can be read
 std::vector<fs::path> photographsIn(const fs::path& folder) {
     std::vector<fs::path> found;
-    std::error_code error;
-    for (fs::directory_iterator entry(folder, error), end; !error && entry != end; entry.increment(error))
-        if (formatOfExtension(entry->path()) && !isEarlierResult(entry->path()) &&
-            !entry->is_directory(error))
-            found.push_back(entry->path());
+    std::error_code none; // a file that cannot be looked at fails when it is read
+    for (const fs::directory_entry& entry : fs::directory_iterator(folder))
+        if (formatOfExtension(entry.path()) && !isEarlierResult(entry.path()) && !entry.is_directory(none))
+            found.push_back(entry.path());
     std::sort(found.begin(), found.end());
     return found;
 }
@@ -48,9 +48,15 @@ Sources findSources(const std::vector<std::string>& arguments) {
     Sources sources;
     std::set<fs::path> known;
     for (const std::string& argument : arguments) {
-        const std::vector<fs::path> found = expand(argument);
-        if (found.empty())
-            sources.unmatched.push_back(argument);
+        std::vector<fs::path> found;
+        try {
+            found = expand(argument);
+            if (found.empty())
+                sources.unmatched.push_back(argument);
+        } catch (const fs::filesystem_error& error) {
+            sources.failures.push_back(argument + ": the folder cannot be read (" + error.code().message() +
+                                       "); ask its owner for access");
+        }
         for (const fs::path& photograph : found)
             if (known.insert(realPath(photograph)).second)
                 sources.photographs.push_back(photograph);

@@ -10,6 +10,7 @@ namespace orvela {
 struct Sources {
     std::vector<std::filesystem::path> photographs; ///< each file once, in the order of the arguments
     std::vector<std::string> unmatched;             ///< folders and patterns without a photograph
+    std::vector<std::string> failures;              ///< of folders that could not be read, with what to do
 };
 
 /// An argument is a file (existing or not), a folder (the photographs in it, by name; results of earlier

@@ -3,6 +3,8 @@
 #include "command/ExitStatus.h"
 #include "common/FileFormat.h"
 
+#include <sys/stat.h>
+
 #include <array>
 #include <fstream>
 #include <map>
@@ -37,11 +39,12 @@ fs::path targetOf(const fs::path& source, const TargetOptions& options) {
     return *options.folder / (name += beside.extension());
 }
 
-void refuseSources(const Job& job, const std::vector<fs::path>& sources) {
-    for (const fs::path& source : sources)
-        if (isSameFile(job.target, source))
-            throw UsageError(job.target.string() +
-                             ": the result would overwrite a photograph that is read; name another target");
+// Device and number of an existing file.
+std::optional<std::pair<std::uintmax_t, std::uintmax_t>> identityOf(const fs::path& file) {
+    struct stat status {};
+    if (::stat(file.c_str(), &status) != 0)
+        return std::nullopt;
+    return std::pair{std::uintmax_t{status.st_dev}, std::uintmax_t{status.st_ino}};
 }
 
 } // namespace
@@ -52,11 +55,16 @@ std::vector<Job> planTargets(const std::vector<fs::path>& sources, const TargetO
     if (options.file && sources.size() > 1)
         throw UsageError("-o takes the result of one photograph, " + std::to_string(sources.size()) +
                          " were given; use -d FOLDER");
+    FileSet known;
+    for (const fs::path& source : sources)
+        known.add(source);
     std::vector<Job> jobs;
     std::map<fs::path, fs::path> sourceOfTarget;
     for (const fs::path& source : sources) {
         const Job& job = jobs.emplace_back(Job{source, targetOf(source, options)});
-        refuseSources(job, sources);
+        if (known.contains(job.target))
+            throw UsageError(job.target.string() +
+                             ": the result would overwrite a photograph that is read; name another target");
         const auto [other, isNew] = sourceOfTarget.emplace(realPath(job.target), source);
         if (!isNew)
             throw UsageError(other->second.string() + " and " + source.string() + " would both become " +
@@ -76,9 +84,15 @@ fs::path realPath(const fs::path& path) {
     return error ? absolute.lexically_normal() : real;
 }
 
-bool isSameFile(const fs::path& a, const fs::path& b) {
-    std::error_code error;
-    return fs::equivalent(a, b, error) || realPath(a) == realPath(b);
+void FileSet::add(const fs::path& file) {
+    mPaths.insert(realPath(file));
+    if (const auto identity = identityOf(file))
+        mIdentities.insert(*identity);
+}
+
+bool FileSet::contains(const fs::path& file) const {
+    const auto identity = identityOf(file);
+    return (identity && mIdentities.contains(*identity)) || mPaths.contains(realPath(file));
 }
 
 } // namespace orvela

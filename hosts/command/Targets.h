@@ -1,7 +1,10 @@
 #pragma once
 
+#include <cstdint>
 #include <filesystem>
 #include <optional>
+#include <set>
+#include <utility>
 #include <vector>
 
 namespace orvela {
@@ -29,7 +32,17 @@ bool isEarlierResult(const std::filesystem::path& file);
 /// The absolute path without links, "." and ".."; with the links where they lead nowhere.
 std::filesystem::path realPath(const std::filesystem::path& path);
 
-/// True when both name the same existing file, or would.
-bool isSameFile(const std::filesystem::path& a, const std::filesystem::path& b);
+/// Files, known by what they are on the disk and by where they are or would be.
+class FileSet {
+public:
+    void add(const std::filesystem::path& file);
+
+    /// True when it is one of them under any name, also through links.
+    bool contains(const std::filesystem::path& file) const;
+
+private:
+    std::set<std::filesystem::path> mPaths;
+    std::set<std::pair<std::uintmax_t, std::uintmax_t>> mIdentities; ///< device and number on it
+};
 
 } // namespace orvela

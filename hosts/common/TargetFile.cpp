@@ -23,7 +23,7 @@ namespace fs = std::filesystem;
 }
 
 [[noreturn]] void refuseExisting(const fs::path& target) {
-    refuse(target, "exists already", "choose another name or allow overwriting");
+    refuse(target, "exists already", "use --force to overwrite it");
 }
 
 [[noreturn]] void refuseSystem(const fs::path& target, int error) {

@@ -40,14 +40,18 @@ QJsonObject parse(const QString& path, const QByteArray& text) {
     QJsonParseError error;
     const QJsonDocument document = QJsonDocument::fromJson(text, &error);
     if (document.isNull())
-        fail(path, QStringLiteral("is not JSON (%1 at byte %2)").arg(error.errorString()).arg(error.offset));
+        fail(path, QStringLiteral("is not JSON (%1 at byte %2); name a file that --save-preset wrote")
+                       .arg(error.errorString())
+                       .arg(error.offset));
     QJsonObject root = document.object();
     if (!root.value(kVersionKey).isDouble() || !root.value(kSettingsKey).isObject())
-        fail(path, QStringLiteral("is not a preset (\"version\" and \"settings\" are missing)"));
+        fail(path, QStringLiteral("is not a preset (a number \"version\" and an object \"settings\" are "
+                                  "needed); name a file that --save-preset wrote"));
     if (root.value(kVersionKey).toDouble() != kVersion)
-        fail(path, QStringLiteral("has version %1; this program reads version %2")
-                       .arg(root.value(kVersionKey).toDouble())
-                       .arg(kVersion));
+        fail(path,
+             QStringLiteral("has version %1, this program reads version %2; use the program that wrote it")
+                 .arg(root.value(kVersionKey).toVariant().toString())
+                 .arg(kVersion));
     return root;
 }
 
@@ -58,7 +62,8 @@ PresetFile::PresetFile() : mRoot{{kVersionKey, kVersion}, {kSettingsKey, QJsonOb
 PresetFile PresetFile::read(const QString& path) {
     QFile file(path);
     if (!file.open(QIODevice::ReadOnly))
-        fail(path, QStringLiteral("cannot be read (%1)").arg(file.errorString()));
+        fail(path, QStringLiteral("cannot be read (%1); check the name and its permissions")
+                       .arg(file.errorString()));
     PresetFile preset;
     preset.mRoot = parse(path, file.readAll());
     const QJsonObject settings = preset.mRoot.value(kSettingsKey).toObject();
@@ -94,7 +99,7 @@ void PresetFile::write(const QString& path) const {
     QSaveFile file(path);
     const QByteArray text = QJsonDocument(mRoot).toJson();
     if (!file.open(QIODevice::WriteOnly) || file.write(text) != text.size() || !file.commit())
-        fail(path, QStringLiteral("cannot be written (%1)").arg(file.errorString()));
+        fail(path, QStringLiteral("cannot be written (%1); choose another place").arg(file.errorString()));
 }
 
 QStringList PresetFile::unknownNames() const {
