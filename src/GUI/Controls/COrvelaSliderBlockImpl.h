@@ -1,8 +1,8 @@
 #pragma once
 
 #include "GUI/Controls/ZoneStop.h"
+#include "GUI/forms/ui_COrvelaSliderBlock.h"
 #include "Settings/SliderScale.h"
-#include "ui_COrvelaSliderBlock.h"
 
 #include <QWidget>
 

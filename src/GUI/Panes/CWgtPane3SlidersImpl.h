@@ -1,7 +1,7 @@
 #pragma once
 
 #include "GUI/Panes/IWgtPane.h"
-#include "ui_CWgtPane3Sliders.h"
+#include "GUI/forms/ui_CWgtPane3Sliders.h"
 
 /// The pane of Smart Levels and Adjustments.
 class CWgtPane3SlidersImpl final : public IWgtPane, public Ui::CWgtPane3Sliders {

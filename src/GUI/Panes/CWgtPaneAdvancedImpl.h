@@ -1,7 +1,7 @@
 #pragma once
 
 #include "GUI/Panes/IWgtPane.h"
-#include "ui_CWgtPaneAdvanced.h"
+#include "GUI/forms/ui_CWgtPaneAdvanced.h"
 
 /// The pane of Advanced mode and of every automatic mode: all sliders of the main pipeline.
 class CWgtPaneAdvancedImpl final : public IWgtPane, public Ui::CWgtPaneAdvanced {

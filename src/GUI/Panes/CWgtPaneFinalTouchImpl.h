@@ -1,7 +1,7 @@
 #pragma once
 
 #include "GUI/Panes/IWgtPane.h"
-#include "ui_CWgtPaneFinalTouch.h"
+#include "GUI/forms/ui_CWgtPaneFinalTouch.h"
 
 /// The pane of Final Touch: levels for each channel, contrast, brightness and a colour filter on the
 /// processed image, each in a perceptual and an absolute form. Both forms of the colour filter are one

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "GUI/Panes/IWgtPane.h"
-#include "ui_CWgtPaneGeneric.h"
+#include "GUI/forms/ui_CWgtPaneGeneric.h"
 
 /// The pane of the modes with a single filter (17 to 30): its slider, for the colour filter with a picker.
 class CWgtPaneGenericImpl final : public IWgtPane, public Ui::CWgtPaneGeneric {
