@@ -5,6 +5,7 @@
 #include "GUI/Controls/CColorPicker.h"
 #include "GUI/Controls/COrvelaSliderBlockImpl.h"
 #include "GUI/Panes/TrackZones.h"
+#include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
 
 using namespace orvela;
@@ -12,6 +13,16 @@ using namespace orvela;
 namespace {
 
 constexpr double kMiddle = 500;
+
+// The control of the pane's form with that object name.
+template <class Control>
+Control* controlOf(const IWgtPane& pane, const char* object) {
+    if (auto* found = pane.findChild<Control*>(QLatin1String(object)))
+        return found;
+    throw CGenericEx(QStringLiteral("The form of %1 has no control %2.")
+                         .arg(QLatin1String(pane.metaObject()->className()), QLatin1String(object)),
+                     "IWgtPane.cpp", __LINE__);
+}
 
 } // namespace
 
@@ -36,15 +47,11 @@ void IWgtPane::resetSliders() {
 }
 
 COrvelaSliderBlockImpl* IWgtPane::block(const PaneSlider& slider) const {
-    auto* found = findChild<COrvelaSliderBlockImpl*>(QLatin1String(slider.object));
-    Q_ASSERT(found);
-    return found;
+    return controlOf<COrvelaSliderBlockImpl>(*this, slider.object);
 }
 
 CColorPicker* IWgtPane::picker(const PaneColor& color) const {
-    auto* found = findChild<CColorPicker*>(QLatin1String(color.object));
-    Q_ASSERT(found);
-    return found;
+    return controlOf<CColorPicker>(*this, color.object);
 }
 
 void IWgtPane::setUpSlider(COrvelaSliderBlockImpl* block, const QString& label) {

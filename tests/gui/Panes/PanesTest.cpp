@@ -8,6 +8,7 @@
 #include "PaneFixture.h"
 #include "Settings/ModeTable.h"
 #include "Utility/CARGBPlane.h"
+#include "Utility/CGenericEx.h"
 #include "support/BoxRecorder.h"
 #include "support/ParamsText.h"
 #include "support/SettingsMap.h"
@@ -19,7 +20,7 @@
 #include <QSignalSpy>
 #include <QTest>
 
-#include <gtest/gtest.h>
+#include <gmock/gmock.h>
 
 using namespace orvela;
 
@@ -204,6 +205,14 @@ TEST(PaneOfAnotherMode, ReportsItOrDrivesNothing) {
     EXPECT_EQ(generic.pane->findChild<CColorPicker*>(), nullptr);
     generic.pane->applyGUIParams(params);
     EXPECT_TRUE(settingsOf(params.mSliderParams).empty());
+}
+
+TEST(PaneWithoutAControl, NamesWhatItsFormLacks) {
+    const Shown<CWgtPane3SlidersImpl> shown(Mode_SmartLevels);
+    delete shown.pane->sldr2;
+    CUserParams params;
+    EXPECT_THAT([&] { shown.pane->applyGUIParams(params); },
+                testing::ThrowsMessage<CGenericEx>("The form of CWgtPane3SlidersImpl has no control sldr2."));
 }
 
 TEST(GenericPane, PickerShowsWhileItsSliderIsOn) {
