@@ -80,8 +80,21 @@ std::optional<FileFormat> formatOfExtension(const std::filesystem::path& path) {
 }
 
 const char* formatName(FileFormat format) {
-    constexpr std::array names = {"JPEG", "PNG", "TIFF", "WebP", "PSD", "HEIF"};
-    return names[static_cast<std::size_t>(format)];
+    switch (format) {
+    case FileFormat::Jpeg:
+        return "JPEG";
+    case FileFormat::Png:
+        return "PNG";
+    case FileFormat::Tiff:
+        return "TIFF";
+    case FileFormat::WebP:
+        return "WebP";
+    case FileFormat::Psd:
+        return "PSD";
+    case FileFormat::Heif:
+        return "HEIF";
+    }
+    return "";
 }
 
 std::string pixelName(ColorModel model, int depth) {

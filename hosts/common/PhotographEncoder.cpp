@@ -114,13 +114,16 @@ int save(VipsImage* image, const Photograph& photograph, FileFormat format, cons
     case FileFormat::WebP:
         return vips_webpsave_buffer(image, data, size, "Q", settings.quality, "lossless", settings.lossless,
                                     "alpha_q", 100, nullptr);
-    default:
+    case FileFormat::Heif:
         return vips_heifsave_buffer(image, data, size, "Q", settings.quality, "subsample_mode", chroma,
                                     "bitdepth", photograph.depth == 8 ? 8 : settings.bitDepth, "compression",
                                     settings.compression == "av1" ? VIPS_FOREIGN_HEIF_COMPRESSION_AV1
                                                                   : VIPS_FOREIGN_HEIF_COMPRESSION_HEVC,
                                     nullptr);
+    case FileFormat::Psd: // refused by formatObstacle
+        break;
     }
+    return -1;
 }
 
 void stopWhenAsked(VipsImage* image, VipsProgress*, void* stop) {

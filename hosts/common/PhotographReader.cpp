@@ -92,8 +92,10 @@ VipsImage* load(const Bytes& file, FileFormat format) {
     case FileFormat::WebP:
         run(vips_webpload_buffer);
         break;
-    default:
+    case FileFormat::Heif:
         run(vips_heifload_buffer);
+        break;
+    case FileFormat::Psd: // see PsdFile
         break;
     }
     return image;
