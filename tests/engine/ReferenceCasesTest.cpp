@@ -174,7 +174,7 @@ TEST(ReferenceFiles, EveryTaskHasCasesInFilesOfItsName) {
             EXPECT_EQ(each.task, file.stem()) << each.place;
     }
     for (const PipelineTask& task : tasksettings::allTasks())
-        EXPECT_TRUE(named.count(task.name)) << task.name;
+        EXPECT_TRUE(named.count(task.name)) << task.name << " has no cases";
 }
 
 TEST(ReferenceFiles, BadOnesAreReportedWithTheirPlace) {

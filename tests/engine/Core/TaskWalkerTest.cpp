@@ -104,7 +104,8 @@ TEST(TaskWalker, WithoutItsSwitchesATaskLeavesThePictureAlone) {
         const Result result(task, off);
         EXPECT_FALSE(result.applied);
         EXPECT_EQ(result.picture, bytes(*off.in));
-        EXPECT_TRUE(Result(task, Scene(testplanes::noise(40, 30), task.name)).applied);
+        EXPECT_TRUE(Result(task, Scene(testplanes::noise(40, 30), task.name)).applied)
+            << "with its switches in support/TaskSettings.h";
     }
 }
 
