@@ -152,7 +152,8 @@ TEST_F(PresetStore, FactoryPresetsAreTheModesAsTheirPaneWouldSaveThem) {
     Shown<CWgtPaneAdvancedImpl> shown(Mode_Advanced);
     CPresetStore::ensureFactoryPresets(&pane);
     const QStringList written = lines();
-    EXPECT_EQ(written.size(), 12 * (26 * 2 + 3));
+    const auto sliders = static_cast<int>(PaneTable::sliders(Mode_Advanced).size());
+    EXPECT_EQ(written.size(), 12 * (sliders * 2 + 3));
     openSettings().clear();
     for (int number = Mode_Automatic; number < Mode_Advanced; ++number) {
         const CUserParamsPhotoshop factory(static_cast<EGUIMode>(number));
