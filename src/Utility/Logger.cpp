@@ -110,17 +110,13 @@ void setPrefixes(bool on) {
 }
 
 void install(std::unique_ptr<ILogger> logger) {
+    std::unique_ptr<ILogger> before; // destroyed after the lock: it may log
     guarded([&] {
         gInstalled = logger != nullptr;
         gDepth = 0;
         *tDepth = 0;
-        const std::unique_ptr<ILogger> before(std::exchange(gLogger, logger.release()));
+        before.reset(std::exchange(gLogger, logger.release()));
     });
-}
-
-const ILogger* current() {
-    const std::lock_guard lock(gMutex);
-    return gLogger;
 }
 
 bool writes(LogLevel level) {

@@ -59,9 +59,6 @@ void setPrefixes(bool on);
 /// Makes `logger` current and the indentation 0, destroying the logger before it; null stops all logging.
 void install(std::unique_ptr<ILogger> logger);
 
-/// The current logger, null when there is none.
-const ILogger* current();
-
 /// True when a line at `level` would be written: lets a caller skip the work of listing many values.
 bool writes(LogLevel level);
 

@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <mutex>
+#include <new>
 #include <set>
 #include <stdexcept>
 #include <string>
@@ -26,6 +27,7 @@ public:
     bool pre = true;
     bool post = true;
     int throwAtRow = -1;
+    bool restores = true; ///< otherwise it runs out of memory when it ends early
     std::uint32_t start = 0;
     std::uint32_t end = 0;
     std::uint32_t step = 1;
@@ -66,6 +68,12 @@ protected:
     void onSuccess() override {
         phases.emplace_back("success");
         IFilter::onSuccess();
+    }
+
+    void onStopped() override {
+        if (!restores)
+            throw std::bad_alloc();
+        IFilter::onStopped();
     }
 
 private:

@@ -85,6 +85,18 @@ TEST_F(TaskBaseTest, FailuresOnWorkersEndThePass) {
     }
 }
 
+TEST_F(TaskBaseTest, AFailureToRestoreThePictureIsTheTasksFailure) {
+    for (const bool quiet : {true, false}) {
+        ScriptedFilter failing(&params, in.get(), out.get());
+        failing.restores = false;
+        failing.post = !quiet;
+        failing.throwAtRow = quiet ? -1 : 3;
+        EXPECT_NO_THROW(EXPECT_FALSE(failing.Apply()));
+        EXPECT_EQ(failing.outcome(), TaskOutcome::Failed);
+        EXPECT_TRUE(failing.failure().outOfMemory);
+    }
+}
+
 TEST_F(TaskBaseTest, StopRequestEndsThePassBeforeAnyLaterRow) {
     params.mProgressCallback = [this](int) { params.mCancelRequested = true; };
     RowScheduler scheduler(1);

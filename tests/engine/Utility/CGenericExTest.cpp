@@ -1,27 +1,21 @@
 #include "Utility/CGenericEx.h"
 
+#include "support/LastToGo.h"
+#include "support/LogCapture.h"
+
 #include <QStringList>
 
-#include <gtest/gtest.h>
+#include <gmock/gmock.h>
 
 #include <cstdlib>
 #include <new>
+#include <thread>
 
 using namespace orvela;
 
 namespace {
 
-// Destroyed after everything else: raises a failure then, when a test asks for it, and ends the process.
-struct LastToGo {
-    bool raises = false;
-    ~LastToGo() {
-        if (!raises)
-            return;
-        const CGenericEx late(QStringLiteral("late"), "f", 1);
-        std::_Exit(ExceptionStack::entries() == QStringList(QStringLiteral("f:1 CGenericEx late")) ? 7 : 8);
-    }
-};
-__attribute__((init_priority(101))) LastToGo gLast;
+using testing::ElementsAre;
 
 // What reaches the outermost handler when two layers wrap `cause` with texts of their own.
 template <typename Cause, typename Check>
@@ -60,12 +54,47 @@ TEST(CGenericEx, WrappingKeepsTheCauseAndRecordsEachFailureOnce) {
     EXPECT_EQ(innermostMessage(plain), "plain");
 }
 
+TEST(ExceptionStack, ListsNewestFirstAndKnowsTheOldest) {
+    LogCapture log;
+    try {
+        throw CGenericEx(QStringLiteral("A"), "C:\\src\\deep\\a.cpp", 1);
+    } catch (const CGenericEx& a) {
+        EXPECT_EQ(a.sourceFile(), "a.cpp");
+        const COutOfMemoryEx b(QStringLiteral("B %1"), "x/y", 2);
+        const CBadPtrEx c(QStringLiteral("C"), nullptr, 3);
+    }
+    EXPECT_EQ(ExceptionStack::oldestMessage(), "A");
+    ExceptionStack::writeToLog(true);
+    EXPECT_THAT(log.lines(),
+                ElementsAre("-> Exception Stack:", "\t :3 CBadPtrEx C", "\t x/y:2 COutOfMemoryEx B %1",
+                            "\t a.cpp:1 CGenericEx A", "<- End Stack."));
+    EXPECT_TRUE(ExceptionStack::oldestMessage().isNull());
+}
+
+TEST(ExceptionStack, RecordsFromSeveralThreadsWithoutLoss) {
+    LogCapture log;
+    const auto raise = [] {
+        for (int i = 0; i < 200; ++i) {
+            const CGenericEx failure(QStringLiteral("x"), "f", i);
+            Log::log(LogLevel::Debug, "line");
+        }
+    };
+    std::thread other(raise);
+    raise();
+    other.join();
+    EXPECT_EQ(ExceptionStack::entries().size(), 400);
+    EXPECT_EQ(log.lines().size(), 400U);
+}
+
 TEST(ExceptionStackDeathTest, RecordsWhenStaticObjectsAreGone) {
     GTEST_FLAG_SET(death_test_style, "threadsafe");
     EXPECT_EXIT(
         {
             const CGenericEx early(QStringLiteral("early"), "f", 0);
-            gLast.raises = true;
+            endWith([] {
+                const CGenericEx late(QStringLiteral("late"), "f", 1);
+                return ExceptionStack::entries() == QStringList("f:1 CGenericEx late") ? 7 : 8;
+            });
             std::exit(0);
         },
         testing::ExitedWithCode(7), "");

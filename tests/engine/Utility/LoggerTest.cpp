@@ -1,16 +1,16 @@
 #include "Utility/Logger.h"
 
-#include "Utility/CGenericEx.h"
+#include "support/LastToGo.h"
 #include "support/LogCapture.h"
 
-#include <QStringList>
 #include <QTemporaryDir>
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <cstdlib>
 #include <fstream>
-#include <thread>
+#include <stdexcept>
 
 using namespace orvela;
 
@@ -62,36 +62,49 @@ TEST(Logger, FileIsTruncatedAndHoldsEveryLineAtOnce) {
     EXPECT_EQ(text, "100 % done\n");
 }
 
-TEST(ExceptionStack, ListsNewestFirstAndKnowsTheOldest) {
-    LogCapture log;
-    try {
-        throw CGenericEx(QStringLiteral("A"), "C:\\src\\deep\\a.cpp", 1);
-    } catch (const CGenericEx& a) {
-        EXPECT_EQ(a.sourceFile(), "a.cpp");
-        const COutOfMemoryEx b(QStringLiteral("B %1"), "x/y", 2);
-        const CBadPtrEx c(QStringLiteral("C"), nullptr, 3);
+// Throws on lines that end with an exclamation mark, and logs its own end.
+struct FailingSink final : ILogger {
+    explicit FailingSink(std::vector<std::string>& lines) : mLines(lines) {}
+    ~FailingSink() override { Log::log(LogLevel::Error, "gone"); }
+    void write(const QByteArray& line) override {
+        if (line.endsWith('!'))
+            throw std::runtime_error("the disk is full");
+        mLines.push_back(line.toStdString());
     }
-    EXPECT_EQ(ExceptionStack::oldestMessage(), "A");
-    ExceptionStack::writeToLog(true);
-    EXPECT_THAT(log.lines(),
-                ElementsAre("-> Exception Stack:", "\t :3 CBadPtrEx C", "\t x/y:2 COutOfMemoryEx B %1",
-                            "\t a.cpp:1 CGenericEx A", "<- End Stack."));
-    EXPECT_TRUE(ExceptionStack::oldestMessage().isNull());
+
+    std::vector<std::string>& mLines;
+};
+
+TEST(Logger, AFailingReceiverLosesItsLineAndNothingElse) {
+    std::vector<std::string> lines;
+    Log::install(std::make_unique<FailingSink>(lines));
+    Log::setThreshold(LogLevel::Debug);
+    Log::scopeEntry(LogLevel::Debug, "in!");
+    Log::log(LogLevel::Debug, "inside");
+    Log::scopeExit(LogLevel::Debug, "out!");
+    Log::log(LogLevel::Debug, "outside");
+    const LogCapture next;
+    EXPECT_THAT(lines, ElementsAre("\tinside", "outside"));
+    EXPECT_THAT(next.lines(), ElementsAre("gone")) << "a receiver may log while it is replaced";
 }
 
-TEST(ExceptionStack, RecordsFromSeveralThreadsWithoutLoss) {
-    LogCapture log;
-    const auto raise = [] {
-        for (int i = 0; i < 200; ++i) {
-            const CGenericEx failure(QStringLiteral("x"), "f", i);
-            Log::log(LogLevel::Debug, "line");
-        }
-    };
-    std::thread other(raise);
-    raise();
-    other.join();
-    EXPECT_EQ(ExceptionStack::entries().size(), 400);
-    EXPECT_EQ(log.lines().size(), 400U);
+// Ends the process at any line.
+struct EndingSink final : ILogger {
+    void write(const QByteArray&) override { std::_Exit(8); }
+};
+
+TEST(LoggerDeathTest, DropsLinesWhenStaticObjectsAreGone) {
+    GTEST_FLAG_SET(death_test_style, "threadsafe");
+    EXPECT_EXIT(
+        {
+            Log::install(std::make_unique<EndingSink>());
+            endWith([] {
+                Log::log(LogLevel::Error, "late");
+                return 7;
+            });
+            std::exit(0);
+        },
+        testing::ExitedWithCode(7), "");
 }
 
 } // namespace
