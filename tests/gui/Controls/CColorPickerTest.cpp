@@ -1,4 +1,5 @@
 #include "GUI/Controls/CColorPicker.h"
+
 #include "GUI/Controls/CColorPickerPopup.h"
 
 #include <QAccessible>
@@ -10,7 +11,7 @@
 
 namespace {
 
-class ColorPicker : public testing::Test {
+class CColorPickerTest : public testing::Test {
 protected:
     void SetUp() override {
         picker.show();
@@ -23,7 +24,7 @@ protected:
     CColorPicker picker;
 };
 
-TEST_F(ColorPicker, SetColorFillsTheFieldsAndAnnounces) {
+TEST_F(CColorPickerTest, SetColorFillsTheFieldsAndAnnounces) {
     QSignalSpy changed(&picker, &CColorPicker::colorChanged);
     picker.setColor(QColor(1, 20, 255));
     QStringList shown;
@@ -40,7 +41,7 @@ TEST_F(ColorPicker, SetColorFillsTheFieldsAndAnnounces) {
     EXPECT_EQ(access->text(QAccessible::Value), "#0114ff");
 }
 
-TEST_F(ColorPicker, TypedComponentsAreKeptWithin255) {
+TEST_F(CColorPickerTest, TypedComponentsAreKeptWithin255) {
     QSignalSpy changed(&picker, &CColorPicker::colorChanged);
     const std::pair<const char*, QColor> typed[] = {
         {"redValue", QColor(7, 255, 255)}, {"greenValue", QColor(7, 7, 255)}, {"blueValue", QColor(7, 7, 7)}};
@@ -55,7 +56,7 @@ TEST_F(ColorPicker, TypedComponentsAreKeptWithin255) {
     EXPECT_EQ(picker.color(), QColor(7, 255, 0));
 }
 
-TEST_F(ColorPicker, ThePopupPicksThePixelUnderTheMouse) {
+TEST_F(CColorPickerTest, ThePopupPicksThePixelUnderTheMouse) {
     QTest::mousePress(&picker, Qt::LeftButton, {}, QPoint(8, 7)); // on the letter R
     ASSERT_TRUE(popup()->isVisible());
     EXPECT_TRUE(popup()->hasMouseTracking());

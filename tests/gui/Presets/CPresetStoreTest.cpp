@@ -1,20 +1,17 @@
+#include "GUI/Presets/CPresetStore.h"
+
 #include "GUI/Controls/CColorPicker.h"
 #include "GUI/Controls/COrvelaSliderBlockImpl.h"
 #include "GUI/Panes/CWgtPaneAdvancedImpl.h"
-#include "GUI/Presets/CBatchMode.h"
-#include "GUI/Presets/CPresetStore.h"
-#include "Platform/Keyboard.h"
 #include "Settings/SettingsStore.h"
 #include "Utility/CGenericEx.h"
 #include "gui/Panes/PaneFixture.h"
+#include "support/BoxAnswer.h"
 #include "support/BoxRecorder.h"
 #include "support/LogCapture.h"
 
-#include <QApplication>
 #include <QCheckBox>
 #include <QDir>
-#include <QMessageBox>
-#include <QTimer>
 
 #include <gtest/gtest.h>
 
@@ -22,9 +19,9 @@ using namespace orvela;
 
 namespace {
 
-class PresetStore : public testing::Test {
+class CPresetStoreTest : public testing::Test {
 protected:
-    PresetStore() {
+    CPresetStoreTest() {
         openSettings().clear();
         first->setObjectName("first");
         second->setObjectName("a/b");
@@ -34,16 +31,6 @@ protected:
     bool save(const char* name, EGUIMode mode = Mode_Advanced) {
         CPresetStore::savePreset(&pane, mode, name, saved, isNew, true);
         return saved;
-    }
-    /// Presses a button of the next message box and keeps what the box said.
-    void answer(QMessageBox::StandardButton button) {
-        QTimer::singleShot(0, qApp, [this, button] {
-            auto* shown = qobject_cast<QMessageBox*>(QApplication::activeModalWidget());
-            ASSERT_TRUE(shown && shown->button(button));
-            said = shown->windowTitle() + "|" + shown->text();
-            EXPECT_FALSE(shown->defaultButton() && shown->buttons().size() > 1);
-            shown->button(button)->click();
-        });
     }
 
     RecordingOwner pane;
@@ -58,7 +45,7 @@ protected:
     bool isNew = false;
 };
 
-TEST_F(PresetStore, LoadsWhatWasSaved) {
+TEST_F(CPresetStoreTest, LoadsWhatWasSaved) {
     first->setValue(123.4);
     second->setValue(1000);
     second->setEnabled(false);
@@ -83,7 +70,7 @@ TEST_F(PresetStore, LoadsWhatWasSaved) {
     EXPECT_FALSE(openSettings().allKeys().join(' ').contains("CheckBoxes/Checked")) << "has no name";
 }
 
-TEST_F(PresetStore, MissingPartsLeaveControlsAsTheyAre) {
+TEST_F(CPresetStoreTest, MissingPartsLeaveControlsAsTheyAre) {
     qputenv("ORVELA_DEBUG_MBOX", "1");
     ASSERT_TRUE(save("x"));
     QSettings settings = openSettings();
@@ -110,19 +97,19 @@ TEST_F(PresetStore, MissingPartsLeaveControlsAsTheyAre) {
     qunsetenv("ORVELA_DEBUG_MBOX");
 }
 
-TEST_F(PresetStore, AsksBeforeOverwriting) {
+TEST_F(CPresetStoreTest, AsksBeforeOverwriting) {
     ASSERT_TRUE(save("x") && save(CPresetStore::batchPresetName().toUtf8()));
     ASSERT_TRUE(save(CPresetStore::batchPresetName().toUtf8()) && isNew) << "never asked for";
     EXPECT_EQ(CPresetStore::listPresets(Mode_Advanced, true), QStringList("x"));
     EXPECT_EQ(CPresetStore::listPresets(Mode_Advanced, false).size(), 2);
     EXPECT_FALSE(CPresetStore::presetExists(Mode_Advanced, CPresetStore::batchPresetName()));
     first->setValue(700);
-    answer(QMessageBox::No);
+    answerBox(QMessageBox::No, said);
     EXPECT_FALSE(save("x"));
     EXPECT_EQ(said, "Warning|This preset already exists. Do you want to overwrite it?");
     const QString key = "2000/UserPresets/Advanced/x/Sliders/first/Value";
     EXPECT_EQ(openSettings().value(key).toDouble(), 0);
-    answer(QMessageBox::Yes);
+    answerBox(QMessageBox::Yes, said);
     EXPECT_TRUE(save("x") && !isNew);
     EXPECT_EQ(openSettings().value(key).toDouble(), 700);
     EXPECT_EQ(boxes([&] { EXPECT_FALSE(save("")); }), QStringList("Warning|A preset needs a name."));
@@ -131,7 +118,7 @@ TEST_F(PresetStore, AsksBeforeOverwriting) {
     EXPECT_TRUE(CPresetStore::hasPresets());
 }
 
-TEST_F(PresetStore, ReportsWhatCannotBeWritten) {
+TEST_F(CPresetStoreTest, ReportsWhatCannotBeWritten) {
     const QString path = openSettings().fileName();
     QFile::remove(path);
     ASSERT_TRUE(QDir().mkpath(path));
@@ -141,7 +128,7 @@ TEST_F(PresetStore, ReportsWhatCannotBeWritten) {
     ASSERT_TRUE(QDir().rmdir(path));
 }
 
-TEST_F(PresetStore, FactoryPresetsAreTheModesAsTheirPaneWouldSaveThem) {
+TEST_F(CPresetStoreTest, FactoryPresetsAreTheModesAsTheirPaneWouldSaveThem) {
     const auto lines = [] {
         const QSettings settings = openSettings();
         QStringList lines;
@@ -179,7 +166,7 @@ TEST_F(PresetStore, FactoryPresetsAreTheModesAsTheirPaneWouldSaveThem) {
               QStringList({"Note:|Unknown preset:portrait", "Note:|Unknown preset:13"}));
 }
 
-TEST_F(PresetStore, OneMissingFactoryPresetBringsAllBack) {
+TEST_F(CPresetStoreTest, OneMissingFactoryPresetBringsAllBack) {
     const QString key = "2000/UserPresets/Advanced/Portrait/Sliders/sldrContrast_Perc/Value";
     CPresetStore::ensureFactoryPresets(&pane);
     openSettings().setValue(key, 1);
@@ -189,25 +176,6 @@ TEST_F(PresetStore, OneMissingFactoryPresetBringsAllBack) {
     CPresetStore::ensureFactoryPresets(&pane);
     EXPECT_EQ(openSettings().value(key).toDouble(), 550);
     EXPECT_TRUE(CPresetStore::presetExists(Mode_Advanced, "AutoSaturation"));
-}
-
-TEST_F(PresetStore, ShiftSwitchesBatchModeOff) {
-    struct Started : CBatchMode {};
-    EXPECT_EQ(CBatchMode::instance().batchMode(), -1);
-    EXPECT_FALSE(CBatchMode::instance().isBatchModeEnabled());
-    CBatchMode::instance().setBatchModeEnabled(true);
-    CBatchMode::instance().setBatchMode(Mode_SmartLevels);
-    LogCapture log;
-    EXPECT_TRUE(Started().isBatchModeEnabled());
-    EXPECT_TRUE(log.has("SHIFT key state 0"));
-    Keyboard::setShiftState([] { return 128; });
-    answer(QMessageBox::Ok);
-    EXPECT_FALSE(Started().isBatchModeEnabled());
-    Keyboard::setShiftState(nullptr);
-    EXPECT_TRUE(log.has("SHIFT key state 128"));
-    EXPECT_EQ(said, "Batch Mode|Batch mode is now off.");
-    EXPECT_EQ(CBatchMode::instance().batchMode(), 32);
-    EXPECT_EQ(openSettings().value("2000/GUI/batchModeEnabled"), QVariant(false));
 }
 
 } // namespace

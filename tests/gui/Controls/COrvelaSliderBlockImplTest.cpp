@@ -25,9 +25,9 @@ namespace {
 const QString kTables = QStringLiteral(ORVELA_TEST_DATA "/slider_block/");
 
 /// A block with the scale "tenth" (0 to 100), shown in an active window with a second block below it.
-class SliderBlock : public testing::Test {
+class COrvelaSliderBlockImplTest : public testing::Test {
 protected:
-    SliderBlock() {
+    COrvelaSliderBlockImplTest() {
         auto* layout = new QVBoxLayout(&window);
         layout->addWidget(&block);
         layout->addWidget(&next);
@@ -89,29 +89,29 @@ protected:
         {"row-release", [this](Text x) { QTest::mouseRelease(&block, kLeft, {}, inRow(x)); }}};
 };
 
-void SliderBlock::setScale(const QString& what) {
+void COrvelaSliderBlockImplTest::setScale(const QString& what) {
     const QStringList words = what.split(' ');
     block.setScale(words[0] == "Shadows" ? SliderScales::Shadows : SliderScales::Temperature);
     block.setMinMax(words.at(1).toDouble(), words.at(2).toDouble());
 }
 
-void SliderBlock::select() {
+void COrvelaSliderBlockImplTest::select() {
     block.txtValue->setFocus();
     block.txtValue->selectAll();
 }
 
-void SliderBlock::doubleClick(QWidget* part) {
+void COrvelaSliderBlockImplTest::doubleClick(QWidget* part) {
     const QPoint point = part->mapTo(&window, part->rect().center());
     QTest::mouseDClick(window.windowHandle(), Qt::LeftButton, {}, point);
 }
 
-void SliderBlock::wheel(int angle) {
+void COrvelaSliderBlockImplTest::wheel(int angle) {
     QWheelEvent event({50, 3}, slider()->mapToGlobal(QPointF(50, 3)), {}, {0, angle}, Qt::NoButton, {},
                       Qt::NoScrollPhase, false);
     QCoreApplication::sendEvent(slider(), &event);
 }
 
-std::string SliderBlock::state() const {
+std::string COrvelaSliderBlockImplTest::state() const {
     const bool on = block.isEnabled();
     EXPECT_TRUE(slider()->isEnabledTo(&block) == on && block.txtValue->font().italic() != on);
     EXPECT_TRUE(block.lblName->isEnabledTo(&block));
@@ -124,9 +124,10 @@ std::string SliderBlock::state() const {
     return words.join(" | ").trimmed().toStdString();
 }
 
-class SliderBlockTable : public SliderBlock, public testing::WithParamInterface<QString> {};
+class COrvelaSliderBlockImplTable : public COrvelaSliderBlockImplTest,
+                                    public testing::WithParamInterface<QString> {};
 
-TEST_P(SliderBlockTable, TellsWhatItDoes) {
+TEST_P(COrvelaSliderBlockImplTable, TellsWhatItDoes) {
     QFile file(kTables + GetParam());
     ASSERT_TRUE(file.open(QIODevice::ReadOnly));
     for (const QString& line : QString::fromUtf8(file.readAll()).split('\n', Qt::SkipEmptyParts)) {
@@ -139,10 +140,11 @@ TEST_P(SliderBlockTable, TellsWhatItDoes) {
     }
 }
 
-INSTANTIATE_TEST_SUITE_P(All, SliderBlockTable, testing::ValuesIn(QDir(kTables).entryList(QDir::Files)),
+INSTANTIATE_TEST_SUITE_P(All, COrvelaSliderBlockImplTable,
+                         testing::ValuesIn(QDir(kTables).entryList(QDir::Files)),
                          [](const auto& file) { return file.param.chopped(4).toStdString(); });
 
-TEST_F(SliderBlock, AKeyAlwaysMovesTheShownNumber) {
+TEST_F(COrvelaSliderBlockImplTest, AKeyAlwaysMovesTheShownNumber) {
     using namespace SliderScales;
     for (const SliderScale* scale : {&Thousandth, &Gamma, &Highlights}) {
         block.setScale(*scale);
@@ -157,7 +159,7 @@ TEST_F(SliderBlock, AKeyAlwaysMovesTheShownNumber) {
     }
 }
 
-TEST_F(SliderBlock, TellsAssistiveToolsNameRoleAndValue) {
+TEST_F(COrvelaSliderBlockImplTest, TellsAssistiveToolsNameRoleAndValue) {
     block.setValue(250);
     QAccessibleInterface* access = QAccessible::queryAccessibleInterface(slider());
     ASSERT_TRUE(access && access->valueInterface());

@@ -1,3 +1,5 @@
+#include "GUI/Panes/IWgtPane.h"
+
 #include "Core/CThreadedCore.h"
 #include "GUI/Controls/CColorPicker.h"
 #include "GUI/Controls/COrvelaSliderBlockImpl.h"
@@ -9,16 +11,12 @@
 #include "Settings/ModeTable.h"
 #include "Utility/CARGBPlane.h"
 #include "Utility/CGenericEx.h"
-#include "support/BoxRecorder.h"
 #include "support/ParamsText.h"
 #include "support/SettingsMap.h"
 
-#include <QAccessible>
-#include <QComboBox>
 #include <QFile>
 #include <QRegularExpression>
 #include <QSignalSpy>
-#include <QTest>
 
 #include <gmock/gmock.h>
 
@@ -54,7 +52,7 @@ std::vector<EGUIMode> modesWithPanes() {
     return modes;
 }
 
-class Pane : public testing::TestWithParam<EGUIMode> {
+class IWgtPaneTest : public testing::TestWithParam<EGUIMode> {
 protected:
     IWgtPane* make() {
         if (GetParam() == Mode_Advanced)
@@ -78,7 +76,7 @@ protected:
     IWgtPane* pane = make();
 };
 
-void Pane::expectFirst() const {
+void IWgtPaneTest::expectFirst() const {
     for (const Control& control : controls) {
         SCOPED_TRACE(qPrintable(control.object));
         if (const CColorPicker* found = picker(control.object)) {
@@ -93,7 +91,7 @@ void Pane::expectFirst() const {
 
 // Gives every control a state of its own and expects the owner to be told of it, and those states, and
 // nothing else, among the settings.
-void Pane::expectWrites(bool odd) {
+void IWgtPaneTest::expectWrites(bool odd) {
     CUserParams params;
     for (const SliderField& field : sliderFields())
         setField(params, field.name, field.value ? 3 : odd);
@@ -127,7 +125,7 @@ void Pane::expectWrites(bool odd) {
     EXPECT_EQ(settingsOf(params.mSliderParams), settingsOf(expected.mSliderParams));
 }
 
-TEST_P(Pane, ShowsItsControlsAndWritesTheirFieldsAlone) {
+TEST_P(IWgtPaneTest, ShowsItsControlsAndWritesTheirFieldsAlone) {
     expectFirst();
     if (GetParam() != Mode_Advanced && !isSingle) { // there a preset brings factory settings, or nothing
         block(controls[0].object)->setEnabled(true);
@@ -138,7 +136,7 @@ TEST_P(Pane, ShowsItsControlsAndWritesTheirFieldsAlone) {
     expectWrites(true);
 }
 
-TEST_P(Pane, SlidersShowEveryPositionAndTellWhatTheyDo) {
+TEST_P(IWgtPaneTest, SlidersShowEveryPositionAndTellWhatTheyDo) {
     const auto sliders = PaneTable::sliders(GetParam());
     EXPECT_EQ(sliders.size() + PaneTable::colors(GetParam()).size(), controls.size());
     for (const PaneSlider& slider : sliders) {
@@ -160,7 +158,7 @@ TEST_P(Pane, SlidersShowEveryPositionAndTellWhatTheyDo) {
     }
 }
 
-TEST_P(Pane, MakesItsCoreAndLeadsOnOnceARunWasCompleted) {
+TEST_P(IWgtPaneTest, MakesItsCoreAndLeadsOnOnceARunWasCompleted) {
     const bool advanced = GetParam() == Mode_Advanced;
     const bool touch = GetParam() == Mode_FinalTouch;
     EXPECT_EQ(pane->showsPresets(), advanced);
@@ -190,102 +188,16 @@ TEST_P(Pane, MakesItsCoreAndLeadsOnOnceARunWasCompleted) {
     EXPECT_EQ(changed[0][0].value<EGUIMode>(), touch ? Mode_Advanced : Mode_FinalTouch);
 }
 
-INSTANTIATE_TEST_SUITE_P(All, Pane, testing::ValuesIn(modesWithPanes()), [](const auto& mode) {
+INSTANTIATE_TEST_SUITE_P(All, IWgtPaneTest, testing::ValuesIn(modesWithPanes()), [](const auto& mode) {
     return getModeAsString(mode.param).remove(QRegularExpression("\\W")).toStdString();
 });
 
-TEST(PaneOfAnotherMode, ReportsItOrDrivesNothing) {
-    std::unique_ptr<Shown<CWgtPane3SlidersImpl>> three;
-    CUserParams params;
-    EXPECT_EQ(boxes([&] { three = std::make_unique<Shown<CWgtPane3SlidersImpl>>(Mode_FinalTouch); }),
-              QStringList("Note:|invalid mode in CWgtPane3SlidersImpl::setSliders"));
-    EXPECT_EQ(boxes([&] { three->pane->applyGUIParams(params); }),
-              QStringList("Note:|invalid mode in CWgtPane3SlidersImpl::applyGUIParams"));
-    const Shown<CWgtPaneGenericImpl> generic(Mode_Advanced);
-    EXPECT_EQ(generic.pane->findChild<CColorPicker*>(), nullptr);
-    generic.pane->applyGUIParams(params);
-    EXPECT_TRUE(settingsOf(params.mSliderParams).empty());
-}
-
-TEST(PaneWithoutAControl, NamesWhatItsFormLacks) {
+TEST(IWgtPane, NamesTheControlThatItsFormLacks) {
     const Shown<CWgtPane3SlidersImpl> shown(Mode_SmartLevels);
     delete shown.pane->sldr2;
     CUserParams params;
     EXPECT_THAT([&] { shown.pane->applyGUIParams(params); },
                 testing::ThrowsMessage<CGenericEx>("The form of CWgtPane3SlidersImpl has no control sldr2."));
-}
-
-TEST(GenericPane, PickerShowsWhileItsSliderIsOn) {
-    Shown<CWgtPaneGenericImpl> shown(Mode_ColorFilter);
-    auto* picker = shown.pane->findChild<CColorPicker*>();
-    EXPECT_TRUE(picker->isVisible());
-    shown.pane->sldrGeneric->setEnabled(false);
-    EXPECT_FALSE(picker->isVisible());
-    shown.pane->sldrGeneric->setEnabled(true);
-    shown.pane->setSliders(QString()); // no factory preset of this pane: only the reset
-    EXPECT_FALSE(shown.pane->sldrGeneric->isEnabled());
-    EXPECT_EQ(shown.pane->sldrGeneric->value(), 500);
-}
-
-TEST(AdvancedPane, FoldsTheRarelyUsedGroupsAway) {
-    const Shown<CWgtPaneAdvancedImpl> shown(Mode_Advanced);
-    CWgtPaneAdvancedImpl* const pane = shown.pane;
-    const auto expectExtended = [pane](bool extended) {
-        for (const QWidget* part :
-             std::initializer_list<QWidget*>{pane->grpBxPerceptualAbsolute, pane->grpBxArtefacts,
-                                             pane->grpBxColor, pane->btnCollapseSettings})
-            EXPECT_EQ(part->isVisible(), extended) << qPrintable(part->objectName());
-        EXPECT_EQ(pane->btnExtendSettings->isVisible(), !extended);
-        EXPECT_TRUE(pane->sldrFade->isVisible() && pane->sldrAutoContrast->isHidden());
-    };
-    expectExtended(false);
-    QTest::mouseClick(pane->btnExtendSettings, Qt::LeftButton);
-    expectExtended(true);
-    pane->sldrColorFilter->setEnabled(true);
-    EXPECT_TRUE(pane->colrPickAutoColor->isVisible());
-    pane->sldrColorFilter->setEnabled(false);
-    EXPECT_FALSE(pane->colrPickAutoColor->isVisible());
-    QTest::mouseClick(pane->btnCollapseSettings, Qt::LeftButton);
-    expectExtended(false);
-}
-
-TEST(FinalTouchPane, ColorFiltersAndPickersMirrorEachOther) {
-    const Shown<CWgtPaneFinalTouchImpl> shown(Mode_FinalTouch);
-    CWgtPaneFinalTouchImpl* const pane = shown.pane;
-    COrvelaSliderBlockImpl* const sliders[] = {pane->sldrPercColorFilter, pane->sldrAbsColorFilter};
-    CColorPicker* const pickers[] = {pane->colrPickPercColorFilter, pane->colrPickAbsColorFilter};
-    for (const int from : {0, 1}) {
-        const int to = 1 - from;
-        pane->tabCtnrFinalTouch->setCurrentIndex(from);
-        EXPECT_FALSE(pickers[from]->isVisible());
-        sliders[from]->setEnabled(true);
-        EXPECT_TRUE(sliders[to]->isEnabled());
-        EXPECT_TRUE(pickers[from]->isVisible());
-        sliders[from]->txtValue->selectAll();
-        QTest::keyClicks(sliders[from]->txtValue, from == 0 ? "12.3" : "45.6");
-        EXPECT_EQ(sliders[from]->txtValue->text(), QLatin1String(from == 0 ? "12.3" : "45.6"));
-        EXPECT_NEAR(sliders[to]->value(), from == 0 ? 123 : 456, 1e-9);
-        CThinHorizontalSlider* thin = sliders[from]->sldrValue;
-        QTest::mouseClick(thin, Qt::LeftButton, {}, QPoint(thin->width() / 3, 3));
-        EXPECT_GT(sliders[to]->value(), 300);
-        EXPECT_EQ(sliders[to]->value(), sliders[from]->value());
-        pickers[from]->setColor(QColor(from, 20, 30));
-        EXPECT_EQ(pickers[to]->color(), QColor(from, 20, 30));
-        sliders[from]->setEnabled(false);
-        EXPECT_FALSE(sliders[to]->isEnabled() || pickers[from]->isVisible());
-        pane->setSliders(QString());
-    }
-}
-
-TEST(FinalTouchPane, NamesItsPresetAndItsTabs) {
-    const Shown<CWgtPaneFinalTouchImpl> shown(Mode_FinalTouch);
-    QComboBox list;
-    shown.pane->fillPresetList(&list);
-    ASSERT_EQ(list.count(), 1);
-    EXPECT_EQ(list.itemText(0), "Automatic");
-    EXPECT_FALSE(list.itemIcon(0).isNull());
-    QTabBar* const tabs = shown.pane->tabCtnrAbsRGB->tabBar();
-    EXPECT_EQ(QAccessible::queryAccessibleInterface(tabs)->child(3)->text(QAccessible::Name), "All channels");
 }
 
 } // namespace
