@@ -30,6 +30,46 @@ TEST(CUserParams, ModesSetTheirFieldsAndNoOthers) {
     EXPECT_EQ(settingsOf(30), (Settings{{"mColor_Value_G", 255}, {"mColor_Effect_Intensity_Enabled", 1}}));
 }
 
+TEST(CUserParams, ModesOfOneFilterDescribeTheirSlider) {
+    using P = CSliderParams;
+    using namespace SliderScales;
+    const struct {
+        float P::*field;
+        const char* label;
+        int scheme;
+        float low, high;
+        const SliderScale& scale;
+    } sliders[] = {{&P::OrvelaLevelValue, "Sharpness I", 6, 30, 71, Sharpness},
+                   {&P::OrvelaLevel3Value, "Smart Blur", 9, 0, 1, Thousandth},
+                   {&P::ClarityFilterValue, "Illumination", 7, 0, 10, Hundredth},
+                   {&P::mDigital_Flash_Value, "Digital Flash", 8, 0, 100, Tenth},
+                   {&P::SaturationValue, "Saturation", 8, 0, 10, Hundredth},
+                   {&P::Contrast2Value, "Contrast", 1, 0, 100, Tenth},
+                   {&P::Brightness2Value, "Brightness", 2, -255, 255, Brightness},
+                   {&P::PerceptualGamma, "Gamma", 12, 0.1F, 10, Gamma},
+                   {&P::SaltPepperValue, "B&W Spots", 1, 0.5F, 100, Spots},
+                   {&P::BilinearFilteringValue, "Noise", 1, 0.5F, 5, Noise},
+                   {&P::mMoire_Value, "Moire", 1, 0.1F, 10, Moire},
+                   {&P::Temperature_Value, "Temperature", 11, 2000, 10000, Temperature},
+                   {&P::mAuto_Color_Value, "AutoColor", 1, 0, 100, Tenth},
+                   {&P::mColor_Effect_Intensity_Value, "Color Filter", 11, 0, 100, Tenth}};
+    for (int number = 0; number < 34; ++number) {
+        CUserParamsPhotoshop params(static_cast<EGUIMode>(number));
+        params.reset(); // keeps it
+        const GenericSlider shown = CUserParamsPhotoshop(params).mGenericSlider;
+        if (number < Mode_SmartSharpness || number > Mode_ColorFilter) {
+            EXPECT_TRUE(shown.field == nullptr && shown.label.isEmpty()) << number;
+            continue;
+        }
+        const auto& [field, label, scheme, low, high, scale] = sliders[number - Mode_SmartSharpness];
+        EXPECT_TRUE(shown.field == field && shown.scale == &scale) << number;
+        EXPECT_EQ(shown.label, label);
+        EXPECT_EQ(shown.scheme, scheme) << label;
+        EXPECT_EQ(shown.low, low) << label;
+        EXPECT_EQ(shown.high, high) << label;
+    }
+}
+
 TEST(CUserParams, UnknownModesAreReportedOnlyWhenDebugBoxesAreOn) {
     const auto askForUnknown = [] {
         EXPECT_EQ(getModeAsString(static_cast<EGUIMode>(31)), "");

@@ -7,6 +7,7 @@
 #include "GUI/Panes/CWgtPaneAdvancedImpl.h"
 #include "GUI/Panes/CWgtPaneFinalTouchImpl.h"
 #include "GUI/Panes/CWgtPaneGenericImpl.h"
+#include "GUI/Panes/TrackZones.h"
 #include "PaneFixture.h"
 #include "Settings/ModeTable.h"
 #include "Utility/CARGBPlane.h"
@@ -30,6 +31,7 @@ struct Control {
     QString first; ///< what it shows before anything was set
     QString position;
     QString enabled;
+    QString zones; ///< number of its set of track colours
 };
 
 std::vector<Control> controlsOf(EGUIMode mode) {
@@ -39,7 +41,7 @@ std::vector<Control> controlsOf(EGUIMode mode) {
     for (const QString& line : QString::fromUtf8(file.readAll()).split('\n')) {
         const QStringList parts = line.split(QStringLiteral(" | "));
         if (parts[0] == getModeAsString(mode))
-            controls.push_back({parts.at(1), parts.at(2), parts.at(3), parts.at(4)});
+            controls.push_back({parts.at(1), parts.at(2), parts.at(3), parts.at(4), parts.at(5)});
     }
     return controls;
 }
@@ -86,6 +88,8 @@ void IWgtPaneTest::expectFirst() const {
         ASSERT_TRUE(block(control.object));
         EXPECT_EQ(block(control.object)->txtValue->text(), control.first);
         EXPECT_EQ(block(control.object)->isEnabled(), isSingle);
+        EXPECT_EQ(block(control.object)->zoneStops(),
+                  TrackZones::set(static_cast<ZoneSet>(control.zones.toInt())));
     }
 }
 
@@ -101,7 +105,7 @@ void IWgtPaneTest::expectWrites(bool odd) {
             setField(expected, field, value);
     };
     double position = odd ? 4 : -11;
-    for (const auto& [object, first, value, enabled] : controls) {
+    for (const auto& [object, first, value, enabled, zones] : controls) {
         if (CColorPicker* found = picker(object)) {
             const QColor color(9, odd ? 80 : 12, 200);
             found->setColor(color);
