@@ -4,8 +4,6 @@
 #include "Settings/CUserParams.h"
 #include "support/TestPlanes.h"
 
-#include <gtest/gtest.h>
-
 #include <map>
 #include <stdexcept>
 #include <string>

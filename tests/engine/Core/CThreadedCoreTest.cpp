@@ -182,7 +182,6 @@ template <typename Core>
 std::vector<std::uint8_t> runWith(int threads, int width, int height, const CUserParamsPhotoshop& params) {
     RowScheduler scheduler(threads);
     Session<Core> session(testplanes::noise(width, height, static_cast<std::uint32_t>(width)), Mode_Advanced);
-    session.core.setProxy(&session.proxy);
     session.core.setParams(params);
     session.onStep = [](const QString&) { Log::log(LogLevel::Debug, "a step"); };
     scheduler.execute([&] { session.core.run(); });

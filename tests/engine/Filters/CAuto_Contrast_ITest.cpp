@@ -2,6 +2,8 @@
 #include "support/ParamsText.h"
 #include "support/TaskSettings.h"
 
+#include <gtest/gtest.h>
+
 using namespace orvela;
 
 // Both filters that fade toward the host's pixel: CAuto_Contrast_I and CDigital_Flash_Perceptual.

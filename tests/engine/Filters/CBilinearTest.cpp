@@ -4,6 +4,8 @@
 #include "support/ParamsText.h"
 #include "support/TaskSettings.h"
 
+#include <gtest/gtest.h>
+
 using namespace orvela;
 
 TEST(CBilinear, MissingMemoryForEitherTableEndsTheFilter) {

@@ -1,5 +1,6 @@
 #include "ProgramRun.h"
 #include "common/PhotographWriter.h"
+#include "hosts/TestPhotograph.h"
 
 #include <pty.h>
 #include <signal.h>
@@ -35,12 +36,8 @@ class LongRunTest : public ProgramTest {
 protected:
     // A picture that takes seconds.
     void largePicture(const char* name) const {
-        Photograph photograph;
-        photograph.width = 5000;
-        photograph.height = 4000;
-        photograph.samples.resize(60'000'000);
-        for (std::size_t i = 0; i < photograph.samples.size(); ++i)
-            photograph.samples[i] = static_cast<std::uint8_t>(i * 2654435761U >> 13);
+        const Photograph photograph = testPhotograph(ColorModel::Rgb, 8, 5000, 4000,
+                                                     [](std::size_t i) { return i * 2654435761U >> 13; });
         WriteOptions options;
         options.compression = "none";
         writePhotograph(photograph, path(name).toStdString(), options);

@@ -1,5 +1,7 @@
 #include "common/ImageHost.h"
 
+#include "hosts/TestPhotograph.h"
+
 #include <gtest/gtest.h>
 
 #include <cstdlib>
@@ -8,16 +10,8 @@ using namespace orvela;
 
 namespace {
 
-Photograph counting(ColorModel model, int depth, int width, int height) {
-    Photograph photograph;
-    photograph.width = width;
-    photograph.height = height;
-    photograph.depth = depth;
-    photograph.model = model;
-    photograph.samples.resize(static_cast<std::size_t>(width * height * samplesPerPixel(model) * depth / 8));
-    for (std::size_t i = 0; i < photograph.samples.size(); ++i)
-        photograph.samples[i] = static_cast<std::uint8_t>(i);
-    return photograph;
+Photograph counting(ColorModel model, int width, int height) {
+    return testPhotograph(model, 8, width, height, [](std::size_t i) { return i; });
 }
 
 TEST(ImageHost, MapsEndsToEndsAndLosesAtMostOne) {
@@ -33,7 +27,7 @@ TEST(ImageHost, MapsEndsToEndsAndLosesAtMostOne) {
 
 // A 4 x 3 RGB picture counts its samples: pixel (x, y) plane p holds 3 * (4 * y + x) + p.
 TEST(ImageHost, AnswersRequestsOverPartsOfTheImage) {
-    ImageHost host(counting(ColorModel::Rgb, 8, 4, 3));
+    ImageHost host(counting(ColorModel::Rgb, 4, 3));
     host::FilterRecord& record = host.record();
     record.inRect = {1, 2, 3, 4};
     record.inLoPlane = 1;
@@ -63,7 +57,7 @@ TEST(ImageHost, AnswersRequestsOverPartsOfTheImage) {
 }
 
 TEST(ImageHost, RefusesRequestsOutsideTheImage) {
-    ImageHost host(counting(ColorModel::GreyAlpha, 8, 4, 3));
+    ImageHost host(counting(ColorModel::GreyAlpha, 4, 3));
     host::FilterRecord& record = host.record();
     EXPECT_EQ(record.planes, 1);
     const host::Rect inside = record.filterRect;
@@ -83,9 +77,9 @@ TEST(ImageHost, RefusesRequestsOutsideTheImage) {
 
 // That it fails on demand is seen by the picture session's tests.
 TEST(ImageHost, AnswersForTheYoungest) {
-    ImageHost host(counting(ColorModel::Rgb, 8, 4, 3));
+    ImageHost host(counting(ColorModel::Rgb, 4, 3));
     {
-        ImageHost younger(counting(ColorModel::Grey, 8, 1, 1));
+        ImageHost younger(counting(ColorModel::Grey, 1, 1));
         younger.onAbort = [] { return true; };
         EXPECT_EQ(host.record().abortProc(), 1);
     }

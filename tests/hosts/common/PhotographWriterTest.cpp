@@ -3,6 +3,7 @@
 #include "common/PhotographReader.h"
 #include "common/TargetFile.h"
 #include "hosts/TestFiles.h"
+#include "hosts/TestPhotograph.h"
 
 #include <gmock/gmock.h>
 #include <sys/mount.h>
@@ -19,15 +20,8 @@ namespace fs = std::filesystem;
 using testing::HasSubstr;
 
 Photograph plain(ColorModel model, int depth = 8, int width = 40, int height = 30) {
-    Photograph photograph;
-    photograph.width = width;
-    photograph.height = height;
-    photograph.depth = depth;
-    photograph.model = model;
-    photograph.samples.resize(static_cast<std::size_t>(width * height * samplesPerPixel(model) * depth / 8));
-    for (std::size_t i = 0; i < photograph.samples.size(); ++i)
-        photograph.samples[i] = static_cast<std::uint8_t>(i * i % 251); // hardly compressible
-    return photograph;
+    const auto hardlyCompressible = [](std::size_t i) { return i * i % 251; };
+    return testPhotograph(model, depth, width, height, hardlyCompressible);
 }
 
 template <typename Error>

@@ -6,6 +6,7 @@
 
 #include <cmath>
 #include <map>
+#include <memory>
 #include <ostream>
 
 using namespace orvela;
@@ -41,7 +42,18 @@ void PrintTo(const Case& c, std::ostream* out) {
     *out << c.make << " -> " << c.target;
 }
 
-class RoundTrip : public testing::TestWithParam<Case> {};
+class RoundTrip : public testing::TestWithParam<Case> {
+protected:
+    static void SetUpTestSuite() {
+        pictures = std::make_unique<TestFolder>();
+        pictures->run("convert $S/coffee.png -resize 61x47! -depth 8 -define png:color-type=2 p8.png");
+        pictures->run(
+            "convert $S/coffee.png -depth 16 -resize 61x47! -level 1%,97% -define png:bit-depth=16 p16.png");
+    }
+    static void TearDownTestSuite() { pictures.reset(); }
+
+    static inline std::unique_ptr<TestFolder> pictures; ///< what every case's source is made from
+};
 
 std::vector<int> decoded(const TestFolder& folder, const std::string& file, const Case& c) {
     const std::string depth = std::to_string(c.depth);
@@ -90,17 +102,9 @@ constexpr char kList[] =
 
 TEST_P(RoundTrip, KeepsPixelsAndMetadata) {
     const Case& c = GetParam();
-    static const TestFolder pictures;
-    static const bool made = [] {
-        pictures.run("convert $S/coffee.png -resize 61x47! -depth 8 -define png:color-type=2 p8.png");
-        pictures.run(
-            "convert $S/coffee.png -depth 16 -resize 61x47! -level 1%,97% -define png:bit-depth=16 p16.png");
-        return true;
-    }();
-    ASSERT_TRUE(made);
     const TestFolder folder;
-    std::filesystem::copy(pictures / "p8.png", folder / "p8.png");
-    std::filesystem::copy(pictures / "p16.png", folder / "p16.png");
+    std::filesystem::copy(*pictures / "p8.png", folder / "p8.png");
+    std::filesystem::copy(*pictures / "p16.png", folder / "p16.png");
     folder.run(c.make);
     const std::string& source = c.source;
     const std::string& target = c.target;
