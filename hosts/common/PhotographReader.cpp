@@ -3,12 +3,14 @@
 #include "common/EncodingProbe.h"
 #include "common/Metadata.h"
 #include "common/PsdFile.h"
+#include "common/Refusal.h"
 #include "common/Vips.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <cerrno>
 #include <cstring>
 #include <system_error>
@@ -18,12 +20,6 @@ namespace orvela {
 namespace {
 
 namespace fs = std::filesystem;
-
-[[noreturn]] void refuse(const fs::path& path, const std::string& cause, const std::string& advice) {
-    throw PhotographError(path.string() + ": " + cause + "; " + advice);
-}
-
-constexpr char kCopyAgain[] = "copy it again from the camera or a backup";
 
 /// A file opened for reading, closed at the end.
 class OpenFile {

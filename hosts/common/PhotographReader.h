@@ -14,7 +14,4 @@ namespace orvela {
 /// @throws std::bad_alloc when the memory does not suffice
 Photograph readPhotograph(const std::filesystem::path& path);
 
-/// Number of threads that decoding and encoding may use; 1 at the start.
-void setPhotographThreads(int threads);
-
 } // namespace orvela

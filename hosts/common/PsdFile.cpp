@@ -1,7 +1,8 @@
 #include "common/PsdFile.h"
 
+#include "common/Refusal.h"
+
 #include <algorithm>
-#include <limits>
 
 namespace orvela {
 
@@ -12,10 +13,6 @@ namespace fs = std::filesystem;
 enum Mode { Bitmap = 0, Gray = 1, Indexed = 2, RGB = 3, CMYK = 4 };
 enum Resource { ResolutionInfo = 1005, IccProfile = 1039, VersionInfo = 1057 };
 
-[[noreturn]] void refuse(const fs::path& path, const std::string& cause, const std::string& advice) {
-    throw PhotographError(path.string() + ": " + cause + "; " + advice);
-}
-
 /// Big-endian numbers and byte runs, from the start of a file to its end.
 class Cursor {
 public:
@@ -23,7 +20,7 @@ public:
 
     ByteView take(std::size_t count) {
         if (count > mBytes.size())
-            refuse(mPath, "the file is cut short", "copy it again from the camera or a backup");
+            refuse(mPath, "the file is cut short", kCopyAgain);
         const ByteView taken = mBytes.first(count);
         mBytes = mBytes.subspan(count);
         return taken;
@@ -74,7 +71,7 @@ Header readHeader(Cursor& cursor, const fs::path& path) {
         refuse(path, "has more channels than colour and one transparency", "save it without extra channels");
     const int least = header.mode == Bitmap ? 1 : 8;
     if (header.channels < colors || (header.depth != least && (header.depth != 16 || least == 1)))
-        refuse(path, "has a damaged header", "copy it again from the camera or a backup");
+        refuse(path, "has a damaged header", kCopyAgain);
     return header;
 }
 
@@ -119,7 +116,7 @@ void unpackRow(Cursor packed, std::uint8_t* row, std::size_t size, const fs::pat
         at += count;
     }
     if (at < size)
-        refuse(path, "holds a damaged row", "copy it again from the camera or a backup");
+        refuse(path, "holds a damaged row", kCopyAgain);
 }
 
 // All rows of the first channel, then all of the second and so on, without packing.
@@ -182,19 +179,12 @@ ColorModel modelOf(const Header& header) {
 
 } // namespace
 
-void checkEdges(std::int64_t width, std::int64_t height, const fs::path& path) {
-    if (width < 1 || height < 1)
-        refuse(path, "has no pixels", "copy it again from the camera or a backup");
-    if (std::max(width, height) > std::numeric_limits<std::int16_t>::max())
-        refuse(path, "is over 32767 pixels wide or high", "scale it down or cut it into parts");
-}
-
 Photograph readPsd(ByteView file, const fs::path& path) {
     Cursor cursor(file, path);
     const Header header = readHeader(cursor, path);
     const ByteView palette = cursor.block();
     if (header.mode == Indexed && palette.size() < 768)
-        refuse(path, "has a damaged palette", "copy it again from the camera or a backup");
+        refuse(path, "has a damaged palette", kCopyAgain);
     Photograph photograph;
     photograph.source = path;
     photograph.width = static_cast<int>(header.width);

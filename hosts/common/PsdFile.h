@@ -11,8 +11,4 @@ namespace orvela {
 /// @throws PhotographError for files that are cut short or hold another kind of picture
 Photograph readPsd(ByteView file, const std::filesystem::path& path);
 
-/// Refuses pictures without pixels and pictures whose edges the filter record cannot express.
-/// @throws PhotographError
-void checkEdges(std::int64_t width, std::int64_t height, const std::filesystem::path& path);
-
 } // namespace orvela

@@ -1,7 +1,6 @@
 #include "common/Vips.h"
 
 #include "common/Photograph.h"
-#include "common/PhotographReader.h"
 
 #include <algorithm>
 
@@ -37,11 +36,6 @@ std::string takeVipsError() {
         line.pop_back();
     std::replace(line.begin(), line.end(), '\n', ',');
     return line.empty() ? "unknown cause" : line;
-}
-
-void setPhotographThreads(int threads) {
-    startVips();
-    vips_concurrency_set(threads);
 }
 
 } // namespace orvela

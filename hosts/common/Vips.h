@@ -14,7 +14,8 @@ struct VipsRelease {
 /// A libvips image that releases its reference.
 using VipsHandle = std::unique_ptr<VipsImage, VipsRelease>;
 
-/// Starts libvips once, without its operation cache and with its warnings silenced: failures are exceptions.
+/// Starts libvips once, with one thread, without its operation cache and with its warnings silenced: failures
+/// are exceptions.
 /// @throws PhotographError when it cannot start
 void startVips();
 
