@@ -2,9 +2,9 @@
 
 #include "common/FileFormat.h"
 
-namespace orvela {
+// What the bytes of a file tell about its encoding beyond what the decoder reports.
 
-/// What the bytes of a file tell about its encoding beyond what the decoder reports.
+namespace orvela {
 
 /// Quality, chroma sampling and progression of a JPEG. The quality is the one whose scaled standard luminance
 /// table is nearest to the file's: exact for files that were written with scaled standard tables.

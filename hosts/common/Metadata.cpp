@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <array>
 #include <map>
+#include <regex>
 #include <set>
 
 namespace orvela {
@@ -66,6 +67,12 @@ bool isWellFormed(const std::string& packet) {
     } catch (const std::exception&) {
         return false;
     }
+}
+
+void makeUpright(Tags& tags) {
+    setIfPresent(tags.exif, "Exif.Image.Orientation", std::uint16_t{1});
+    static const std::regex property("(tiff:Orientation(?:=[\"']|>))[2-8]");
+    tags.xmp = std::regex_replace(tags.xmp, property, "$011");
 }
 
 // The tags that belong into a target of that format.
@@ -186,6 +193,19 @@ Warnings compare(const Tags& wanted, const Bytes& encoded, FileFormat target) {
 }
 
 } // namespace
+
+std::shared_ptr<const Metadata> readMetadata(ByteView file, FileFormat format) {
+    const auto metadata = std::make_shared<Metadata>();
+    metadata->format = format;
+    try {
+        metadata->tags = readTags(file, format);
+        if (format == FileFormat::Heif)
+            makeUpright(metadata->tags);
+    } catch (const std::exception&) {
+        metadata->failure = std::current_exception();
+    }
+    return metadata;
+}
 
 MetadataBlocks metadataBlocks(const Photograph& photograph) {
     MetadataBlocks blocks;

@@ -3,7 +3,6 @@
 #include "common/HeifMetadata.h"
 
 #include <mutex>
-#include <regex>
 
 namespace orvela {
 
@@ -50,12 +49,6 @@ Tags tagsOf(const MetadataBlocks& blocks) {
     return tags;
 }
 
-void makeUpright(Tags& tags) {
-    setIfPresent(tags.exif, "Exif.Image.Orientation", std::uint16_t{1});
-    static const std::regex property("(tiff:Orientation(?:=[\"']|>))[2-8]");
-    tags.xmp = std::regex_replace(tags.xmp, property, "$011");
-}
-
 } // namespace
 
 std::unique_ptr<Exiv2::Image> openImage(ByteView file) {
@@ -73,19 +66,6 @@ Tags readTags(ByteView file, FileFormat format) {
     const auto image = openImage(file);
     image->readMetadata();
     return {image->exifData(), image->iptcData(), packetOf(*image), image->comment()};
-}
-
-std::shared_ptr<const Metadata> readMetadata(ByteView file, FileFormat format) {
-    const auto metadata = std::make_shared<Metadata>();
-    metadata->format = format;
-    try {
-        metadata->tags = readTags(file, format);
-        if (format == FileFormat::Heif)
-            makeUpright(metadata->tags);
-    } catch (const std::exception&) {
-        metadata->failure = std::current_exception();
-    }
-    return metadata;
 }
 
 } // namespace orvela
