@@ -8,6 +8,9 @@ namespace Keyboard {
 /// The high byte of the SHIFT key's state: not 0 while the key is held.
 int shiftState();
 
+/// The same as the system tells it; each has its own source.
+int systemShiftState();
+
 /// Has shiftState() answer what `answer` does, for a test; null asks the system again.
 void setShiftState(int (*answer)());
 
