@@ -7,18 +7,14 @@
 
 #include <QCoreApplication>
 
-#include <algorithm>
-
 namespace orvela {
 
 namespace {
 
-constexpr EGUIMode kModes[] = {Mode_Automatic,  Mode_AutomaticPro, Mode_Portrait,  Mode_PortraitPro,
-                               Mode_Landscape,  Mode_LandscapePro, Mode_Macro,     Mode_MacroPro,
-                               Mode_AutoLevels, Mode_AutoContrast, Mode_AutoColor, Mode_AutoSaturation};
-
-QString nameOf(EGUIMode mode) {
-    return QString::fromLatin1(ModeTable::find(mode)->presetName);
+// Null for a mode without a factory preset.
+const char* nameOf(EGUIMode mode) {
+    const ModeDescription* description = ModeTable::find(mode);
+    return description ? description->presetName : nullptr;
 }
 
 void note(const QString& text) {
@@ -31,13 +27,14 @@ void note(const QString& text) {
 namespace FactoryPresets {
 
 bool isFactoryMode(EGUIMode mode) {
-    return std::find(std::begin(kModes), std::end(kModes), mode) != std::end(kModes);
+    return nameOf(mode) != nullptr;
 }
 
 QStringList names() {
     QStringList names;
-    for (const EGUIMode mode : kModes)
-        names.append(nameOf(mode));
+    for (const ModeDescription& mode : ModeTable::all())
+        if (mode.presetName)
+            names.append(QString::fromLatin1(mode.presetName));
     return names;
 }
 
@@ -55,16 +52,16 @@ PresetContent contentOf(const QString& name) {
 }
 
 EGUIMode factoryPresetMode(const QString& name) {
-    for (const EGUIMode mode : kModes)
-        if (name == nameOf(mode))
-            return mode;
+    for (const ModeDescription& mode : ModeTable::all())
+        if (mode.presetName && name == QLatin1String(mode.presetName))
+            return mode.mode;
     note(QCoreApplication::translate("CPresetStore", "Unknown preset:") + name);
     return Mode_Portrait;
 }
 
 QString factoryPresetName(EGUIMode mode) {
-    if (isFactoryMode(mode))
-        return nameOf(mode);
+    if (const char* name = nameOf(mode))
+        return QString::fromLatin1(name);
     note(QCoreApplication::translate("CPresetStore", "Unknown preset:%1").arg(static_cast<int>(mode)));
     return QString(QChar(0xFFFF));
 }

@@ -11,7 +11,7 @@ namespace FactoryPresets {
 /// True for the automatic modes, 0 to 11.
 bool isFactoryMode(EGUIMode mode);
 
-/// The names in the order in which the presets are written.
+/// The names, in the order of their modes.
 QStringList names();
 
 /// True for exactly one of the twelve names.

@@ -14,16 +14,16 @@ enum class SettingStage { Main, FinalTouch };
 
 /// The sets of track colours that tell mild from strong and extreme positions.
 enum class ZoneSet : std::int32_t {
-    Standard = 1,          ///< mild, from 600 on strong, from 900 on extreme
+    Standard = 1,          ///< mild, then strong, then extreme
     CentredWide = 2,       ///< mild in the middle and far above it
     NeutralLight = 3,      ///< one light colour
     Neutral = 4,           ///< one colour
     CentredFinal = 5,      ///< mild in the middle and above it
-    Sharpness = 6,         ///< mild, from 695 on strong, from 865 on extreme
-    Illumination = 7,      ///< mild, from 750 on strong
-    Strength = 8,          ///< mild, from 700 on strong
-    Blur = 9,              ///< mild, from 300 on strong, from 500 on extreme
-    Fade = 10,             ///< extreme, from 350 on strong, from 500 on mild
+    Sharpness = 6,         ///< as Standard, strong later
+    Illumination = 7,      ///< mild, then strong
+    Strength = 8,          ///< as Illumination, strong earlier
+    Blur = 9,              ///< as Standard, strong early
+    Fade = 10,             ///< extreme, then strong, then mild
     NeutralSingle = 11,    ///< as Neutral, in the modes with one slider
     CentredGamma = 12,     ///< mild in the middle
     CentredFinalPale = 13, ///< as CentredFinal, strong ones paler
