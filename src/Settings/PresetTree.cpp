@@ -52,9 +52,8 @@ double numberOf(const QVariant& value) {
     return std::isfinite(number) ? number : 0;
 }
 
-// A text of one decimal may stand for a position a little beyond the ends; no control bears more.
 double positionOf(const QVariant& value) {
-    return std::clamp(numberOf(value), -1.0, 1001.0);
+    return std::clamp(numberOf(value), 0.0, 1000.0);
 }
 
 int channelOf(const QVariant& value) {

@@ -72,12 +72,14 @@ TEST_F(PresetTreeTest, GarbageReadsAsZeroAndOff) {
             settings.setValue(key, value);
         settings.setValue("ColorPickers/c/Green", 1e99);
         settings.setValue("Sliders/far/Value", "1e300");
+        settings.setValue("Sliders/low/Value", -0.5);
         settings.sync();
         const auto stored = PresetTree::read(Mode_Advanced, QStringLiteral("x"));
-        ASSERT_TRUE(stored && stored->sliders.size() == 2);
-        EXPECT_EQ(stored->sliders[0].value, 1001);
+        ASSERT_TRUE(stored && stored->sliders.size() == 3);
+        EXPECT_EQ(stored->sliders[0].value, 1000);
         EXPECT_EQ(stored->sliders[1].value, 0);
-        EXPECT_FALSE(stored->sliders[1].enabled || stored->checkBoxes[0].checked);
+        EXPECT_EQ(stored->sliders[2].value, 0);
+        EXPECT_FALSE(stored->sliders[2].enabled || stored->checkBoxes[0].checked);
         EXPECT_EQ(stored->colors[0].red, 0);
         EXPECT_EQ(stored->colors[0].green, 255);
     }
