@@ -8,7 +8,6 @@ namespace orvela {
 /// Our own model of the filter record that a host of the publicly documented filter interface hands the
 /// module, with the types around it. Packed to 4, as on 32-bit and 64-bit hosts alike: never bind a reference
 /// to a pointer member.
-
 namespace host {
 
 using Boolean = std::uint8_t;
