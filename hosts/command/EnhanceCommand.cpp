@@ -7,9 +7,9 @@
 #include "command/PresetTargets.h"
 #include "command/ProgressLine.h"
 #include "command/Sources.h"
-#include "common/PhotographReader.h"
-#include "common/PhotographWriter.h"
-#include "common/TargetFile.h"
+#include "files/PhotographReader.h"
+#include "files/PhotographWriter.h"
+#include "files/TargetFile.h"
 
 #include <algorithm>
 #include <iostream>

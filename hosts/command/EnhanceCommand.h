@@ -4,7 +4,7 @@
 #include "command/SettingOptions.h"
 #include "command/StopSignals.h"
 #include "command/Targets.h"
-#include "common/PhotographWriter.h"
+#include "files/PhotographWriter.h"
 
 #include <optional>
 #include <string>

@@ -3,7 +3,7 @@
 #include "command/ProgressLine.h"
 #include "command/SettingOptions.h"
 #include "command/StopSignals.h"
-#include "common/Photograph.h"
+#include "files/Photograph.h"
 
 #include <filesystem>
 #include <optional>

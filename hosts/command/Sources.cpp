@@ -1,7 +1,7 @@
 #include "command/Sources.h"
 
 #include "command/Targets.h"
-#include "common/FileFormat.h"
+#include "files/FileFormat.h"
 
 #include <glob.h>
 

@@ -1,7 +1,7 @@
 #include "command/Targets.h"
 
 #include "command/ExitStatus.h"
-#include "common/FileFormat.h"
+#include "files/FileFormat.h"
 
 #include <sys/stat.h>
 

@@ -1,6 +1,6 @@
 #include "command/TraceFolder.h"
 
-#include "common/PhotographWriter.h"
+#include "files/PhotographWriter.h"
 
 #include <cstdio>
 #include <cstring>

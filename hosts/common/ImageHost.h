@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Platform/FilterRecord.h"
-#include "common/Photograph.h"
+#include "files/Photograph.h"
 
 #include <algorithm>
 #include <array>

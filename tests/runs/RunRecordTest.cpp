@@ -6,7 +6,7 @@
 #include "PluginEntry/CARGBPlanePhotoshop.h"
 #include "Settings/ModeTable.h"
 #include "common/ImageHost.h"
-#include "common/PhotographReader.h"
+#include "files/PhotographReader.h"
 #include "support/TestPlanes.h"
 
 #include <QCryptographicHash>

@@ -1,5 +1,5 @@
 #include "ProgramRun.h"
-#include "common/PhotographWriter.h"
+#include "files/PhotographWriter.h"
 #include "hosts/TestPhotograph.h"
 
 #include <pty.h>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "common/FileFormat.h"
+#include "files/FileFormat.h"
 
 // What the bytes of a file tell about its encoding beyond what the decoder reports.
 

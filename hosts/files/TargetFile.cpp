@@ -1,4 +1,4 @@
-#include "common/TargetFile.h"
+#include "files/TargetFile.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>

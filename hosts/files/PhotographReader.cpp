@@ -1,10 +1,10 @@
-#include "common/PhotographReader.h"
+#include "files/PhotographReader.h"
 
-#include "common/EncodingProbe.h"
-#include "common/Metadata.h"
-#include "common/PsdFile.h"
-#include "common/Refusal.h"
-#include "common/Vips.h"
+#include "files/EncodingProbe.h"
+#include "files/Metadata.h"
+#include "files/PsdFile.h"
+#include "files/Refusal.h"
+#include "files/Vips.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>

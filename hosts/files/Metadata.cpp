@@ -1,7 +1,7 @@
-#include "common/Metadata.h"
+#include "files/Metadata.h"
 
-#include "common/MetadataTags.h"
-#include "common/TiffDirectory.h"
+#include "files/MetadataTags.h"
+#include "files/TiffDirectory.h"
 
 #include <algorithm>
 #include <array>

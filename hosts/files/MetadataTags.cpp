@@ -1,6 +1,6 @@
-#include "common/MetadataTags.h"
+#include "files/MetadataTags.h"
 
-#include "common/HeifMetadata.h"
+#include "files/HeifMetadata.h"
 
 #include <mutex>
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "common/Photograph.h"
+#include "files/Photograph.h"
 
 namespace orvela {
 

@@ -1,7 +1,7 @@
-#include "common/Metadata.h"
+#include "files/Metadata.h"
 
-#include "common/PhotographReader.h"
-#include "common/PhotographWriter.h"
+#include "files/PhotographReader.h"
+#include "files/PhotographWriter.h"
 #include "hosts/TestFiles.h"
 
 #include <gmock/gmock.h>

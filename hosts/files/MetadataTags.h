@@ -1,6 +1,6 @@
 #pragma once
 
-#include "common/Metadata.h"
+#include "files/Metadata.h"
 
 #include <exception>
 #include <exiv2/exiv2.hpp>

@@ -1,4 +1,4 @@
-#include "common/EncodingProbe.h"
+#include "files/EncodingProbe.h"
 
 #include <algorithm>
 #include <array>

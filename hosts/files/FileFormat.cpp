@@ -1,4 +1,4 @@
-#include "common/FileFormat.h"
+#include "files/FileFormat.h"
 
 #include <algorithm>
 #include <array>

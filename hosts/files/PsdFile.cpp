@@ -1,6 +1,6 @@
-#include "common/PsdFile.h"
+#include "files/PsdFile.h"
 
-#include "common/Refusal.h"
+#include "files/Refusal.h"
 
 #include <algorithm>
 

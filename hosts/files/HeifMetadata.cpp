@@ -1,6 +1,6 @@
-#include "common/HeifMetadata.h"
+#include "files/HeifMetadata.h"
 
-#include "common/Vips.h"
+#include "files/Vips.h"
 
 #include <algorithm>
 #include <array>

@@ -1,6 +1,6 @@
-#include "common/Vips.h"
+#include "files/Vips.h"
 
-#include "common/Photograph.h"
+#include "files/Photograph.h"
 
 #include <algorithm>
 

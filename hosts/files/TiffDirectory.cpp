@@ -1,4 +1,4 @@
-#include "common/TiffDirectory.h"
+#include "files/TiffDirectory.h"
 
 #include <algorithm>
 #include <map>

@@ -1,4 +1,4 @@
-#include "common/PhotographReader.h"
+#include "files/PhotographReader.h"
 
 #include "hosts/TestFiles.h"
 

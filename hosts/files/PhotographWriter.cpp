@@ -1,8 +1,8 @@
-#include "common/PhotographWriter.h"
+#include "files/PhotographWriter.h"
 
-#include "common/Metadata.h"
-#include "common/PhotographEncoder.h"
-#include "common/TargetFile.h"
+#include "files/Metadata.h"
+#include "files/PhotographEncoder.h"
+#include "files/TargetFile.h"
 
 namespace orvela {
 

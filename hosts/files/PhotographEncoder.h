@@ -1,6 +1,6 @@
 #pragma once
 
-#include "common/PhotographWriter.h"
+#include "files/PhotographWriter.h"
 
 namespace orvela {
 

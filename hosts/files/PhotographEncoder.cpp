@@ -1,7 +1,7 @@
-#include "common/PhotographEncoder.h"
+#include "files/PhotographEncoder.h"
 
-#include "common/Metadata.h"
-#include "common/Vips.h"
+#include "files/Metadata.h"
+#include "files/Vips.h"
 
 namespace orvela {
 

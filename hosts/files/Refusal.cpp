@@ -1,6 +1,6 @@
-#include "common/Refusal.h"
+#include "files/Refusal.h"
 
-#include "common/Photograph.h"
+#include "files/Photograph.h"
 
 #include <algorithm>
 #include <limits>

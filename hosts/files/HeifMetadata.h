@@ -1,6 +1,6 @@
 #pragma once
 
-#include "common/Metadata.h"
+#include "files/Metadata.h"
 
 namespace orvela {
 

@@ -1,7 +1,7 @@
-#include "common/PhotographWriter.h"
+#include "files/PhotographWriter.h"
 
-#include "common/PhotographReader.h"
-#include "common/TargetFile.h"
+#include "files/PhotographReader.h"
+#include "files/TargetFile.h"
 #include "hosts/TestFiles.h"
 #include "hosts/TestPhotograph.h"
 

@@ -1,7 +1,7 @@
 #include "PluginEntry/CARGBPlanePhotoshop.h"
 #include "common/ImageHost.h"
-#include "common/PhotographReader.h"
-#include "common/PhotographWriter.h"
+#include "files/PhotographReader.h"
+#include "files/PhotographWriter.h"
 #include "hosts/TestFiles.h"
 
 #include <cmath>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "common/FileFormat.h"
+#include "files/FileFormat.h"
 
 #include <atomic>
 #include <optional>
