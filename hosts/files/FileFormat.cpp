@@ -79,24 +79,6 @@ std::optional<FileFormat> formatOfExtension(const std::filesystem::path& path) {
     return std::nullopt;
 }
 
-const char* formatName(FileFormat format) {
-    switch (format) {
-    case FileFormat::Jpeg:
-        return "JPEG";
-    case FileFormat::Png:
-        return "PNG";
-    case FileFormat::Tiff:
-        return "TIFF";
-    case FileFormat::WebP:
-        return "WebP";
-    case FileFormat::Psd:
-        return "PSD";
-    case FileFormat::Heif:
-        return "HEIF";
-    }
-    return "";
-}
-
 std::string pixelName(ColorModel model, int depth) {
     constexpr std::array names = {"grey", "grey with transparency", "RGB", "RGB with transparency", "CMYK"};
     return std::to_string(depth) + "-bit " + names[static_cast<std::size_t>(model)];

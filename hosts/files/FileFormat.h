@@ -3,23 +3,15 @@
 #include "files/Photograph.h"
 
 #include <optional>
-#include <span>
 #include <string>
 
 namespace orvela {
-
-/// Bytes of a file in memory.
-using Bytes = std::vector<std::uint8_t>;
-using ByteView = std::span<const std::uint8_t>;
 
 /// The format that the first bytes of a file show, whatever its name says; none for other kinds of files.
 std::optional<FileFormat> formatOfContent(ByteView file);
 
 /// The format that a file name asks for by its extension, in any case; none for other extensions.
 std::optional<FileFormat> formatOfExtension(const std::filesystem::path& path);
-
-/// "JPEG", "PNG", ...
-const char* formatName(FileFormat format);
 
 /// "8-bit CMYK" and the like, for messages.
 std::string pixelName(ColorModel model, int depth);

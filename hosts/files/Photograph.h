@@ -1,5 +1,7 @@
 #pragma once
 
+#include "metadata/Metadata.h"
+
 #include <cstdint>
 #include <filesystem>
 #include <memory>
@@ -43,8 +45,6 @@ constexpr int samplesPerPixel(ColorModel model) {
     }
 }
 
-enum class FileFormat { Jpeg, Png, Tiff, WebP, Psd, Heif };
-
 /// How the source was encoded, so that the result can be written alike.
 struct Encoding {
     FileFormat format = FileFormat::Png;
@@ -55,9 +55,6 @@ struct Encoding {
     bool progressive = false;     ///< interlaced or progressive
     int bitDepth = 0;             ///< HEIF: bits per sample in the file (8, 10 or 12); 0 when unknown
 };
-
-/// What a file holds beside its picture: Exif, XMP, IPTC, comment. See Metadata.h.
-struct Metadata;
 
 /// A photograph in memory: interleaved samples, rows from the top without padding, 8 bits or native 16 bits
 /// each. CMYK samples are raw ink values, 0 without ink; where a format stores them inverted, the inversion
@@ -71,7 +68,6 @@ struct Photograph {
     std::vector<std::uint8_t> iccProfile; ///< empty when there is none
     double xResolution = 0;               ///< pixels per millimetre; 0 when the file gives none
     double yResolution = 0;               ///< pixels per millimetre; 0 when the file gives none
-    std::string resolutionUnit;           ///< unit in which the file gives them: "in", "cm" or empty
     int pages = 1;                        ///< pages or animation frames of the file; only the first is held
     Encoding encoding;
     std::shared_ptr<const Metadata> metadata; ///< of the file it was read from; null when it comes from none

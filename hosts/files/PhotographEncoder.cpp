@@ -1,6 +1,5 @@
 #include "files/PhotographEncoder.h"
 
-#include "files/Metadata.h"
 #include "files/Vips.h"
 
 namespace orvela {
@@ -10,53 +9,15 @@ namespace {
 namespace fs = std::filesystem;
 
 constexpr std::size_t kClassicTiffLimit = 4'000'000'000;
+constexpr Bytes::value_type kExifHead[] = {'E', 'x', 'i', 'f', 0, 0};
 
 struct GFree {
     void operator()(void* data) const { g_free(data); }
 };
 
-VipsInterpretation interpretationOf(const Photograph& photograph) {
-    const bool deep = photograph.depth == 16;
-    switch (photograph.model) {
-    case ColorModel::Grey:
-    case ColorModel::GreyAlpha:
-        return deep ? VIPS_INTERPRETATION_GREY16 : VIPS_INTERPRETATION_B_W;
-    case ColorModel::Cmyk:
-        return VIPS_INTERPRETATION_CMYK;
-    default:
-        return deep ? VIPS_INTERPRETATION_RGB16 : VIPS_INTERPRETATION_sRGB;
-    }
-}
-
 void attach(VipsImage* image, const char* field, const Bytes& bytes) {
     if (!bytes.empty())
         vips_image_set_blob_copy(image, field, bytes.data(), bytes.size());
-}
-
-VipsHandle imageOf(const Photograph& photograph, FileFormat format) {
-    const VipsHandle plain(vips_image_new_from_memory(
-        photograph.samples.data(), photograph.samples.size(), photograph.width, photograph.height,
-        samplesPerPixel(photograph.model), photograph.depth == 16 ? VIPS_FORMAT_USHORT : VIPS_FORMAT_UCHAR));
-    VipsImage* image = nullptr;
-    if (plain)
-        vips_copy(plain.get(), &image, "interpretation", interpretationOf(photograph), nullptr);
-    if (image == nullptr)
-        throw PhotographError("the picture cannot be encoded (" + takeVipsError() + "); report this");
-    if (photograph.xResolution > 0) {
-        image->Xres = photograph.xResolution;
-        image->Yres = photograph.yResolution;
-        vips_image_set_string(image, VIPS_META_RESOLUTION_UNIT, photograph.resolutionUnit.c_str());
-    }
-    attach(image, VIPS_META_ICC_NAME, photograph.iccProfile);
-    if (format == FileFormat::Heif) {
-        MetadataBlocks blocks = metadataBlocks(photograph);
-        constexpr Bytes::value_type prefix[] = {'E', 'x', 'i', 'f', 0, 0};
-        if (!blocks.exif.empty())
-            blocks.exif.insert(blocks.exif.begin(), std::begin(prefix), std::end(prefix));
-        attach(image, VIPS_META_EXIF_NAME, blocks.exif);
-        attach(image, VIPS_META_XMP_NAME, blocks.xmp);
-    }
-    return VipsHandle(image);
 }
 
 // The source's settings where it has the target's format, the given ones before all.
@@ -135,21 +96,20 @@ bool isAsked(const std::atomic<bool>* stop) {
     return stop != nullptr && *stop;
 }
 
-// The encoder writes 25 pixels per inch where the picture has no resolution: density "none" instead.
-void clearDensity(Bytes& jpeg) {
-    constexpr std::size_t units = 13; // behind start marker, segment head, "JFIF", version
-    constexpr Bytes::value_type none[] = {0, 0, 1, 0, 1};
-    if (jpeg.size() > units + sizeof none && jpeg[3] == 0xE0)
-        std::copy(std::begin(none), std::end(none), jpeg.begin() + units);
-}
-
 } // namespace
 
 Bytes encodePhotograph(const Photograph& photograph, FileFormat format, const fs::path& target,
-                       const WriteOptions& options) {
+                       const WriteOptions& options, const Metadata& metadata) {
     startVips();
     vips_error_clear();
-    const VipsHandle image = imageOf(photograph, format);
+    const VipsHandle image = vipsImage(photograph);
+    if (format == FileFormat::Heif) {
+        Bytes exif = metadata.exif;
+        if (!exif.empty())
+            exif.insert(exif.begin(), std::begin(kExifHead), std::end(kExifHead));
+        attach(image.get(), VIPS_META_EXIF_NAME, exif);
+        attach(image.get(), VIPS_META_XMP_NAME, metadata.xmp);
+    }
     if (options.stop != nullptr) {
         vips_image_set_progress(image.get(), TRUE);
         g_signal_connect(image.get(), "eval", G_CALLBACK(stopWhenAsked),
@@ -166,10 +126,7 @@ Bytes encodePhotograph(const Photograph& photograph, FileFormat format, const fs
         throw PhotographError(target.string() + ": " + formatName(format) + " encoding failed (" +
                               takeVipsError() + "); choose other settings or another format");
     const auto* bytes = static_cast<const std::uint8_t*>(data);
-    Bytes encoded(bytes, bytes + size);
-    if (format == FileFormat::Jpeg && photograph.xResolution == 0)
-        clearDensity(encoded);
-    return encoded;
+    return {bytes, bytes + size};
 }
 
 } // namespace orvela

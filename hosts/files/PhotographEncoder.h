@@ -4,12 +4,12 @@
 
 namespace orvela {
 
-/// The picture as the bytes of a file of that format, with its ICC profile and resolution. Only HEIF, to
-/// which nothing can be added afterwards, carries its Exif and XMP already.
+/// The picture as the bytes of a file of that format, with its ICC profile. Only HEIF, to which nothing can
+/// be added afterwards, gets its Exif and XMP, out of `metadata`, already here.
 /// @param target  for messages; .avif asks for AV1 compression
 /// @throws PhotographError when the picture cannot be encoded or a setting is unknown
 /// @throws StoppedError when `options.stop` was set
 Bytes encodePhotograph(const Photograph& photograph, FileFormat format, const std::filesystem::path& target,
-                       const WriteOptions& options);
+                       const WriteOptions& options, const Metadata& metadata);
 
 } // namespace orvela

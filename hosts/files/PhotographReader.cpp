@@ -1,10 +1,10 @@
 #include "files/PhotographReader.h"
 
 #include "files/EncodingProbe.h"
-#include "files/Metadata.h"
 #include "files/PsdFile.h"
 #include "files/Refusal.h"
 #include "files/Vips.h"
+#include "metadata/MetadataReader.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -173,13 +173,13 @@ Encoding encodingOf(const Bytes& file, FileFormat format, VipsImage* image) {
     return encoding;
 }
 
-void takeResolution(Photograph& photograph, VipsImage* image) {
-    // 1 pixel per millimetre is what the library reports for a file without a resolution.
-    if (vips_image_get_xres(image) == 1.0)
+// Exif's density counts only where the container says nothing.
+void takeResolution(Photograph& photograph) {
+    const std::optional<Density> density = densityOf(*photograph.metadata);
+    if (!density || density->millimetres() == 0)
         return;
-    photograph.xResolution = vips_image_get_xres(image);
-    photograph.yResolution = vips_image_get_yres(image);
-    photograph.resolutionUnit = textField(image, VIPS_META_RESOLUTION_UNIT);
+    photograph.xResolution = density->x.value() / density->millimetres();
+    photograph.yResolution = density->y.value() / density->millimetres();
 }
 
 void takeProfile(Photograph& photograph, VipsImage* image) {
@@ -227,7 +227,6 @@ Photograph decode(const Bytes& file, FileFormat format, const fs::path& path) {
     checkEdges(photograph.width, photograph.height, path);
     photograph.encoding = encodingOf(file, format, image.get());
     photograph.pages = std::max(1, numberField(image.get(), VIPS_META_N_PAGES));
-    takeResolution(photograph, image.get());
     takeProfile(photograph, image.get());
     takeSamples(photograph, path, image.get());
     return photograph;
@@ -242,7 +241,8 @@ Photograph readPhotograph(const fs::path& path) {
         refuse(path, "is not a picture of a known kind",
                "JPEG, PNG, TIFF, WebP, PSD and HEIF files can be read");
     Photograph photograph = *format == FileFormat::Psd ? readPsd(file, path) : decode(file, *format, path);
-    photograph.metadata = readMetadata(file, *format);
+    photograph.metadata = std::make_shared<const Metadata>(readMetadata(file, *format));
+    takeResolution(photograph);
     return photograph;
 }
 

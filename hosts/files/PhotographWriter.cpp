@@ -1,8 +1,9 @@
 #include "files/PhotographWriter.h"
 
-#include "files/Metadata.h"
 #include "files/PhotographEncoder.h"
 #include "files/TargetFile.h"
+#include "files/Thumbnail.h"
+#include "metadata/MetadataWriter.h"
 
 namespace orvela {
 
@@ -32,12 +33,15 @@ std::vector<std::string> writePhotograph(const Photograph& photograph, const fs:
                                          const WriteOptions& options) {
     const FileFormat format = targetFormat(photograph, target);
     checkTargetPath(target, photograph.source, options.overwrite);
-    Bytes encoded = encodePhotograph(photograph, format, target, options);
-    std::vector<std::string> warnings = copyMetadata(photograph, format, encoded);
+    PreparedMetadata metadata =
+        prepareMetadata(photograph.metadata ? *photograph.metadata : Metadata(), format,
+                        {photograph.width, photograph.height, thumbnailsOf(photograph)});
+    Bytes encoded = encodePhotograph(photograph, format, target, options, metadata.metadata);
+    embedMetadata(metadata, encoded);
     TargetFile file(target);
     file.write(encoded, options.stop);
     file.commit(options.overwrite);
-    return warnings;
+    return metadataNotes(metadata, photograph.source.string());
 }
 
 } // namespace orvela

@@ -11,7 +11,7 @@ namespace {
 namespace fs = std::filesystem;
 
 enum Mode { Bitmap = 0, Gray = 1, Indexed = 2, RGB = 3, CMYK = 4 };
-enum Resource { ResolutionInfo = 1005, IccProfile = 1039, VersionInfo = 1057 };
+enum Resource { IccProfile = 1039, VersionInfo = 1057 };
 
 /// Big-endian numbers and byte runs, from the start of a file to its end.
 class Cursor {
@@ -89,14 +89,6 @@ void readResources(Cursor cursor, Photograph& photograph, const fs::path& path) 
             photograph.iccProfile.assign(data.begin(), data.end());
         if (id == VersionInfo && data.size() > 4 && data[4] == 0)
             refuse(path, "was saved without a merged picture", "save it again with maximum compatibility");
-        if (id == ResolutionInfo && data.size() >= 16) {
-            // 16.16 pixels per inch, whatever unit is displayed.
-            Cursor values(data, path);
-            photograph.xResolution = values.number(4) / 65536.0 / 25.4;
-            values.take(4);
-            photograph.yResolution = values.number(4) / 65536.0 / 25.4;
-            photograph.resolutionUnit = "in";
-        }
     }
 }
 

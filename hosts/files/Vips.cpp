@@ -1,7 +1,5 @@
 #include "files/Vips.h"
 
-#include "files/Photograph.h"
-
 #include <algorithm>
 
 namespace orvela {
@@ -21,11 +19,39 @@ bool start() {
     return true;
 }
 
+VipsInterpretation interpretationOf(const Photograph& photograph) {
+    const bool deep = photograph.depth == 16;
+    switch (photograph.model) {
+    case ColorModel::Grey:
+    case ColorModel::GreyAlpha:
+        return deep ? VIPS_INTERPRETATION_GREY16 : VIPS_INTERPRETATION_B_W;
+    case ColorModel::Cmyk:
+        return VIPS_INTERPRETATION_CMYK;
+    default:
+        return deep ? VIPS_INTERPRETATION_RGB16 : VIPS_INTERPRETATION_sRGB;
+    }
+}
+
 } // namespace
 
 void startVips() {
     static const bool started = start();
     static_cast<void>(started);
+}
+
+VipsHandle vipsImage(const Photograph& photograph) {
+    const VipsHandle plain(vips_image_new_from_memory(
+        photograph.samples.data(), photograph.samples.size(), photograph.width, photograph.height,
+        samplesPerPixel(photograph.model), photograph.depth == 16 ? VIPS_FORMAT_USHORT : VIPS_FORMAT_UCHAR));
+    VipsImage* image = nullptr;
+    if (plain)
+        vips_copy(plain.get(), &image, "interpretation", interpretationOf(photograph), nullptr);
+    if (image == nullptr)
+        throw PhotographError("the picture cannot be encoded (" + takeVipsError() + "); report this");
+    const std::vector<std::uint8_t>& profile = photograph.iccProfile;
+    if (!profile.empty())
+        vips_image_set_blob_copy(image, VIPS_META_ICC_NAME, profile.data(), profile.size());
+    return VipsHandle(image);
 }
 
 std::string takeVipsError() {

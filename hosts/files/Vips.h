@@ -1,5 +1,7 @@
 #pragma once
 
+#include "files/Photograph.h"
+
 #include <vips/vips.h>
 
 #include <memory>
@@ -18,6 +20,10 @@ using VipsHandle = std::unique_ptr<VipsImage, VipsRelease>;
 /// are exceptions.
 /// @throws PhotographError when it cannot start
 void startVips();
+
+/// The photograph's samples with its ICC profile; refers to the photograph.
+/// @throws PhotographError when there is not enough memory
+VipsHandle vipsImage(const Photograph& photograph);
 
 /// The pending error text as one line; clears it.
 std::string takeVipsError();

@@ -1,0 +1,115 @@
+#include "metadata/HeifMetadata.h"
+
+#include <libheif/heif.h>
+
+#include <algorithm>
+#include <array>
+#include <memory>
+
+namespace orvela {
+
+namespace {
+
+using namespace std::string_view_literals;
+
+template <auto release>
+struct Release {
+    template <typename Object>
+    void operator()(Object* object) const {
+        release(object);
+    }
+};
+using Context = std::unique_ptr<heif_context, Release<heif_context_free>>;
+using Handle = std::unique_ptr<heif_image_handle, Release<heif_image_handle_release>>;
+
+constexpr std::size_t kItems = 64;
+using Items = std::array<heif_item_id, kItems>;
+
+// The item is led in by the distance of the block behind it.
+Bytes exifOf(Bytes item) {
+    const std::size_t begin = 4 + number(item, 0, 4, ByteOrder::Big);
+    Bytes block = copyOf(slice(item, begin, item.size() - std::min(begin, item.size())));
+    if (startsWith(block, "Exif\0\0"sv))
+        block.erase(block.begin(), block.begin() + 6);
+    return block;
+}
+
+// Some writers leave another format's packet head before the packet.
+Bytes xmpOf(const Bytes& item) {
+    constexpr auto mark = "<x:xmpmeta"sv;
+    constexpr auto bare = "<rdf:RDF"sv;
+    const std::string_view text = asText(item);
+    if (text.find(mark) == std::string_view::npos && text.find(bare) == std::string_view::npos)
+        return {};
+    return copyOf(asBytes(text.substr(text.find('<'))));
+}
+
+void takeItem(const heif_image_handle* picture, heif_item_id id, Metadata& metadata) {
+    Bytes item(heif_image_handle_get_metadata_size(picture, id));
+    const std::string type = heif_image_handle_get_metadata_type(picture, id);
+    if (item.empty() || heif_image_handle_get_metadata(picture, id, item.data()).code != heif_error_Ok)
+        return;
+    if (type == "Exif" && metadata.exif.empty()) {
+        metadata.exif = exifOf(std::move(item));
+    } else if (type == "mime" && metadata.xmp.empty() && !xmpOf(item).empty()) {
+        metadata.xmp = xmpOf(item);
+    } else {
+        metadata.unheld.push_back("a HEIF item of the kind " + type);
+    }
+}
+
+void nameOtherPictures(heif_context* context, const heif_image_handle* picture, Metadata& metadata) {
+    Items ids{};
+    const int others = heif_image_handle_get_list_of_auxiliary_image_IDs(
+        picture, LIBHEIF_AUX_IMAGE_FILTER_OMIT_ALPHA | LIBHEIF_AUX_IMAGE_FILTER_OMIT_DEPTH, ids.data(),
+        kItems);
+    for (int i = 0; i < others; ++i) {
+        heif_image_handle* auxiliary = nullptr;
+        const char* type = nullptr;
+        const heif_item_id id = ids.at(static_cast<std::size_t>(i));
+        if (heif_image_handle_get_auxiliary_image_handle(picture, id, &auxiliary).code != heif_error_Ok)
+            continue;
+        const Handle owner(auxiliary);
+        std::string name = "an auxiliary picture";
+        if (heif_image_handle_get_auxiliary_type(auxiliary, &type).code == heif_error_Ok && type != nullptr) {
+            const std::string_view kind = type;
+            name = kind.find("gainmap") != std::string_view::npos
+                       ? "the gain map"
+                       : "the auxiliary picture " + std::string(kind.substr(kind.find_last_of(":/") + 1));
+            heif_image_handle_free_auxiliary_types(auxiliary, &type);
+        }
+        metadata.unheld.push_back(name);
+    }
+    if (heif_image_handle_has_depth_image(picture) != 0)
+        metadata.unheld.emplace_back("the depth map");
+    const int pictures = heif_context_get_number_of_top_level_images(context);
+    if (pictures > 1)
+        metadata.unheld.push_back(std::to_string(pictures - 1) + " further pictures");
+}
+
+} // namespace
+
+Metadata readHeifMetadata(ByteView file) {
+    Metadata metadata;
+    metadata.format = FileFormat::Heif;
+    const Context context(heif_context_alloc());
+    heif_image_handle* picture = nullptr;
+    // What cannot be read here, the reader of the picture refuses.
+    if (heif_context_read_from_memory_without_copy(context.get(), file.data(), file.size(), nullptr).code !=
+            heif_error_Ok ||
+        heif_context_get_primary_image_handle(context.get(), &picture).code != heif_error_Ok)
+        return metadata;
+    const Handle owner(picture);
+    Items ids{};
+    const int items = heif_image_handle_get_list_of_metadata_block_IDs(picture, nullptr, ids.data(), kItems);
+    for (int i = 0; i < items; ++i)
+        try {
+            takeItem(picture, ids.at(static_cast<std::size_t>(i)), metadata);
+        } catch (const DamagedBytes&) {
+            metadata.damaged.emplace_back("the Exif data");
+        }
+    nameOtherPictures(context.get(), picture, metadata);
+    return metadata;
+}
+
+} // namespace orvela

@@ -1,0 +1,72 @@
+#pragma once
+
+#include "metadata/Bytes.h"
+
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace orvela {
+
+enum class FileFormat { Jpeg, Png, Tiff, WebP, Psd, Heif };
+
+/// "JPEG", "PNG", ...
+const char* formatName(FileFormat format);
+
+struct Rational {
+    std::uint32_t numerator = 0;
+    std::uint32_t denominator = 1;
+
+    double value() const { return denominator == 0 ? 0.0 : static_cast<double>(numerator) / denominator; }
+    bool operator==(const Rational&) const = default;
+};
+
+enum class DensityUnit { None, Inch, Centimetre, Metre };
+
+/// Pixels per unit; without a unit only the shape of a pixel.
+struct Density {
+    Rational x;
+    Rational y;
+    DensityUnit unit = DensityUnit::None;
+
+    /// Millimetres in a unit; 0 where there is none.
+    double millimetres() const {
+        constexpr double lengths[] = {0, 25.4, 10, 1000};
+        return lengths[static_cast<int>(unit)];
+    }
+    bool operator==(const Density&) const = default;
+};
+
+/// A keyword and its text in UTF-8.
+struct Text {
+    std::string keyword;
+    std::string text;
+
+    bool operator==(const Text&) const = default;
+};
+
+/// A PNG chunk or, its name made from the marker and the identifier that its data begin with, a JPEG segment.
+struct Chunk {
+    std::string name;
+    Bytes data;
+    int marker = 0; ///< 0xE0 to 0xEF for a JPEG segment
+
+    bool operator==(const Chunk&) const = default;
+};
+
+/// What a photograph's file says beside its picture, as bytes that can go into files of other formats.
+struct Metadata {
+    FileFormat format = FileFormat::Png;
+    Bytes exif;                     ///< the Exif block from its byte order mark on
+    Bytes xmp;                      ///< the packet
+    Bytes resources;                ///< Photoshop's image resources, IPTC among them: a list of "8BIM" blocks
+    std::vector<Text> texts;        ///< of a PNG; a JPEG's comments by the keyword Comment
+    std::optional<Density> density; ///< what the container itself says; Exif's never overrules it
+    std::vector<Chunk> chunks;      ///< ancillary chunks of a PNG without neutral meaning, and its texts
+    std::vector<Chunk> segments;    ///< APPn segments of a JPEG without neutral meaning
+    std::vector<std::string> unheld; ///< what cannot travel whatever the target: "the gain map"
+    std::vector<std::string>
+        damaged; ///< what could not be understood and travels as it stands: "the Exif data"
+};
+
+} // namespace orvela

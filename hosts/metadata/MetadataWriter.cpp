@@ -1,0 +1,309 @@
+#include "metadata/MetadataWriter.h"
+
+#include "metadata/ImageResources.h"
+#include "metadata/JpegMetadata.h"
+#include "metadata/MetadataReader.h"
+#include "metadata/PngMetadata.h"
+#include "metadata/TagLibrary.h"
+#include "metadata/TiffMetadata.h"
+#include "metadata/Utf8.h"
+#include "metadata/WebPMetadata.h"
+
+#include <QCryptographicHash>
+
+#include <algorithm>
+#include <array>
+#include <regex>
+
+namespace orvela {
+
+namespace {
+
+using namespace std::string_view_literals;
+
+using Names = std::vector<std::string>;
+
+std::string joined(const Names& names, const char* between) {
+    std::string text;
+    for (const std::string& name : names)
+        text += (text.empty() ? "" : between) + name;
+    return text;
+}
+
+// Tags of the first Exif directory that mean the same as keywords of PNG.
+std::uint16_t tagOf(const std::string& keyword) {
+    constexpr std::array<std::pair<std::string_view, std::uint16_t>, 4> table = {
+        {{"Author", tiff::Artist},
+         {"Copyright", tiff::Copyright},
+         {"Description", tiff::ImageDescription},
+         {"Software", tiff::Software}}};
+    const auto found =
+        std::find_if(table.begin(), table.end(), [&](const auto& entry) { return entry.first == keyword; });
+    return found == table.end() ? 0 : found->second;
+}
+
+/// Makes the metadata of one format ready for another.
+class Preparation {
+public:
+    Preparation(const Metadata& source, FileFormat target, const PictureFacts& picture)
+        : mSource(source), mPicture(picture), mExif(source.exif) {
+        mResult.metadata = source;
+        mResult.target = target;
+        mResult.lost = source.unheld;
+    }
+
+    PreparedMetadata run() {
+        adaptToPicture();
+        if (mSource.format != FileFormat::Jpeg || mResult.target != FileFormat::Jpeg)
+            dropSegments();
+        if (mSource.format != FileFormat::Png || mResult.target != FileFormat::Png) {
+            moveTexts();
+            dropChunks();
+        }
+        moveResources();
+        moveDensity();
+        if (mResult.target == FileFormat::Jpeg)
+            fitJpeg();
+        fitTiff();
+        metadata().exif = mExif.bytes();
+        return std::move(mResult);
+    }
+
+private:
+    void adaptToPicture();
+    void dropSegments();
+    void dropChunks();
+    void moveTexts();
+    bool moveText(const Text& text);
+    void moveResources();
+    void moveDensity();
+    void fitJpeg();
+    void fitTiff();
+    void splitXmp();
+
+    Metadata& metadata() { return mResult.metadata; }
+    void lose(const std::string& name) { mResult.lost.push_back(name); }
+
+    const Metadata& mSource;
+    const PictureFacts& mPicture;
+    ExifBlock mExif;
+    PreparedMetadata mResult;
+};
+
+void Preparation::adaptToPicture() {
+    mExif.setDimensions(mPicture.width, mPicture.height);
+    bool turned = false;
+    if (mSource.format == FileFormat::Heif) {
+        turned = mExif.makeUpright();
+        static const std::regex property("(tiff:Orientation(?:=[\"']|>))[2-8]");
+        const std::string upright = std::regex_replace(std::string(asText(mSource.xmp)), property, "$011");
+        metadata().xmp = copyOf(asBytes(upright));
+    }
+    const bool inExif = mExif.renewThumbnails(mPicture.makeThumbnail, turned);
+    const bool inResources = renewResourceThumbnail(metadata().resources, mPicture.makeThumbnail);
+    if (!inExif || !inResources)
+        lose("the thumbnail");
+}
+
+void Preparation::dropSegments() {
+    Names names;
+    for (const Chunk& segment : mSource.segments)
+        if (std::find(names.begin(), names.end(), segment.name) == names.end())
+            names.push_back(segment.name);
+    mResult.lost.insert(mResult.lost.end(), names.begin(), names.end());
+    metadata().segments.clear();
+}
+
+// Of texts and colours others tell; a background is of no use where nothing is transparent.
+void Preparation::dropChunks() {
+    Names names;
+    for (const Chunk& chunk : mSource.chunks) {
+        const bool text = chunk.name == "tEXt" || chunk.name == "zTXt" || chunk.name == "iTXt";
+        if (!text && chunk.name != "bKGD" && !isPlainColour(chunk))
+            names.push_back(chunk.name);
+    }
+    if (!names.empty())
+        lose("PNG chunks " + joined(names, ", "));
+    metadata().chunks.clear();
+}
+
+bool Preparation::moveText(const Text& text) {
+    const bool png = mResult.target == FileFormat::Png;
+    const bool comment = text.keyword == "Comment" && mResult.target == FileFormat::Jpeg;
+    if (png || (comment && text.text.size() <= 65533)) {
+        const bool bytes = comment && mSource.format == FileFormat::Jpeg;
+        metadata().texts.push_back({text.keyword, bytes ? text.text : toUtf8(text.text)});
+        return true;
+    }
+    const std::uint16_t tag = tagOf(text.keyword);
+    if (tag == 0 || mExif.isDamaged() || text.text.find('\0') != std::string::npos)
+        return false;
+    if (const std::optional<std::string> there = mExif.text(tag))
+        return *there == text.text;
+    Bytes value = copyOf(asBytes(text.text));
+    value.push_back(0);
+    mExif.add({{tag, tiff::Ascii, static_cast<std::uint32_t>(value.size()), std::move(value)}});
+    return true;
+}
+
+void Preparation::moveTexts() {
+    Names names;
+    metadata().texts.clear();
+    for (const Text& text : mSource.texts)
+        if (!moveText(text))
+            names.push_back(text.keyword);
+    if (mSource.format == FileFormat::Png && !names.empty())
+        lose("PNG texts " + joined(names, ", "));
+    else if (!names.empty())
+        lose("the comment");
+}
+
+void Preparation::moveResources() {
+    if (mResult.target != FileFormat::WebP && mResult.target != FileFormat::Heif)
+        return;
+    const ImageResources resources = imageResources(mSource.resources);
+    if (const ImageResource* iptc = resources.find(resource::Iptc)) {
+        const Names names = iptcNames(iptc->data);
+        lose(names.empty() ? "IPTC" : "IPTC " + joined(names, ", "));
+    }
+    const bool others = std::any_of(resources.list.begin(), resources.list.end(),
+                                    [](const ImageResource& one) { return one.id != resource::Iptc; });
+    if (others || !resources.rest.empty())
+        lose("Photoshop's data");
+    metadata().resources.clear();
+}
+
+// WebP and HEIF have no place of their own for it.
+void Preparation::moveDensity() {
+    if (!mSource.density || mResult.target == FileFormat::Jpeg || mResult.target == FileFormat::Png ||
+        mResult.target == FileFormat::Tiff)
+        return;
+    if (mSource.density->unit != DensityUnit::None)
+        mExif.setDensity(*mSource.density);
+    metadata().density.reset();
+}
+
+// The packet goes into extension segments whole; the main one only refers to them.
+void Preparation::splitXmp() {
+    const std::string_view packet = asText(mSource.xmp);
+    const std::size_t begin = std::min(packet.find("<x:xmpmeta"), packet.find("<rdf:RDF"));
+    const std::size_t end = packet.rfind("<?xpacket");
+    if (begin == std::string_view::npos) {
+        lose("the XMP data");
+        metadata().xmp.clear();
+        return;
+    }
+    const std::string_view body =
+        packet.substr(begin, end == std::string_view::npos || end < begin ? end : end - begin);
+    const std::string id =
+        QCryptographicHash::hash(QByteArrayView(body.data(), static_cast<qsizetype>(body.size())),
+                                 QCryptographicHash::Md5)
+            .toHex()
+            .toUpper()
+            .toStdString();
+    const std::string note =
+        "<x:xmpmeta xmlns:x=\"adobe:ns:meta/\"><rdf:RDF "
+        "xmlns:rdf=\"http://www.w3.org/1999/02/22-rdf-syntax-ns#\"><rdf:Description rdf:about=\"\" "
+        "xmlns:xmpNote=\"http://ns.adobe.com/xmp/note/\" xmpNote:HasExtendedXMP=\"" +
+        id + "\"/></rdf:RDF></x:xmpmeta>";
+    metadata().xmp = copyOf(asBytes(note));
+    constexpr std::size_t most = 65000;
+    for (std::size_t at = 0; at < body.size(); at += most) {
+        Bytes data = copyOf(asBytes("http://ns.adobe.com/xmp/extension/\0"sv));
+        append(data, id);
+        append(data, body.size(), 4, ByteOrder::Big);
+        append(data, at, 4, ByteOrder::Big);
+        append(data, body.substr(at, most));
+        metadata().segments.push_back({"extended XMP", std::move(data), 0xE1});
+    }
+}
+
+void Preparation::fitJpeg() {
+    if (mExif.bytes().size() > kJpegExifLimit && mExif.dropThumbnails())
+        lose("the thumbnail");
+    if (mExif.bytes().size() > kJpegExifLimit) {
+        lose("the Exif data, of over 64 KiB");
+        mExif = ExifBlock({});
+    }
+    if (mSource.xmp.size() > kJpegXmpLimit)
+        splitXmp();
+}
+
+// A second directory of a TIFF would be a second page.
+void Preparation::fitTiff() {
+    if (mResult.target != FileFormat::Tiff)
+        return;
+    if (mExif.dropThumbnails())
+        lose("the thumbnail");
+    if (mExif.isDamaged()) {
+        lose("the Exif data, which are damaged");
+        mExif = ExifBlock({});
+    }
+}
+
+Names differences(const Metadata& wanted, const Metadata& found, FileFormat target, const Bytes& encoded) {
+    Names names;
+    const auto check = [&](bool same, const char* name) {
+        if (!same)
+            names.emplace_back(name);
+    };
+    if (target == FileFormat::Tiff && !wanted.exif.empty() &&
+        TiffView(wanted.exif).order() == TiffView(encoded).order()) {
+        const Names missing = missingInTiff(wanted, encoded);
+        names.insert(names.end(), missing.begin(), missing.end());
+    }
+    check(target == FileFormat::Tiff || wanted.exif == found.exif, "the Exif data");
+    check(wanted.xmp == found.xmp, "the XMP data");
+    check(wanted.resources == found.resources, "Photoshop's data");
+    check(wanted.texts == found.texts, "the texts");
+    check(wanted.segments == found.segments, "APPn segments");
+    check(wanted.chunks.size() <= found.chunks.size(), "PNG chunks");
+    check(!wanted.density || found.density, "the density");
+    return names;
+}
+
+} // namespace
+
+PreparedMetadata prepareMetadata(const Metadata& source, FileFormat target, const PictureFacts& picture) {
+    return Preparation(source, target, picture).run();
+}
+
+void embedMetadata(PreparedMetadata& prepared, Bytes& encoded) {
+    const Metadata& metadata = prepared.metadata;
+    const auto lose = [&](const Names& names) {
+        for (const std::string& name : names)
+            if (std::find(prepared.lost.begin(), prepared.lost.end(), name) == prepared.lost.end())
+                prepared.lost.push_back(name);
+    };
+    switch (prepared.target) {
+    case FileFormat::Jpeg:
+        embedIntoJpeg(metadata, encoded);
+        break;
+    case FileFormat::Png:
+        embedIntoPng(metadata, encoded);
+        break;
+    case FileFormat::WebP:
+        embedIntoWebP(metadata, encoded);
+        break;
+    case FileFormat::Tiff:
+        lose(embedIntoTiff(metadata, encoded));
+        break;
+    case FileFormat::Heif:
+    case FileFormat::Psd:
+        break;
+    }
+    lose(differences(metadata, readMetadata(encoded, prepared.target), prepared.target, encoded));
+}
+
+std::vector<std::string> metadataNotes(const PreparedMetadata& prepared, const std::string& name) {
+    std::vector<std::string> notes;
+    const auto& damaged = prepared.metadata.damaged;
+    if (!prepared.lost.empty())
+        notes.push_back(name + ": the " + formatName(prepared.target) +
+                        " file cannot hold: " + joined(prepared.lost, "; "));
+    if (!damaged.empty())
+        notes.push_back(name + ": damaged, carried over as far as possible: " + joined(damaged, "; "));
+    return notes;
+}
+
+} // namespace orvela

@@ -1,0 +1,420 @@
+#include "metadata/TiffMetadata.h"
+
+#include "metadata/ExifBlock.h"
+#include "metadata/ImageResources.h"
+#include "metadata/TagLibrary.h"
+
+#include <algorithm>
+#include <map>
+#include <optional>
+
+namespace orvela {
+
+namespace {
+
+// A block with a maker note below it still fits into a JPEG.
+constexpr std::size_t kNoteLimit = 60000;
+
+bool isResolution(std::uint16_t tag) {
+    return tag == tiff::XResolution || tag == tiff::YResolution || tag == tiff::ResolutionUnit;
+}
+
+bool isPointer(std::uint16_t tag) {
+    return tag == tiff::ExifIfd || tag == tiff::GpsIfd || tag == tiff::InteropIfd;
+}
+
+/// Lays out directories and their values around a maker note that has to stay where it is.
+class BlockBuilder {
+public:
+    BlockBuilder(ByteOrder order, const TagEntry* note) : mOrder(order) {
+        mBytes = copyOf(asBytes(order == ByteOrder::Little ? "II" : "MM"));
+        append(mBytes, 42, 2, order);
+        mBytes.resize(mLow);
+        if (note == nullptr)
+            return;
+        mNote = note->valueAt;
+        mBytes.resize(mNote);
+        append(mBytes, note->value);
+        padToEven(mBytes);
+        mHigh = mBytes.size();
+    }
+
+    /// Writes a directory; returns its place. The fields are sorted by tag.
+    std::size_t write(std::vector<TagField> fields) {
+        std::sort(fields.begin(), fields.end(),
+                  [](const TagField& a, const TagField& b) { return a.tag < b.tag; });
+        Bytes directory;
+        append(directory, fields.size(), 2, mOrder);
+        for (const TagField& field : fields) {
+            append(directory, field.tag, 2, mOrder);
+            append(directory, field.type, 2, mOrder);
+            append(directory, field.count, 4, mOrder);
+            if (field.value.size() > 4) {
+                append(directory, isNote(field) ? mNote : place(field.value), 4, mOrder);
+            } else {
+                append(directory, field.value);
+                directory.resize(directory.size() + 4 - field.value.size());
+            }
+        }
+        append(directory, 0, 4, mOrder);
+        return place(directory);
+    }
+
+    /// The block, whose first directory stands there.
+    Bytes take(std::size_t first) {
+        store(mBytes, 4, first, 4, mOrder);
+        return std::move(mBytes);
+    }
+
+private:
+    bool isNote(const TagField& field) const { return field.tag == tiff::MakerNote && mNote != 0; }
+
+    std::size_t place(ByteView bytes) {
+        std::size_t& cursor = mNote == 0 || mLow + bytes.size() <= mNote ? mLow : mHigh;
+        const std::size_t at = cursor;
+        if (mBytes.size() < at + bytes.size())
+            mBytes.resize(at + bytes.size());
+        std::copy(bytes.begin(), bytes.end(), mBytes.begin() + static_cast<std::ptrdiff_t>(at));
+        cursor = (at + bytes.size() + 1) / 2 * 2;
+        return at;
+    }
+
+    ByteOrder mOrder;
+    Bytes mBytes;
+    std::size_t mNote = 0; ///< its place; 0 when there is none that has to stay
+    std::size_t mLow = 8;  ///< where room in front of it begins
+    std::size_t mHigh = 0; ///< where room behind it begins
+};
+
+// Numbers of eight bytes, which only a BigTIFF has, in four.
+TagField classic(const TiffView& view, const TagEntry& entry) {
+    constexpr std::uint16_t long8 = 16;
+    constexpr std::uint16_t slong8 = 17;
+    constexpr std::uint16_t ifd8 = 18;
+    constexpr std::uint16_t slong = 9;
+    TagField field{entry.tag, entry.type, static_cast<std::uint32_t>(entry.count), copyOf(entry.value)};
+    if (entry.type != long8 && entry.type != slong8 && entry.type != ifd8)
+        return field;
+    field.type = entry.type == slong8 ? slong : static_cast<std::uint16_t>(tiff::Long);
+    field.value.clear();
+    for (std::size_t i = 0; i < entry.count; ++i)
+        append(field.value, view.value(entry, i), 4, view.order());
+    return field;
+}
+
+std::vector<TagField> fieldsOf(const TiffView& view, const TagDirectory& directory) {
+    std::vector<TagField> fields;
+    for (const TagEntry& entry : directory.entries)
+        if (!entry.value.empty() && !isPointer(entry.tag))
+            fields.push_back(classic(view, entry));
+    return fields;
+}
+
+// Adds the directory below the tag, if the page has one.
+void addBelow(std::vector<TagField>& fields, std::uint16_t pointer, const std::vector<TagField>& below,
+              BlockBuilder& builder, ByteOrder order) {
+    if (below.empty())
+        return;
+    TagField field{pointer, tiff::Long, 1, {}};
+    append(field.value, builder.write(below), 4, order);
+    fields.push_back(std::move(field));
+}
+
+Bytes blockOf(const TiffView& view, const ExifDirectories& directories, const TagEntry* note) {
+    const auto fields = [&](std::uint16_t pointer) {
+        const TagDirectory* found = directories.find(pointer);
+        return found == nullptr ? std::vector<TagField>() : fieldsOf(view, *found);
+    };
+    std::vector<TagField> first = fields(0);
+    std::erase_if(first, [](const TagField& field) { return isTiffStructure(field.tag); });
+    std::vector<TagField> exif = fields(tiff::ExifIfd);
+    BlockBuilder builder(view.order(), note);
+    addBelow(exif, tiff::InteropIfd, fields(tiff::InteropIfd), builder, view.order());
+    addBelow(first, tiff::ExifIfd, exif, builder, view.order());
+    addBelow(first, tiff::GpsIfd, fields(tiff::GpsIfd), builder, view.order());
+    const bool describes = std::any_of(first.begin(), first.end(),
+                                       [](const TagField& field) { return !isResolution(field.tag); });
+    return describes ? builder.take(builder.write(first)) : Bytes();
+}
+
+// Whether the note, if any, can stand in a block where it stands in the file.
+bool keepsPlace(const TagEntry* note, const TiffView& view) {
+    return note == nullptr || note->value.size() <= view.offsetSize() ||
+           (note->valueAt >= view.headerSize() && note->valueAt + note->value.size() <= kNoteLimit);
+}
+
+void takeExif(const TiffView& view, const ExifDirectories& directories, Metadata& metadata) {
+    const TagDirectory* exif = directories.find(tiff::ExifIfd);
+    const TagEntry* note = exif == nullptr ? nullptr : exif->find(tiff::MakerNote);
+    if (note != nullptr && note->value.size() <= 8)
+        note = nullptr;
+    if (keepsPlace(note, view)) {
+        metadata.exif = blockOf(view, directories, note);
+        return;
+    }
+    const bool isFirst = directories.find(0)->place == view.first();
+    if (view.isBig() || !isFirst) {
+        metadata.exif = blockOf(view, directories, nullptr);
+        metadata.unheld.emplace_back("what the maker note refers to by its place");
+        return;
+    }
+    RewrittenExif rewritten = rewriteTiffExif(view.bytes());
+    metadata.exif = std::move(rewritten.block);
+    metadata.unheld.insert(metadata.unheld.end(), rewritten.lost.begin(), rewritten.lost.end());
+}
+
+ByteView valueOf(const TagDirectory& directory, std::uint16_t tag) {
+    const TagEntry* entry = directory.find(tag);
+    return entry == nullptr ? ByteView() : entry->value;
+}
+
+// Some programs count its length in fours, with zeros behind the last record.
+ByteView withoutPadding(ByteView iptc) {
+    for (int i = 0; i < 3 && !iptc.empty() && iptc.back() == 0; ++i)
+        iptc = iptc.first(iptc.size() - 1);
+    return iptc;
+}
+
+void takeResources(const TagDirectory& page, Metadata& metadata) {
+    const ByteView iptc = withoutPadding(valueOf(page, tiff::Iptc));
+    metadata.resources = copyOf(valueOf(page, tiff::Resources));
+    if (iptc.empty())
+        return;
+    metadata.resources = withoutResources(metadata.resources, {resource::Iptc});
+    appendResource(metadata.resources, resource::Iptc, iptc);
+}
+
+// Moves what an encoded TIFF consists of: every offset in it grows.
+void shiftOffsets(Bytes& file, const TiffView& encoded, std::size_t shift) {
+    constexpr std::size_t pages = 65536;
+    const TagChain chain = encoded.chain(pages);
+    if (!chain.complete)
+        throw DamagedBytes("its directories cannot be followed");
+    const auto grow = [&](std::size_t at, std::uint64_t old, std::size_t size) {
+        store(file, at + shift, old + shift, size, encoded.order());
+    };
+    for (const TagDirectory& directory : chain.list) {
+        for (const TagEntry& entry : directory.entries) {
+            const std::size_t field = entry.place + 4 + encoded.offsetSize();
+            if (entry.valueAt != field)
+                grow(field, entry.valueAt, encoded.offsetSize());
+            if (entry.tag != tiff::StripOffsets && entry.tag != tiff::TileOffsets)
+                continue;
+            const std::size_t each = tagTypeSize(entry.type);
+            for (std::size_t i = 0; i < entry.count; ++i)
+                grow(entry.valueAt + i * each, encoded.value(entry, i), each);
+        }
+        if (directory.next != 0)
+            grow(directory.linkAt, directory.next, encoded.offsetSize());
+    }
+}
+
+/// Writes directories to the end of a TIFF.
+class DirectoryWriter {
+public:
+    explicit DirectoryWriter(Bytes& file)
+        : mFile(file), mOrder(TiffView(file).order()), mBig(TiffView(file).isBig()) {}
+
+    /// An entry with its value; a long one goes to the file's end.
+    Bytes entry(const TagField& field) {
+        Bytes bytes = head(field.tag, field.type, field.count);
+        if (field.value.size() > offsetSize()) {
+            padToEven(mFile);
+            append(bytes, mFile.size(), offsetSize(), mOrder);
+            append(mFile, field.value);
+        } else {
+            append(bytes, field.value);
+            bytes.resize(4 + 2 * offsetSize());
+        }
+        return bytes;
+    }
+
+    /// An entry whose value stands in the file already, unless it is short enough for the entry.
+    Bytes reference(const TagEntry& old) {
+        const auto count = static_cast<std::uint32_t>(old.count);
+        if (old.value.size() <= offsetSize())
+            return entry({old.tag, old.type, count, copyOf(old.value)});
+        Bytes bytes = head(old.tag, old.type, count);
+        append(bytes, old.valueAt, offsetSize(), mOrder);
+        return bytes;
+    }
+
+    Bytes pointer(std::uint16_t tag, std::size_t place) {
+        TagField field{tag, tiff::Long, 1, {}};
+        append(field.value, place, 4, mOrder);
+        return entry(field);
+    }
+
+    std::size_t directory(const std::map<std::uint16_t, Bytes>& entries, std::size_t next) {
+        padToEven(mFile);
+        const std::size_t place = mFile.size();
+        append(mFile, entries.size(), mBig ? 8 : 2, mOrder);
+        for (const auto& [tag, bytes] : entries)
+            append(mFile, bytes);
+        append(mFile, next, offsetSize(), mOrder);
+        return place;
+    }
+
+private:
+    std::size_t offsetSize() const { return mBig ? 8 : 4; }
+
+    Bytes head(std::uint16_t tag, std::uint16_t type, std::uint32_t count) const {
+        Bytes bytes;
+        append(bytes, tag, 2, mOrder);
+        append(bytes, type, 2, mOrder);
+        append(bytes, count, offsetSize(), mOrder);
+        return bytes;
+    }
+
+    Bytes& mFile;
+    ByteOrder mOrder;
+    bool mBig;
+};
+
+using Entries = std::map<std::uint16_t, Bytes>;
+
+Entries entriesOf(const ExifDirectories& block, std::uint16_t pointer, DirectoryWriter& writer) {
+    Entries entries;
+    const TagDirectory* directory = block.find(pointer);
+    if (directory == nullptr)
+        return entries;
+    for (const TagEntry& entry : directory->entries)
+        if (!isPointer(entry.tag) && !(pointer == 0 && isTiffStructure(entry.tag)))
+            entries.emplace(entry.tag, writer.reference(entry));
+    return entries;
+}
+
+// The first directory's entries of a block that is the beginning of the file. Directories of a BigTIFF have
+// another form, so that those below are written anew; the values stay where they are.
+Entries blockEntries(const TiffView& block, bool big, DirectoryWriter& writer) {
+    const ExifDirectories directories = exifDirectories(block, block.first());
+    Entries first = entriesOf(directories, 0, writer);
+    const auto below = [&](std::uint16_t pointer) {
+        Entries entries = entriesOf(directories, pointer, writer);
+        const TagDirectory* interop = directories.find(tiff::InteropIfd);
+        if (pointer == tiff::ExifIfd && interop != nullptr)
+            entries.emplace(
+                tiff::InteropIfd,
+                writer.pointer(tiff::InteropIfd,
+                               big ? writer.directory(entriesOf(directories, tiff::InteropIfd, writer), 0)
+                                   : interop->place));
+        return writer.directory(entries, 0);
+    };
+    for (const std::uint16_t pointer : {tiff::ExifIfd, tiff::GpsIfd})
+        if (const TagDirectory* old = directories.find(pointer))
+            first.emplace(pointer, writer.pointer(pointer, big ? below(pointer) : old->place));
+    return first;
+}
+
+// What has a tag of its own in a TIFF.
+std::vector<TagField> ownFields(const Metadata& metadata, ByteOrder order) {
+    std::vector<TagField> fields;
+    const auto add = [&](std::uint16_t tag, std::uint16_t type, Bytes value) {
+        const auto count = static_cast<std::uint32_t>(value.size() / tagTypeSize(type));
+        if (count > 0)
+            fields.push_back({tag, type, count, std::move(value)});
+    };
+    add(tiff::Xmp, tiff::Byte, metadata.xmp);
+    const ImageResources resources = imageResources(metadata.resources);
+    if (const ImageResource* iptc = resources.find(resource::Iptc)) {
+        Bytes padded = copyOf(iptc->data);
+        padded.resize((padded.size() + 3) / 4 * 4);
+        add(tiff::Iptc, tiff::Long, std::move(padded));
+    }
+    add(tiff::Resources, tiff::Byte, withoutResources(metadata.resources, {resource::Iptc}));
+    if (metadata.density)
+        for (TagField& field : densityFields(*metadata.density, order))
+            fields.push_back(std::move(field));
+    return fields;
+}
+
+// The block in the byte order of the file.
+RewrittenExif blockFor(const Metadata& metadata, const TiffView& encoded) {
+    if (metadata.exif.empty())
+        return {};
+    const TiffView block(metadata.exif);
+    if (ExifBlock(metadata.exif).isDamaged())
+        throw DamagedBytes("the Exif data is damaged");
+    return block.order() == encoded.order() ? RewrittenExif{metadata.exif, {}}
+                                            : rewriteExif(metadata.exif, encoded.order());
+}
+
+} // namespace
+
+Metadata readTiffMetadata(ByteView file, std::size_t page) {
+    Metadata metadata;
+    metadata.format = FileFormat::Tiff;
+    try {
+        const TiffView view(file);
+        const ExifDirectories directories = exifDirectories(view, page != 0 ? page : view.first());
+        const TagDirectory* first = directories.find(0);
+        if (first == nullptr)
+            throw DamagedBytes("there is no directory");
+        metadata.xmp = copyOf(valueOf(*first, tiff::Xmp));
+        takeResources(*first, metadata);
+        metadata.density = densityOf(view, *first);
+        if (first->find(tiff::Layers) != nullptr)
+            metadata.unheld.emplace_back("the layers");
+        if (first->find(tiff::SubIfds) != nullptr)
+            metadata.unheld.emplace_back("the sub-images");
+        takeExif(view, directories, metadata);
+        if (!directories.complete)
+            metadata.damaged.emplace_back("the Exif data");
+    } catch (const DamagedBytes&) {
+        metadata.damaged.emplace_back("the Exif data");
+    }
+    return metadata;
+}
+
+std::vector<std::string> embedIntoTiff(const Metadata& metadata, Bytes& encoded) {
+    const TiffView view(encoded);
+    RewrittenExif block = blockFor(metadata, view);
+    Bytes file = block.block;
+    file.resize(std::max(file.size(), view.headerSize()));
+    padToEven(file);
+    std::copy_n(encoded.begin(), view.headerSize(), file.begin());
+    const std::size_t shift = file.size() - view.headerSize();
+    append(file, behind(encoded, view.headerSize()));
+    shiftOffsets(file, view, shift);
+
+    const TagDirectory page = view.directory(view.first());
+    DirectoryWriter writer(file);
+    Entries entries;
+    for (const TagField& field : ownFields(metadata, view.order()))
+        entries.emplace(field.tag, writer.entry(field));
+    if (!block.block.empty())
+        entries.merge(blockEntries(TiffView(block.block), view.isBig(), writer));
+    for (const TagEntry& entry : page.entries)
+        if (isTiffStructure(entry.tag))
+            entries[entry.tag] = copyOf(slice(file, entry.place + shift, view.entrySize()));
+    const std::size_t next = page.next == 0 ? 0 : page.next + shift;
+    const std::size_t first = writer.directory(entries, next);
+    store(file, view.linkAt(), first, view.offsetSize(), view.order());
+    encoded = std::move(file);
+    return std::move(block.lost);
+}
+
+std::vector<std::string> missingInTiff(const Metadata& metadata, ByteView encoded) {
+    if (metadata.exif.empty())
+        return {};
+    const TiffView wanted(metadata.exif);
+    const TiffView found(encoded);
+    const ExifDirectories there = exifDirectories(found, found.first());
+    std::vector<std::string> names;
+    for (const auto& [pointer, directory] : exifDirectories(wanted, wanted.first()).list) {
+        const TagDirectory* other = there.find(pointer);
+        for (const TagEntry& entry : directory.entries) {
+            if (isPointer(entry.tag) ||
+                (pointer == 0 && (isTiffStructure(entry.tag) || isResolution(entry.tag))))
+                continue;
+            const TagEntry* same = other == nullptr ? nullptr : other->find(entry.tag);
+            const bool moved = same != nullptr && entry.tag == tiff::MakerNote &&
+                               same->valueAt != entry.valueAt && entry.value.size() > 8;
+            if (same == nullptr || moved || !sameBytes(same->value, entry.value))
+                names.push_back(exifTagName(pointer, entry.tag));
+        }
+    }
+    return names;
+}
+
+} // namespace orvela
