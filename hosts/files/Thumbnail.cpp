@@ -31,8 +31,11 @@ VipsHandle reduced(const Photograph& photograph, int width, int height) {
                                 static_cast<double>(height) / photograph.height);
     const bool fills =
         std::abs(width - fit * photograph.width) < 1.5 && std::abs(height - fit * photograph.height) < 1.5;
+    // Without a profile the library would take the samples for another kind of sRGB.
+    const char* profile = photograph.iccProfile.empty() ? nullptr : "srgb";
     apply(image, vips_thumbnail_image, width, "height", height, "size",
-          fills ? VIPS_SIZE_FORCE : VIPS_SIZE_BOTH, "no_rotate", TRUE, "export_profile", "srgb");
+          fills ? VIPS_SIZE_FORCE : VIPS_SIZE_BOTH, "no_rotate", TRUE,
+          profile == nullptr ? nullptr : "export_profile", profile);
     if (image && vips_image_hasalpha(image.get()))
         apply(image, vips_flatten);
     apply(image, vips_colourspace, VIPS_INTERPRETATION_sRGB);

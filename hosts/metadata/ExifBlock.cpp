@@ -231,6 +231,8 @@ bool ExifBlock::isShared(const Thumbnail& thumbnail) const {
     const auto meets = [&](std::size_t at, std::size_t size) {
         return overlap(thumbnail.at, thumbnail.length, at, size);
     };
+    if (meets(0, view.headerSize()))
+        return true;
     return std::any_of(directories.begin(), directories.end(), [&](const TagDirectory& directory) {
         return meets(directory.place, directory.size) ||
                std::any_of(directory.entries.begin(), directory.entries.end(),

@@ -92,6 +92,19 @@ void appendResource(Bytes& list, std::uint16_t id, ByteView data) {
         list.push_back(0);
 }
 
+bool sameResources(ByteView a, ByteView b) {
+    const auto sorted = [](ByteView list) {
+        std::vector<std::pair<std::uint16_t, std::string_view>> all;
+        const ImageResources resources = imageResources(list);
+        for (const ImageResource& one : resources.list)
+            all.emplace_back(one.id, asText(one.data));
+        all.emplace_back(0, asText(resources.rest));
+        std::sort(all.begin(), all.end());
+        return all;
+    };
+    return sorted(a) == sorted(b);
+}
+
 std::optional<Density> resourceDensity(ByteView list) {
     const ImageResources resources = imageResources(list);
     const ImageResource* found = resources.find(resource::ResolutionInfo);

@@ -39,6 +39,9 @@ Bytes withoutResources(ByteView list, const std::vector<std::uint16_t>& ids);
 
 void appendResource(Bytes& list, std::uint16_t id, ByteView data);
 
+/// Whether the lists hold the same, in any order.
+bool sameResources(ByteView a, ByteView b);
+
 /// The pixels per inch that the resolution resource states.
 std::optional<Density> resourceDensity(ByteView list);
 

@@ -32,6 +32,10 @@ enum Marker {
 
 // "APP12 Ducky": the marker and the identifier that most segments begin with.
 std::string nameOf(const JpegSegment& segment) {
+    if (segment.marker == App1 && startsWith(segment.data, "http://ns.adobe.com/xmp/extension/"))
+        return kExtendedXmp;
+    if (segment.marker == App0 && asText(segment.data).substr(0, 14).ends_with("HEAPJPGM"))
+        return "APP0 CIFF";
     std::string name = "APP" + std::to_string(segment.marker - App0);
     std::string identifier;
     for (const std::uint8_t byte : segment.data.first(std::min<std::size_t>(16, segment.data.size()))) {
@@ -161,15 +165,17 @@ Density forJfif(const Density& density) {
     return {rounded(inchX), rounded(inchY), DensityUnit::Inch};
 }
 
-// Without a density, Exif's counts, which a JFIF head would contradict. Where the encoder states the colours
-// by Adobe's marker a head could contradict that.
+// Without a density, Exif's counts, which a JFIF head would contradict. Of three colours a head says what
+// they are, so that it must not stand where the encoder says by Adobe's marker that they are others.
 void putJfif(Bytes& file, const Metadata& metadata, const std::vector<JpegSegment>& encoders) {
-    const auto has = [&](int marker, std::string_view text) {
-        return std::any_of(encoders.begin(), encoders.end(), [&](const JpegSegment& one) {
-            return one.marker == marker && startsWith(one.data, text);
-        });
-    };
-    const bool allowed = has(App0, kJfif) || !has(App14, "Adobe");
+    const auto has = [&](auto condition) { return std::any_of(encoders.begin(), encoders.end(), condition); };
+    const bool written =
+        has([](const JpegSegment& one) { return one.marker == App0 && startsWith(one.data, kJfif); });
+    const bool adobe = has([](const JpegSegment& one) { return one.marker == App14; });
+    const bool threeColours = has([](const JpegSegment& one) {
+        return isJpegFrame(one.marker) && one.data.size() > 5 && one.data[5] == 3;
+    });
+    const bool allowed = written || !adobe || !threeColours;
     if (!allowed || (!metadata.density && !metadata.exif.empty()))
         return;
     const Density density = forJfif(metadata.density.value_or(Density{{1, 1}, {1, 1}}));

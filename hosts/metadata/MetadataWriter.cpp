@@ -214,7 +214,7 @@ void Preparation::splitXmp() {
         append(data, body.size(), 4, ByteOrder::Big);
         append(data, at, 4, ByteOrder::Big);
         append(data, body.substr(at, most));
-        metadata().segments.push_back({"extended XMP", std::move(data), 0xE1});
+        metadata().segments.push_back({kExtendedXmp, std::move(data), 0xE1});
     }
 }
 
@@ -254,7 +254,7 @@ Names differences(const Metadata& wanted, const Metadata& found, FileFormat targ
     }
     check(target == FileFormat::Tiff || wanted.exif == found.exif, "the Exif data");
     check(wanted.xmp == found.xmp, "the XMP data");
-    check(wanted.resources == found.resources, "Photoshop's data");
+    check(sameResources(wanted.resources, found.resources), "Photoshop's data");
     check(wanted.texts == found.texts, "the texts");
     check(wanted.segments == found.segments, "APPn segments");
     check(wanted.chunks.size() <= found.chunks.size(), "PNG chunks");

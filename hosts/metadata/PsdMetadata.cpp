@@ -2,6 +2,8 @@
 
 #include "metadata/ImageResources.h"
 
+#include <cstdlib>
+
 namespace orvela {
 
 namespace {
@@ -25,6 +27,14 @@ Bytes dataOf(const ImageResources& resources, std::uint16_t id) {
 const std::vector<std::uint16_t> kElsewhere = {
     resource::IccProfile, resource::Exif, resource::Exif3, resource::Xmp, 0x0400, 0x0402, 0x042D, 0x0430};
 
+// A single one is the merged picture itself. Below zero the first transparency is that of the merged picture.
+int layerCount(ByteView layers) {
+    if (layers.size() < 6 || number(layers, 0, 4, ByteOrder::Big) == 0)
+        return 0;
+    const auto count = static_cast<std::int16_t>(number(layers, 4, 2, ByteOrder::Big));
+    return std::abs(int{count});
+}
+
 } // namespace
 
 Metadata readPsdMetadata(ByteView file) {
@@ -39,7 +49,7 @@ Metadata readPsdMetadata(ByteView file) {
         metadata.xmp = dataOf(resources, resource::Xmp);
         metadata.density = resourceDensity(list);
         metadata.resources = withoutResources(list, kElsewhere);
-        if (!part(file, at).empty())
+        if (layerCount(part(file, at)) > 1)
             metadata.unheld.emplace_back("the layers");
     } catch (const DamagedBytes&) {
         metadata.damaged.emplace_back("Photoshop's data");

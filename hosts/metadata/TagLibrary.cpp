@@ -132,7 +132,8 @@ std::vector<std::string> iptcNames(ByteView iptc) {
     if (Exiv2::IptcParser::decode(data, iptc.data(), static_cast<std::uint32_t>(iptc.size())) != 0)
         return names;
     for (const Exiv2::Iptcdatum& datum : data)
-        if (std::find(names.begin(), names.end(), datum.tagName()) == names.end())
+        if (datum.tagName() != "RecordVersion" && datum.tagName() != "CharacterSet" &&
+            std::find(names.begin(), names.end(), datum.tagName()) == names.end())
             names.push_back(datum.tagName());
     return names;
 }

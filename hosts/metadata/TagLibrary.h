@@ -24,7 +24,7 @@ RewrittenExif rewriteTiffExif(ByteView file);
 
 bool isWellFormedXmp(ByteView packet);
 
-/// "Keywords", "City", ...: each kind of an IPTC block once.
+/// "Keywords", "City", ...: each kind of an IPTC block once, without what tells of the block itself.
 std::vector<std::string> iptcNames(ByteView iptc);
 
 /// @param directory  the tag that leads to its directory; 0 for the first one

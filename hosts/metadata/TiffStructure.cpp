@@ -51,12 +51,15 @@ TagEntry TiffView::entry(std::size_t place) const {
         return entry;
     if (entry.count * each > offsetSize())
         entry.valueAt = offset(entry.valueAt);
-    if (entry.valueAt <= mBytes.size() && entry.count * each <= mBytes.size() - entry.valueAt)
+    if (entry.valueAt >= headerSize() && entry.valueAt <= mBytes.size() &&
+        entry.count * each <= mBytes.size() - entry.valueAt)
         entry.value = mBytes.subspan(entry.valueAt, entry.count * each);
     return entry;
 }
 
 TagDirectory TiffView::directory(std::size_t place) const {
+    if (place < headerSize())
+        throw DamagedBytes("a directory stands in the header");
     const std::size_t countSize = mBig ? 8 : 2;
     const std::uint64_t count = number(mBytes, place, countSize, mOrder);
     if (count > mBytes.size() / entrySize())

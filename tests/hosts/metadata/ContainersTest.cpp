@@ -1,0 +1,242 @@
+// What the formats hold beside Exif, from each into others.
+
+#include "files/PhotographReader.h"
+#include "files/PhotographWriter.h"
+#include "hosts/TestFiles.h"
+#include "metadata/MetadataReader.h"
+#include "metadata/MetadataWriter.h"
+#include "metadata/PngMetadata.h"
+#include "metadata/TiffMetadata.h"
+
+#include <gmock/gmock.h>
+
+#include <random>
+
+using namespace orvela;
+
+namespace {
+
+using testing::ElementsAre;
+using testing::EndsWith;
+using testing::HasSubstr;
+using testing::IsEmpty;
+
+// Puts `piece`, given as Python, behind the first `at` bytes of a file.
+std::string insert(const char* file, int at, const std::string& piece) {
+    return "python3 -c \"import struct, zlib\nb = open('" + std::string(file) + "', 'rb').read()\n" +
+           "def chunk(n, d): return struct.pack('>I', len(d)) + n + d + struct.pack('>I', zlib.crc32(n + "
+           "d))\n" +
+           "def segment(m, d): return bytes([255, m]) + struct.pack('>H', len(d) + 2) + d\n" + "open('" +
+           file + "', 'wb').write(b[:" + std::to_string(at) + "] + " + piece + " + b[" + std::to_string(at) +
+           ":])\"";
+}
+
+constexpr int kBehindPngHeader = 33;
+constexpr int kBehindJpegStart = 2;
+
+std::vector<std::string> convert(const TestFolder& folder, const char* from, const char* to) {
+    return writePhotograph(readPhotograph(folder / from), folder / to);
+}
+
+TEST(Containers, KeepTheirOwnDensityWhateverExifSays) {
+    const TestFolder folder;
+    folder.run("convert $S/coffee.png -resize 64x48! -strip -units PixelsPerInch -density 300x150 s.jpg && "
+               "convert $S/coffee.png -resize 64x48! -strip s.png && exiftool -q -overwrite_original "
+               "-PixelUnits=meters "
+               "-PixelsPerUnitX=2835 -PixelsPerUnitY=2835 s.png && "
+               "convert $S/coffee.png -resize 64x48! -strip -units PixelsPerCentimeter -density 120 s.tif && "
+               "cp s.jpg e.jpg && exiftool -q -overwrite_original -Make=M -IFD0:XResolution=72 "
+               "-IFD0:YResolution=72 e.jpg && vips copy s.jpg n.jpg[strip] && "
+               "exiftool -q -overwrite_original -JFIF:ResolutionUnit=None -JFIF:XResolution=1 "
+               "-JFIF:YResolution=1 n.jpg");
+    const struct {
+        const char* source;
+        const char* target;
+        const char* tags; ///< of one group
+        const char* values;
+    } cases[] = {
+        {"s.jpg", "t.jpg", "JFIF:ResolutionUnit -JFIF:XResolution -JFIF:YResolution", "1 300 150"},
+        {"s.jpg", "t.png", "PNG:PixelUnits -PNG:PixelsPerUnitX -PNG:PixelsPerUnitY", "1 11811 5906"},
+        {"s.jpg", "t.tif", "IFD0:ResolutionUnit -IFD0:XResolution -IFD0:YResolution", "2 300 150"},
+        {"s.jpg", "t.webp", "IFD0:ResolutionUnit -IFD0:XResolution -IFD0:YResolution", "2 300 150"},
+        {"e.jpg", "t.jpg", "JFIF:XResolution -IFD0:XResolution", "300 72"},
+        {"e.jpg", "t.tif", "IFD0:XResolution -IFD0:YResolution", "300 150"},
+        {"e.jpg", "t.webp", "IFD0:XResolution -IFD0:YResolution", "300 150"},
+        {"s.png", "t.jpg", "JFIF:ResolutionUnit -JFIF:XResolution", "1 72"}, // 72.009 per inch
+        {"s.png", "t.png", "PNG:PixelUnits -PNG:PixelsPerUnitX", "1 2835"},
+        {"s.png", "t.tif", "IFD0:ResolutionUnit -IFD0:XResolution", "3 28.35"},
+        {"s.tif", "t.jpg", "JFIF:ResolutionUnit -JFIF:XResolution", "2 120"},
+        {"s.tif", "t.tif", "IFD0:ResolutionUnit -IFD0:XResolution", "3 120"},
+        {"n.jpg", "t.jpg", "JFIF:ResolutionUnit -JFIF:XResolution", "0 1"},
+    };
+    for (const auto& c : cases) {
+        EXPECT_THAT(convert(folder, c.source, c.target), IsEmpty()) << c.source << ' ' << c.target;
+        EXPECT_EQ(folder.output(std::string("exiftool -n -s3 -") + c.tags + " " + c.target + " | xargs"),
+                  std::string(c.values) + "\n")
+            << c.source << ' ' << c.target;
+        folder.run(std::string("rm ") + c.target);
+    }
+    EXPECT_NEAR(readPhotograph(folder / "e.jpg").xResolution, 300 / 25.4, 1e-9);
+}
+
+TEST(Containers, CarryTextsAndColoursOfPng) {
+    const TestFolder folder;
+    folder.run(
+        "convert $S/coffee.png -resize 64x48! -strip -define png:exclude-chunks=all s.png && " +
+        insert("s.png", kBehindPngHeader,
+               "chunk(b'gAMA', struct.pack('>I', 55555)) + chunk(b'cHRM', struct.pack('>8I', *range(8))) "
+               "+ chunk(b'tIME', bytes([7, 232, 2, 3, 4, 5, 6])) + chunk(b'bKGD', bytes(6)) "
+               "+ chunk(b'tEXt', b'Author\\0A. Writer') + chunk(b'tEXt', b'Comment\\0caf\\xe9') "
+               "+ chunk(b'zTXt', b'Title\\0\\0' + zlib.compress(b'A title')) "
+               "+ chunk(b'iTXt', b'Copyright\\0\\0\\0\\0\\0' + 'gr\\u00fcn'.encode())"));
+    EXPECT_THAT(convert(folder, "s.png", "t.png"), IsEmpty());
+    const std::string list = "exiftool -a -s -PNG:all -x Interlace ";
+    EXPECT_EQ(folder.output(list + "t.png"), folder.output(list + "s.png"));
+    EXPECT_THAT(folder.output(list + "t.png"), HasSubstr("A title"));
+    EXPECT_THAT(
+        convert(folder, "s.png", "t.jpg"),
+        ElementsAre(EndsWith("the JPEG file cannot hold: PNG texts Title; PNG chunks gAMA, cHRM, tIME")));
+    EXPECT_EQ(folder.output("exiftool -s3 -Artist -Copyright -Comment t.jpg"), "A. Writer\ngrün\ncafé\n");
+    EXPECT_THAT(convert(folder, "t.jpg", "u.png"), IsEmpty());
+    EXPECT_EQ(folder.output("exiftool -s3 -PNG:Comment -EXIF:Artist u.png"), "café\nA. Writer\n");
+    // The colours that everybody takes for granted are no loss, nor is what Exif says already.
+    folder.run("convert $S/coffee.png -resize 64x48! -strip -define png:exclude-chunks=all p.png && " +
+               insert("p.png", kBehindPngHeader,
+                      "chunk(b'sRGB', bytes(1)) + chunk(b'gAMA', struct.pack('>I', 45455)) "
+                      "+ chunk(b'tEXt', b'Author\\0A') ") +
+               " && exiftool -q -overwrite_original -EXIF:Artist=A p.png");
+    EXPECT_THAT(convert(folder, "p.png", "p.jpg"), IsEmpty());
+}
+
+TEST(Containers, CarryPhotoshopsResources) {
+    const TestFolder folder;
+    folder.run("convert $S/coffee.png -resize 64x48! -strip s.jpg && exiftool -q -overwrite_original "
+               "-Photoshop:CopyrightFlag=1 -Photoshop:URL=http://example.org -IPTC:Keywords=cup "
+               "-IPTC:City=Bonn -Photoshop:XResolution=300 s.jpg");
+    const std::string list = "exiftool -a -s -Photoshop:all -IPTC:all ";
+    const std::string before = folder.output(list + "-x IPTCDigest s.jpg");
+    EXPECT_THAT(before, HasSubstr("example.org"));
+    EXPECT_THAT(before, HasSubstr("Bonn"));
+    for (const char* middle : {"m.jpg", "m.tif", "m.png"}) {
+        EXPECT_THAT(convert(folder, "s.jpg", middle), IsEmpty()) << middle;
+        EXPECT_THAT(convert(folder, middle, "t.jpg"), IsEmpty()) << middle;
+        EXPECT_EQ(folder.output(list + "-x IPTCDigest t.jpg && rm t.jpg"), before) << middle;
+    }
+    EXPECT_THAT(folder.output("exiftool -s3 -IPTC:City m.tif m.png"), HasSubstr("Bonn"));
+    EXPECT_THAT(convert(folder, "s.jpg", "t.webp"),
+                ElementsAre(EndsWith("the WebP file cannot hold: IPTC Keywords, City; Photoshop's data")));
+}
+
+TEST(Containers, KeepSegmentsOfJpegAndNameWhatWouldLie) {
+    const TestFolder folder;
+    folder.run("convert $S/coffee.png -resize 64x48! -strip s.jpg && " +
+               insert("s.jpg", kBehindJpegStart,
+                      "segment(0xEC, b'Ducky' + bytes(9)) + segment(0xE2, b'MPF\\0' + bytes(20)) "
+                      "+ segment(0xE1, b'QVCI' + bytes(5)) "
+                      "+ segment(0xE0, b'II\\x1a\\0\\0\\0HEAPJPGM' + bytes(30))") +
+               " && printf 'more pictures' >>s.jpg");
+    EXPECT_THAT(convert(folder, "s.jpg", "t.jpg"),
+                ElementsAre(EndsWith("the JPEG file cannot hold: the further pictures (MPF)")));
+    EXPECT_EQ(readPhotograph(folder / "t.jpg").metadata->segments,
+              readPhotograph(folder / "s.jpg").metadata->segments);
+    EXPECT_THAT(folder.text("t.jpg"), HasSubstr("HEAPJPGM"));
+    EXPECT_THAT(convert(folder, "s.jpg", "t.png"),
+                ElementsAre(EndsWith("(MPF); APP0 CIFF; APP12 Ducky; APP1 QVCI")));
+    folder.run("convert $S/coffee.png -resize 64x48! -strip r.jpg && printf '12345\\0\\0\\0' >>r.jpg");
+    EXPECT_THAT(convert(folder, "r.jpg", "u.jpg"), ElementsAre(EndsWith("5 bytes behind the picture")));
+}
+
+// A segment of a JPEG ends after 64 KiB.
+TEST(Containers, SplitLongXmpAndShortenLongExif) {
+    const TestFolder folder;
+    folder.run("convert $S/coffee.png -resize 160x120! t.jpg && convert $S/coffee.png -resize 64x48! -strip "
+               "s.png && "
+               "python3 -c \"open('long', 'w').write('word ' * 30000)\" && exiftool -q -overwrite_original "
+               "'-XMP-dc:Description<=long' s.png");
+    EXPECT_THAT(convert(folder, "s.png", "t.jpg.jpg"), IsEmpty());
+    EXPECT_EQ(folder.output("exiftool -b -XMP-dc:Description t.jpg.jpg"), folder.text("long"));
+
+    Metadata metadata;
+    ExifBlock block({});
+    block.add({{tiff::Artist, tiff::Ascii, 60000, Bytes(60000, 'a')}});
+    Bytes exif = block.bytes();
+    const std::size_t directory = exif.size(); // of a thumbnail, which goes on behind it
+    append(exif, 2, 2, ByteOrder::Little);
+    for (const auto& [tag, value] :
+         {std::pair(tiff::JpegOffset, directory + 30), {tiff::JpegLength, std::size_t{9000}}}) {
+        append(exif, tag, 2, ByteOrder::Little);
+        append(exif, tiff::Long, 2, ByteOrder::Little);
+        append(exif, 1, 4, ByteOrder::Little);
+        append(exif, value, 4, ByteOrder::Little);
+    }
+    append(exif, 0, 4, ByteOrder::Little);
+    exif.resize(exif.size() + 9000);
+    store(exif, directory - 4, directory, 4, ByteOrder::Little);
+    metadata.exif = exif;
+    const ThumbnailMaker none = [](int, int, int) { return Bytes(); };
+    const PreparedMetadata fits = prepareMetadata(metadata, FileFormat::Jpeg, {1, 1, none});
+    EXPECT_EQ(fits.metadata.exif.size(), directory + 30);
+    EXPECT_THAT(fits.lost, ElementsAre("the thumbnail"));
+    block.add({{tiff::Copyright, tiff::Ascii, 9000, Bytes(9000, 'c')}});
+    metadata.exif = block.bytes();
+    const PreparedMetadata tooLong = prepareMetadata(metadata, FileFormat::Jpeg, {1, 1, none});
+    EXPECT_TRUE(tooLong.metadata.exif.empty());
+    EXPECT_THAT(tooLong.lost, ElementsAre(HasSubstr("64 KiB")));
+}
+
+TEST(Containers, ReadAndWriteBigTiff) {
+    const TestFolder folder;
+    folder.run("convert $S/coffee.png -resize 64x48! -strip s.jpg && vips tiffsave s.jpg big.tif --bigtiff");
+    const std::string camera = std::string(ORVELA_PHOTOS "/camera/canon-powershot-s40.jpg");
+    Metadata metadata = *readPhotograph(camera).metadata;
+    metadata.xmp = copyOf(asBytes("<x:xmpmeta xmlns:x='adobe:ns:meta/'/>"));
+    const std::string text = folder.text("big.tif");
+    Bytes file = copyOf(asBytes(text));
+    EXPECT_THAT(embedIntoTiff(metadata, file), IsEmpty());
+    EXPECT_THAT(missingInTiff(metadata, file), IsEmpty());
+    folder.put("t.tif", std::string(asText(file)));
+    const std::string notes = "exiftool -a -G1 -s -MakerNotes:all -x PreviewImageStart ";
+    EXPECT_EQ(folder.output(notes + "t.tif"), folder.output(notes + camera));
+    const Photograph read = readPhotograph(folder / "t.tif");
+    EXPECT_EQ(read.width, 64);
+    EXPECT_EQ(read.metadata->xmp, metadata.xmp);
+    writePhotograph(read, folder / "u.jpg");
+    const std::string list = "-ExifIFD:all -InteropIFD:all -x ExifImageWidth -x ExifImageHeight ";
+    EXPECT_EQ(folder.output(notes + list + "u.jpg"), folder.output(notes + list + camera));
+}
+
+// Whatever the bytes of a file are, reading them, making them ready and writing them ends well.
+TEST(Containers, SurviveMutations) {
+    const TestFolder folder;
+    folder.run("cp " ORVELA_PHOTOS "/camera/nikon-e950.jpg s.jpg && exiftool -q -overwrite_original "
+               "-IPTC:City=Bonn -Photoshop:CopyrightFlag=1 -XMP:Title=T -Comment=C s.jpg && "
+               "convert s.jpg s.psd");
+    for (const char* name : {"s.png", "s.tif", "s.webp", "s.heic"})
+        convert(folder, "s.jpg", name);
+    std::mt19937 random(2);
+    const ThumbnailMaker none = [](int, int, int) { return Bytes(); };
+    for (const char* name : {"s.jpg", "s.png", "s.tif", "s.webp", "s.heic", "s.psd"}) {
+        const std::string text = folder.text(name);
+        const Bytes whole = copyOf(asBytes(text));
+        const FileFormat format = formatOfContent(whole).value();
+        for (int run = 0; run < 150; ++run) {
+            Bytes mutant = whole;
+            for (int i = 0; i < 6; ++i)
+                mutant[random() % (i < 4 ? std::min<std::size_t>(6000, whole.size()) : whole.size())] =
+                    static_cast<std::uint8_t>(random());
+            if (run % 3 == 0)
+                mutant.resize(random() % mutant.size());
+            const Metadata metadata = readMetadata(mutant, format);
+            for (const FileFormat target : {FileFormat::Jpeg, FileFormat::Png, FileFormat::Tiff}) {
+                PreparedMetadata prepared = prepareMetadata(metadata, target, {8, 8, none});
+                Bytes encoded = target == FileFormat::Tiff
+                                    ? Bytes{'I', 'I', 42, 0, 8, 0, 0, 0, 0, 0, 0, 0, 0, 0}
+                                    : Bytes{0xFF, 0xD8, 0xFF, 0xDA, 0, 2, 0xFF, 0xD9};
+                embedMetadata(prepared, encoded);
+                metadataNotes(prepared, name);
+            }
+        }
+    }
+}
+
+} // namespace
