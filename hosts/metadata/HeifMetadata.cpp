@@ -84,7 +84,8 @@ void nameOtherPictures(heif_context* context, const heif_image_handle* picture, 
         metadata.unheld.emplace_back("the depth map");
     const int pictures = heif_context_get_number_of_top_level_images(context);
     if (pictures > 1)
-        metadata.unheld.push_back(std::to_string(pictures - 1) + " further pictures");
+        metadata.unheld.push_back(std::to_string(pictures - 1) +
+                                  (pictures > 2 ? " further pictures" : " further picture"));
 }
 
 } // namespace

@@ -23,10 +23,15 @@ using namespace std::string_view_literals;
 
 using Names = std::vector<std::string>;
 
+// A list that a line has room for.
 std::string joined(const Names& names, const char* between) {
+    constexpr std::size_t most = 160;
     std::string text;
-    for (const std::string& name : names)
-        text += (text.empty() ? "" : between) + name;
+    for (std::size_t i = 0; i < names.size(); ++i) {
+        if (text.size() > most)
+            return text + between + "and " + std::to_string(names.size() - i) + " more";
+        text += (i == 0 ? "" : between) + names[i];
+    }
     return text;
 }
 

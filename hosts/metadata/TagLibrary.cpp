@@ -73,9 +73,8 @@ std::vector<std::string> changed(const Exiv2::ExifData& before, const Exiv2::Exi
 
 RewrittenExif encode(const Exiv2::ExifData& tags, ByteOrder order) {
     Exiv2::Blob blob;
-    Exiv2::ExifData encoded = tags;
     Exiv2::ExifParser::encode(blob, order == ByteOrder::Little ? Exiv2::littleEndian : Exiv2::bigEndian,
-                              encoded);
+                              tags);
     RewrittenExif rewritten{Bytes(blob.begin(), blob.end()), {}};
     Exiv2::ExifData again;
     if (!rewritten.block.empty())

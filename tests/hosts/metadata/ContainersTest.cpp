@@ -3,6 +3,8 @@
 #include "files/PhotographReader.h"
 #include "files/PhotographWriter.h"
 #include "hosts/TestFiles.h"
+#include "hosts/TestPhotograph.h"
+#include "metadata/ImageResources.h"
 #include "metadata/MetadataReader.h"
 #include "metadata/MetadataWriter.h"
 #include "metadata/PngMetadata.h"
@@ -127,6 +129,46 @@ TEST(Containers, CarryPhotoshopsResources) {
                 ElementsAre(EndsWith("the WebP file cannot hold: IPTC Keywords, City; Photoshop's data")));
 }
 
+// Of an old program the thumbnail has its colours in another order; the new one has them in today's.
+TEST(Containers, RenewPhotoshopsThumbnail) {
+    const TestFolder folder;
+    folder.run("convert -size 40x30 xc:red t.jpg");
+    const std::string text = folder.text("t.jpg");
+    for (const std::uint16_t id : {resource::Thumbnail, resource::ThumbnailBgr}) {
+        Metadata metadata;
+        appendResource(metadata.resources, resource::Iptc, asBytes("odd"));
+        Bytes data(28);
+        append(data, asBytes(text));
+        appendResource(metadata.resources, id, data);
+        appendResource(metadata.resources, 0x0BB7, asBytes("path"));
+        Photograph photograph =
+            testPhotograph(ColorModel::Rgb, 8, 90, 90, [](std::size_t i) { return 100 + 50 * (i % 3); });
+        photograph.metadata = std::make_shared<const Metadata>(metadata);
+        EXPECT_THAT(writePhotograph(photograph, folder / "t.tif"), IsEmpty());
+        folder.run("exiftool -b -PhotoshopThumbnail t.tif >new.jpg");
+        EXPECT_EQ(
+            folder.output("convert new.jpg -format '%wx%h ' info: && convert new.jpg -crop 1x1+20+15 -format "
+                          "'%[fx:round(255*r)] %[fx:round(255*g)] ' info: && convert new.jpg -crop 1x1+1+15 "
+                          "-format '%[fx:r<0.04]' info:"),
+            "40x30 100 150 1"); // the picture, and black beside it
+        EXPECT_TRUE(sameResources(
+            withoutResources(readPhotograph(folder / "t.tif").metadata->resources, {resource::Thumbnail}),
+            withoutResources(metadata.resources, {id})));
+        folder.run("rm t.tif");
+    }
+}
+
+TEST(Containers, ReadPsd) {
+    const TestFolder folder;
+    folder.run("convert $S/coffee.png -resize 64x48! -strip -units PixelsPerInch -density 150 s.psd && "
+               "exiftool -q -overwrite_original -IPTC:City=Bonn -XMP:Title=T -EXIF:Artist=A s.psd && "
+               "convert $S/coffee.png -resize 64x48! '(' +clone -negate ')' '(' +clone ')' layers.psd");
+    EXPECT_THAT(convert(folder, "s.psd", "t.jpg"), IsEmpty());
+    EXPECT_EQ(folder.output("exiftool -s3 -IPTC:City -XMP:Title -EXIF:Artist -JFIF:XResolution t.jpg"),
+              "Bonn\nT\nA\n150\n");
+    EXPECT_THAT(convert(folder, "layers.psd", "t.tif"), ElementsAre(EndsWith("cannot hold: the layers")));
+}
+
 TEST(Containers, KeepSegmentsOfJpegAndNameWhatWouldLie) {
     const TestFolder folder;
     folder.run("convert $S/coffee.png -resize 64x48! -strip s.jpg && " +
@@ -203,6 +245,33 @@ TEST(Containers, ReadAndWriteBigTiff) {
     writePhotograph(read, folder / "u.jpg");
     const std::string list = "-ExifIFD:all -InteropIFD:all -x ExifImageWidth -x ExifImageHeight ";
     EXPECT_EQ(folder.output(notes + list + "u.jpg"), folder.output(notes + list + camera));
+}
+
+// Where the note cannot keep its distance the metadata library lays the block out anew.
+TEST(Containers, MoveAMakerNoteFromTheEndOfATiff) {
+    const TestFolder folder;
+    const std::string camera = ORVELA_PHOTOS "/camera/fujifilm-finepix-2400zoom.jpg";
+    folder.run(
+        "exiftool -b -MakerNoteFujiFilm " + camera + " >note && python3 -c \"import struct\n" +
+        "note = open('note', 'rb').read()\n"
+        "def ifd(*e): return struct.pack('<H', len(e)) + b''.join(struct.pack('<HHII', *x) for x in e) + "
+        "bytes(4)\n"
+        "exif = ifd((0x8827, 3, 1, 200), (0x927C, 7, len(note), 90100))\n"
+        "page = ifd((256, 3, 1, 300), (257, 3, 1, 300), (258, 3, 1, 8), (259, 3, 1, 1), (262, 3, 1, 1), "
+        "(271, 2, 9, 90050), (273, 4, 1, 8), (277, 3, 1, 1), (278, 3, 1, 300), (279, 4, 1, 90000), "
+        "(0x8769, 4, 1, 90060))\n"
+        "b = bytearray(90100) + note\n"
+        "b[:8] = struct.pack('<2sHI', b'II', 42, len(b))\n"
+        "b[90050:90059] = b'FUJIFILM\\0'\n"
+        "b[90060:90060 + len(exif)] = exif\n"
+        "open('s.tif', 'wb').write(b + page)\"");
+    const std::string list = "exiftool -a -s -MakerNotes:all -ISO ";
+    EXPECT_EQ(folder.output("exiftool -s3 -ISO s.tif"), "200\n");
+    for (const char* target : {"t.jpg", "t.tif"}) {
+        EXPECT_THAT(convert(folder, "s.tif", target), IsEmpty()) << target;
+        EXPECT_EQ(folder.output(list + target), folder.output(list + "s.tif")) << target;
+    }
+    EXPECT_THAT(folder.output(list + "t.jpg"), HasSubstr("Sharpness"));
 }
 
 // Whatever the bytes of a file are, reading them, making them ready and writing them ends well.
