@@ -96,8 +96,13 @@ bool sameResources(ByteView a, ByteView b) {
     const auto sorted = [](ByteView list) {
         std::vector<std::pair<std::uint16_t, std::string_view>> all;
         const ImageResources resources = imageResources(list);
-        for (const ImageResource& one : resources.list)
-            all.emplace_back(one.id, asText(one.data));
+        for (const ImageResource& one : resources.list) {
+            std::string_view text = asText(one.data);
+            if (one.id == resource::Iptc)
+                text = text.substr(0, text.find_last_not_of('\0') + 1);
+            if (one.id != resource::Iptc || !text.empty())
+                all.emplace_back(one.id, text);
+        }
         all.emplace_back(0, asText(resources.rest));
         std::sort(all.begin(), all.end());
         return all;

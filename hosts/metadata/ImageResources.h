@@ -39,7 +39,7 @@ Bytes withoutResources(ByteView list, const std::vector<std::uint16_t>& ids);
 
 void appendResource(Bytes& list, std::uint16_t id, ByteView data);
 
-/// Whether the lists hold the same, in any order.
+/// Whether the lists hold the same, in any order. Zeros behind the IPTC records are not looked at.
 bool sameResources(ByteView a, ByteView b);
 
 /// The pixels per inch that the resolution resource states.

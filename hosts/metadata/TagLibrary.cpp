@@ -58,7 +58,7 @@ std::vector<std::string> changed(const Exiv2::ExifData& before, const Exiv2::Exi
         there.emplace(datum.key(), datum.toString());
     std::vector<std::string> names;
     for (const Exiv2::Exifdatum& datum : before) {
-        if (isPlacement(datum))
+        if (isPlacement(datum) || !describesPicture(datum))
             continue;
         const auto [first, last] = there.equal_range(datum.key());
         const auto same =
