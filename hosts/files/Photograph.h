@@ -1,8 +1,10 @@
 #pragma once
 
+#include <array>
 #include <cstdint>
 #include <filesystem>
 #include <memory>
+#include <optional>
 #include <stdexcept>
 #include <string>
 #include <vector>
@@ -45,15 +47,43 @@ constexpr int samplesPerPixel(ColorModel model) {
 
 enum class FileFormat { Jpeg, Png, Tiff, WebP, Psd, Heif };
 
+/// How the components of a JPEG are stored.
+struct JpegLayout {
+    enum class Color { Grey, YCbCr, Rgb, Cmyk, Ycck };
+
+    struct Component {
+        int horizontal = 1;                        ///< sampling factor, 1 to 4
+        int vertical = 1;                          ///< sampling factor, 1 to 4
+        int table = 0;                             ///< number of its quantization table, 0 to 3
+        std::array<std::uint16_t, 64> quantizer{}; ///< that table, rows from the top
+
+        bool operator==(const Component&) const = default;
+    };
+
+    Color color = Color::YCbCr;
+    bool adobeMarker = false; ///< CMYK and YCCK: whether it is marked as such
+    std::vector<Component> components;
+
+    bool operator==(const JpegLayout&) const = default;
+};
+
+/// Resolution of colour beside that of brightness: full (4:4:4), half horizontally (4:2:2), half both ways
+/// (4:2:0).
+enum class Chroma { Full, HalfWidth, Half };
+
+/// Parts of the picture of a HEIF and how many bytes a pixel took, to find a quality that takes as many.
+struct HeifRate;
+
 /// How the source was encoded, so that the result can be written alike.
 struct Encoding {
     FileFormat format = FileFormat::Png;
-    int quality = 0;              ///< JPEG, WebP and HEIF quality 1 to 100; 0 when unknown
-    bool chromaSubsampled = true; ///< JPEG chroma at half resolution
     bool lossless = false;        ///< WebP without loss
-    std::string compression;      ///< by its library name: TIFF "lzw" and others, HEIF "hevc" or "av1"
     bool progressive = false;     ///< interlaced or progressive
+    std::string compression;      ///< by its library name: TIFF "lzw" and others, HEIF "hevc" or "av1"
     int bitDepth = 0;             ///< HEIF: bits per sample in the file (8, 10 or 12); 0 when unknown
+    Chroma chroma = Chroma::Full; ///< HEIF
+    std::shared_ptr<const HeifRate> heifRate; ///< HEIF
+    std::optional<JpegLayout> jpeg;           ///< JPEG
 };
 
 /// What a file holds beside its picture: Exif, XMP, IPTC, comment. See Metadata.h.
@@ -74,6 +104,7 @@ struct Photograph {
     std::string resolutionUnit;           ///< unit in which the file gives them: "in", "cm" or empty
     int pages = 1;                        ///< pages or animation frames of the file; only the first is held
     Encoding encoding;
+    std::vector<std::string> unheld;          ///< what no target can hold of its file: "the gain map", ...
     std::shared_ptr<const Metadata> metadata; ///< of the file it was read from; null when it comes from none
     std::filesystem::path source;             ///< that file, for messages and so that it is never overwritten
 };
