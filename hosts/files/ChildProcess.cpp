@@ -4,6 +4,7 @@
 
 #include <fcntl.h>
 #include <poll.h>
+#include <pthread.h>
 #include <sys/mman.h>
 #include <sys/prctl.h>
 #include <sys/wait.h>
@@ -21,8 +22,9 @@ namespace orvela {
 
 namespace {
 
-constexpr int kLookAgain = 100; // milliseconds
-constexpr int kMostIdle = 300;  // looks without any work done: a thread waits for another that never started
+constexpr int kLookAgain = 100;         // milliseconds
+constexpr std::size_t kStack = 1 << 20; // bytes
+constexpr int kMostIdle = 300; // looks without any work done: a thread waits for another that never started
 
 } // namespace
 
@@ -41,13 +43,20 @@ bool* lacksMemory = nullptr; // in the child: where it tells so
     ::_exit(1);
 }
 
-// Neither messages of the libraries nor a core file; and no life of its own.
+// Neither messages of the libraries nor a core file, and no life of its own. Stacks of a usual size, eight
+// times what codecs are content with elsewhere, would fill a small address space, and a codec may wait for a
+// thread that could not start.
 void detach() {
     ::prctl(PR_SET_PDEATHSIG, SIGKILL);
     ::prctl(PR_SET_DUMPABLE, 0);
     const int nowhere = ::open("/dev/null", O_RDWR);
     for (const int handle : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO})
         ::dup2(nowhere, handle);
+    pthread_attr_t attributes{};
+    ::pthread_attr_init(&attributes);
+    ::pthread_attr_setstacksize(&attributes, kStack);
+    ::pthread_setattr_default_np(&attributes);
+    ::pthread_attr_destroy(&attributes);
 }
 
 } // namespace
