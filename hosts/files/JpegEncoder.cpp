@@ -106,8 +106,8 @@ void reduceFactors(JpegLayout& layout) {
         vertical = std::gcd(vertical, component.vertical);
     }
     for (JpegLayout::Component& component : layout.components) {
-        component.horizontal /= horizontal;
-        component.vertical /= vertical;
+        component.horizontal /= std::max(1, horizontal);
+        component.vertical /= std::max(1, vertical);
     }
 }
 
