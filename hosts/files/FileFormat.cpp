@@ -37,14 +37,6 @@ bool isHeif(ByteView file) {
            std::any_of(brands.begin(), brands.end(), [&](auto brand) { return holds(file, 8, brand); });
 }
 
-bool hasAlpha(ColorModel model) {
-    return model == ColorModel::GreyAlpha || model == ColorModel::RgbAlpha;
-}
-
-bool isRgb(ColorModel model) {
-    return model == ColorModel::Rgb || model == ColorModel::RgbAlpha;
-}
-
 std::string cannotHold(FileFormat format, const std::string& what, const char* instead) {
     return std::string(formatName(format)) + " cannot hold " + what + "; choose " + instead;
 }
@@ -85,32 +77,21 @@ std::string pixelName(ColorModel model, int depth) {
 }
 
 std::string formatObstacle(FileFormat format, const Photograph& photograph) {
-    const ColorModel model = photograph.model;
-    const bool deep = photograph.depth == 16;
-    const int largest = std::max(photograph.width, photograph.height);
-    const std::string pixels = pixelName(model, photograph.depth) + " pictures";
+    const bool inks = photograph.model == ColorModel::Cmyk;
     switch (format) {
     case FileFormat::Jpeg:
-        if (deep || hasAlpha(model))
-            return cannotHold(format, pixels, "a PNG or TIFF target");
-        break;
-    case FileFormat::Png:
-        if (model == ColorModel::Cmyk)
-            return cannotHold(format, pixels, "a TIFF target");
-        break;
     case FileFormat::Tiff:
-        break;
-    case FileFormat::WebP:
-        if (deep || !isRgb(model))
-            return cannotHold(format, pixels, model == ColorModel::Cmyk ? "a TIFF target" : "a PNG target");
-        if (largest > 16383)
-            return cannotHold(format, "edges over 16383 pixels", "a PNG or TIFF target");
         break;
     case FileFormat::Psd:
         return "PSD files can be read but not written; choose a TIFF target";
+    case FileFormat::Png:
+    case FileFormat::WebP:
     case FileFormat::Heif:
-        if (!isRgb(model) || (deep && photograph.encoding.bitDepth <= 8))
-            return cannotHold(format, pixels, model == ColorModel::Cmyk ? "a TIFF target" : "a PNG target");
+        if (inks)
+            return cannotHold(format, pixelName(photograph.model, photograph.depth) + " pictures",
+                              "a TIFF target");
+        if (format == FileFormat::WebP && std::max(photograph.width, photograph.height) > 16383)
+            return cannotHold(format, "edges over 16383 pixels", "a PNG or TIFF target");
         break;
     }
     return {};

@@ -16,8 +16,8 @@ std::optional<FileFormat> formatOfExtension(const std::filesystem::path& path);
 /// "8-bit CMYK" and the like, for messages.
 std::string pixelName(ColorModel model, int depth);
 
-/// Why a file of this format cannot hold the picture, with what to do instead; empty when it can. A deep HEIF
-/// target is possible only for a HEIF source, whose 10 or 12 bits it takes.
+/// Why a file of this format cannot hold the picture, not even after a Conversion, with what to do instead;
+/// empty when it can.
 std::string formatObstacle(FileFormat format, const Photograph& photograph);
 
 /// Where the result of `source` goes when nothing else is said: NAME-enhanced.EXT beside it, with the

@@ -2,9 +2,11 @@
 
 #include "metadata/Metadata.h"
 
+#include <array>
 #include <cstdint>
 #include <filesystem>
 #include <memory>
+#include <optional>
 #include <stdexcept>
 #include <string>
 #include <vector>
@@ -45,15 +47,43 @@ constexpr int samplesPerPixel(ColorModel model) {
     }
 }
 
+/// How the components of a JPEG are stored.
+struct JpegLayout {
+    enum class Color { Grey, YCbCr, Rgb, Cmyk, Ycck };
+
+    struct Component {
+        int horizontal = 1;                        ///< sampling factor, 1 to 4
+        int vertical = 1;                          ///< sampling factor, 1 to 4
+        int table = 0;                             ///< number of its quantization table, 0 to 3
+        std::array<std::uint16_t, 64> quantizer{}; ///< that table, rows from the top
+
+        bool operator==(const Component&) const = default;
+    };
+
+    Color color = Color::YCbCr;
+    bool adobeMarker = false; ///< CMYK and YCCK: whether it is marked as such
+    std::vector<Component> components;
+
+    bool operator==(const JpegLayout&) const = default;
+};
+
+/// Resolution of colour beside that of brightness: full (4:4:4), half horizontally (4:2:2), half both ways
+/// (4:2:0).
+enum class Chroma { Full, HalfWidth, Half };
+
+/// Parts of the picture of a HEIF and how many bytes a pixel took, to find a quality that takes as many.
+struct HeifRate;
+
 /// How the source was encoded, so that the result can be written alike.
 struct Encoding {
     FileFormat format = FileFormat::Png;
-    int quality = 0;              ///< JPEG, WebP and HEIF quality 1 to 100; 0 when unknown
-    bool chromaSubsampled = true; ///< JPEG chroma at half resolution
     bool lossless = false;        ///< WebP without loss
-    std::string compression;      ///< by its library name: TIFF "lzw" and others, HEIF "hevc" or "av1"
     bool progressive = false;     ///< interlaced or progressive
+    std::string compression;      ///< by its library name: TIFF "lzw" and others, HEIF "hevc" or "av1"
     int bitDepth = 0;             ///< HEIF: bits per sample in the file (8, 10 or 12); 0 when unknown
+    Chroma chroma = Chroma::Full; ///< HEIF
+    std::shared_ptr<const HeifRate> heifRate; ///< HEIF
+    std::optional<JpegLayout> jpeg;           ///< JPEG
 };
 
 /// A photograph in memory: interleaved samples, rows from the top without padding, 8 bits or native 16 bits

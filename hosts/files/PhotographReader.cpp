@@ -1,6 +1,8 @@
 #include "files/PhotographReader.h"
 
 #include "files/EncodingProbe.h"
+#include "files/HeifReader.h"
+#include "files/JpegReader.h"
 #include "files/PsdFile.h"
 #include "files/Refusal.h"
 #include "files/Vips.h"
@@ -76,9 +78,6 @@ VipsImage* load(const Bytes& file, FileFormat format) {
                       VIPS_FAIL_ON_TRUNCATED, nullptr);
     };
     switch (format) {
-    case FileFormat::Jpeg:
-        run(vips_jpegload_buffer);
-        break;
     case FileFormat::Png:
         run(vips_pngload_buffer);
         break;
@@ -88,10 +87,9 @@ VipsImage* load(const Bytes& file, FileFormat format) {
     case FileFormat::WebP:
         run(vips_webpload_buffer);
         break;
+    case FileFormat::Jpeg: // these have readers of their own
     case FileFormat::Heif:
-        run(vips_heifload_buffer);
-        break;
-    case FileFormat::Psd: // see PsdFile
+    case FileFormat::Psd:
         break;
     }
     return image;
@@ -100,8 +98,7 @@ VipsImage* load(const Bytes& file, FileFormat format) {
 VipsHandle open(const fs::path& path, const Bytes& file, FileFormat format) {
     startVips();
     vips_error_clear();
-    if ((format == FileFormat::Jpeg && !jpegIsComplete(file)) ||
-        (format == FileFormat::Png && !pngIsComplete(file)))
+    if (format == FileFormat::Png && !pngIsComplete(file))
         refuse(path, "the file is cut short", kCopyAgain);
     VipsHandle image(load(file, format));
     if (!image)
@@ -141,13 +138,6 @@ int depthOf(const fs::path& path, VipsImage* image) {
            "convert it to 8 or 16 bits per channel");
 }
 
-std::string textField(VipsImage* image, const char* name) {
-    const char* text = nullptr;
-    if (vips_image_get_typeof(image, name) == 0 || vips_image_get_string(image, name, &text) != 0)
-        return {};
-    return text;
-}
-
 int numberField(VipsImage* image, const char* name) {
     int value = 0;
     if (vips_image_get_typeof(image, name) != 0)
@@ -155,9 +145,7 @@ int numberField(VipsImage* image, const char* name) {
     return value;
 }
 
-Encoding encodingOf(const Bytes& file, FileFormat format, VipsImage* image) {
-    if (format == FileFormat::Jpeg)
-        return probeJpeg(file);
+Encoding encodingOf(const Bytes& file, FileFormat format) {
     Encoding encoding;
     encoding.format = format;
     if (format == FileFormat::Png)
@@ -166,10 +154,6 @@ Encoding encodingOf(const Bytes& file, FileFormat format, VipsImage* image) {
         encoding.compression = probeTiffCompression(file);
     if (format == FileFormat::WebP)
         encoding.lossless = webpIsLossless(file);
-    if (format == FileFormat::Heif) {
-        encoding.compression = textField(image, "heif-compression");
-        encoding.bitDepth = numberField(image, "heif-bitdepth");
-    }
     return encoding;
 }
 
@@ -200,20 +184,10 @@ int storeRows(VipsRegion* region, VipsRect* area, void* target) {
     return 0;
 }
 
-// The library shifts 10 and 12 bits up to 16; repeating the high bits below makes full scale 65535.
-void fillLowBits(Photograph& photograph) {
-    const int bits = photograph.encoding.bitDepth;
-    auto* samples = reinterpret_cast<std::uint16_t*>(photograph.samples.data());
-    for (std::size_t i = 0; i < photograph.samples.size() / 2; ++i)
-        samples[i] = static_cast<std::uint16_t>(samples[i] | samples[i] >> bits);
-}
-
 void takeSamples(Photograph& photograph, const fs::path& path, VipsImage* image) {
     photograph.samples.resize(VIPS_IMAGE_SIZEOF_IMAGE(image));
     if (vips_sink_disc(image, storeRows, photograph.samples.data()) != 0)
         refuse(path, "is damaged or cut short (" + takeVipsError() + ")", kCopyAgain);
-    if (photograph.depth == 16 && photograph.encoding.bitDepth > 8)
-        fillLowBits(photograph);
 }
 
 Photograph decode(const Bytes& file, FileFormat format, const fs::path& path) {
@@ -225,11 +199,24 @@ Photograph decode(const Bytes& file, FileFormat format, const fs::path& path) {
     photograph.model = modelOf(path, image.get());
     photograph.depth = depthOf(path, image.get());
     checkEdges(photograph.width, photograph.height, path);
-    photograph.encoding = encodingOf(file, format, image.get());
+    photograph.encoding = encodingOf(file, format);
     photograph.pages = std::max(1, numberField(image.get(), VIPS_META_N_PAGES));
     takeProfile(photograph, image.get());
     takeSamples(photograph, path, image.get());
     return photograph;
+}
+
+Photograph read(const Bytes& file, FileFormat format, const fs::path& path) {
+    switch (format) {
+    case FileFormat::Jpeg:
+        return readJpeg(file, path);
+    case FileFormat::Heif:
+        return readHeif(file, path);
+    case FileFormat::Psd:
+        return readPsd(file, path);
+    default:
+        return decode(file, format, path);
+    }
 }
 
 } // namespace
@@ -240,7 +227,7 @@ Photograph readPhotograph(const fs::path& path) {
     if (!format)
         refuse(path, "is not a picture of a known kind",
                "JPEG, PNG, TIFF, WebP, PSD and HEIF files can be read");
-    Photograph photograph = *format == FileFormat::Psd ? readPsd(file, path) : decode(file, *format, path);
+    Photograph photograph = read(file, *format, path);
     photograph.metadata = std::make_shared<const Metadata>(readMetadata(file, *format));
     takeResolution(photograph);
     return photograph;

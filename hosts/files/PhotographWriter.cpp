@@ -1,5 +1,6 @@
 #include "files/PhotographWriter.h"
 
+#include "files/Conversion.h"
 #include "files/PhotographEncoder.h"
 #include "files/TargetFile.h"
 #include "files/Thumbnail.h"
@@ -33,10 +34,17 @@ std::vector<std::string> writePhotograph(const Photograph& photograph, const fs:
                                          const WriteOptions& options) {
     const FileFormat format = targetFormat(photograph, target);
     checkTargetPath(target, photograph.source, options.overwrite);
+    const Conversion conversion = conversionFor(format, photograph);
+    std::optional<Photograph> changed;
+    if (changesSamples(conversion))
+        changed = converted(photograph, conversion);
+    const Photograph& written = changed ? *changed : photograph;
     PreparedMetadata metadata =
         prepareMetadata(photograph.metadata ? *photograph.metadata : Metadata(), format,
-                        {photograph.width, photograph.height, thumbnailsOf(photograph)});
-    Bytes encoded = encodePhotograph(photograph, format, target, options, metadata.metadata);
+                        {photograph.width, photograph.height, thumbnailsOf(written)});
+    const std::vector<std::string> lost = losses(conversion);
+    metadata.lost.insert(metadata.lost.begin(), lost.begin(), lost.end());
+    Bytes encoded = encodePhotograph(written, format, target, options, metadata.metadata);
     embedMetadata(metadata, encoded);
     TargetFile file(target);
     file.write(encoded, options.stop);

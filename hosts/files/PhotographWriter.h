@@ -9,12 +9,13 @@
 
 namespace orvela {
 
-/// How to write; whatever is not given follows the source where it has the target's format, otherwise JPEG
-/// quality 92, WebP and HEIF 90, full chroma resolution, LZW.
+/// How to write; whatever is not given follows the source where it has the target's format: JPEG by its
+/// quantization tables, HEIF by a quality that takes as many bytes per pixel. Otherwise JPEG quality 92, WebP
+/// and HEIF 90, full chroma resolution, LZW.
 struct WriteOptions {
     bool overwrite = false;                  ///< replace an existing target; never the source itself
     int quality = 0;                         ///< JPEG, WebP, HEIF: 1 to 100; 0 as the source
-    std::optional<bool> chromaSubsampled;    ///< JPEG, HEIF: colour at half resolution both ways
+    std::optional<bool> chromaSubsampled;    ///< JPEG, HEIF: colour at half resolution both ways, or at full
     std::optional<bool> lossless;            ///< WebP
     std::optional<bool> progressive;         ///< JPEG, PNG
     std::string compression;                 ///< TIFF: "none", "lzw", "deflate", "packbits", "zstd" or "jpeg"
@@ -33,8 +34,8 @@ void checkTarget(const Photograph& photograph, const std::filesystem::path& targ
 /// The target appears whole or not at all: the bytes go to a temporary name in its folder, which is removed
 /// on every failure, and take the final name once they are on the disk. Without `overwrite` a file that
 /// appears under the final name meanwhile is left alone.
-/// @return warnings: metadata that could not be carried over
-/// @throws PhotographError when the format is unknown or cannot hold the picture; never a silent conversion
+/// @return warnings: what the format cannot hold, metadata that could not be carried over
+/// @throws PhotographError when the format is unknown or cannot hold the picture
 /// @throws TargetError when the target cannot be written
 /// @throws StoppedError when `stop` was set
 std::vector<std::string> writePhotograph(const Photograph& photograph, const std::filesystem::path& target,

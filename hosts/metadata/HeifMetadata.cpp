@@ -58,6 +58,23 @@ void takeItem(const heif_image_handle* picture, heif_item_id id, Metadata& metad
     }
 }
 
+std::string nameOf(std::string_view kind) {
+    constexpr std::array<std::pair<std::string_view, const char*>, 8> names = {{
+        {"hdrgainmap", "the gain map"},
+        {"auxid:2", "the depth map"},
+        {"auxiliary:depth", "the depth map"},
+        {"portraiteffectsmatte", "the portrait matte"},
+        {"semanticskinmatte", "the skin matte"},
+        {"semantichairmatte", "the hair matte"},
+        {"semanticteethmatte", "the teeth matte"},
+        {"semanticskymatte", "the sky matte"},
+    }};
+    for (const auto& [part, name] : names)
+        if (kind.find(part) != std::string_view::npos)
+            return name;
+    return "the auxiliary picture \"" + std::string(kind) + "\"";
+}
+
 void nameOtherPictures(heif_context* context, const heif_image_handle* picture, Metadata& metadata) {
     Items ids{};
     const int others = heif_image_handle_get_list_of_auxiliary_image_IDs(
@@ -72,10 +89,7 @@ void nameOtherPictures(heif_context* context, const heif_image_handle* picture, 
         const Handle owner(auxiliary);
         std::string name = "an auxiliary picture";
         if (heif_image_handle_get_auxiliary_type(auxiliary, &type).code == heif_error_Ok && type != nullptr) {
-            const std::string_view kind = type;
-            name = kind.find("gainmap") != std::string_view::npos
-                       ? "the gain map"
-                       : "the auxiliary picture " + std::string(kind.substr(kind.find_last_of(":/") + 1));
+            name = nameOf(type);
             heif_image_handle_free_auxiliary_types(auxiliary, &type);
         }
         metadata.unheld.push_back(name);

@@ -66,20 +66,15 @@ TEST(PhotographReader, ReadsBitmapsAsGreyAndTheFirstPageOfSeveral) {
     EXPECT_EQ(first.height, 3);
 }
 
-// Quality 75 4:2:2 keeps its horizontal resolution; 10 bits of HEIF reach full scale.
+// 10 bits of HEIF reach full scale.
 TEST(PhotographReader, TellsTheEncoding) {
     const TestFolder folder;
     folder.run(
-        "convert $S/rocket.jpg -sampling-factor 2x1 -quality 75 h.jpg && vips black b.v 64 64 --bands 3 && "
+        "vips black b.v 64 64 --bands 3 && "
         "vips linear b.v w.v 1 65535 && vips cast w.v w.png ushort && vips heifsave w.png w.heic --bitdepth "
         "10 --Q 100 && "
-        "convert $S/rocket.jpg -units PixelsPerInch -density 300x150 -sampling-factor 2x2 -quality 12 d.jpg");
-    const Photograph half = readPhotograph(folder / "h.jpg");
-    EXPECT_EQ(half.encoding.quality, 75);
-    EXPECT_FALSE(half.encoding.chromaSubsampled);
+        "convert $S/rocket.jpg -units PixelsPerInch -density 300x150 d.jpg");
     const Photograph dense = readPhotograph(folder / "d.jpg");
-    EXPECT_EQ(dense.encoding.quality, 12);
-    EXPECT_TRUE(dense.encoding.chromaSubsampled);
     EXPECT_NEAR(dense.xResolution, 300 / 25.4, 1e-6);
     EXPECT_NEAR(dense.yResolution, 150 / 25.4, 1e-6);
     const Photograph white = readPhotograph(folder / "w.heic");

@@ -126,8 +126,8 @@ TEST_P(RoundTrip, KeepsPixelsAndMetadata) {
     EXPECT_EQ(again.model, c.model);
     EXPECT_EQ(again.depth, c.depth);
     if (read.encoding.format == again.encoding.format) {
-        EXPECT_EQ(again.encoding.quality, read.encoding.quality);
-        EXPECT_EQ(again.encoding.chromaSubsampled, read.encoding.chromaSubsampled);
+        EXPECT_EQ(again.encoding.jpeg, read.encoding.jpeg);
+        EXPECT_EQ(again.encoding.chroma, read.encoding.chroma);
         EXPECT_EQ(again.encoding.compression, read.encoding.compression);
         EXPECT_EQ(again.encoding.lossless, read.encoding.lossless);
         EXPECT_EQ(again.encoding.progressive, read.encoding.progressive);

@@ -42,7 +42,8 @@ TEST_P(CameraFiles, KeepEveryTag) {
     fs::create_directories(folder / "after");
     fs::create_directories(folder / "back");
     // What is decoded from a HEIF is upright.
-    const std::string left = extension == "jpg" ? "" : extension == "heic" ? "-x Orientation " : kStorage;
+    const std::string left =
+        std::string(extension == "jpg" ? "" : kStorage) + (extension == "heic" ? "-x Orientation " : "");
     const auto list = [&](const std::string& in) {
         folder.run(kList + left + "-w! " + in + "/%f.txt " + in);
     };
@@ -67,7 +68,7 @@ TEST_P(CameraFiles, KeepEveryTag) {
     }
 }
 
-INSTANTIATE_TEST_SUITE_P(Into, CameraFiles, testing::Values("jpg", "png", "webp", "tif"),
+INSTANTIATE_TEST_SUITE_P(Into, CameraFiles, testing::Values("jpg", "png", "webp", "heic", "tif"),
                          [](const auto& extension) { return std::string(extension.param); });
 
 // Of each: what the thumbnail shows is the picture that is written, in the old one's size and place.

@@ -1,0 +1,197 @@
+#include "files/HeifBoxes.h"
+
+#include <map>
+#include <stdexcept>
+#include <string_view>
+
+namespace orvela {
+
+namespace {
+
+using Items = std::vector<std::uint32_t>;
+
+/// Takes numbers, most significant byte first, off the front of bytes.
+class Cursor {
+public:
+    explicit Cursor(ByteView bytes) : mBytes(bytes) {}
+
+    bool isAtEnd() const { return mBytes.empty(); }
+
+    /// @throws std::out_of_range behind the end
+    ByteView take(std::uint64_t size) {
+        if (size > mBytes.size())
+            throw std::out_of_range("a box is cut short");
+        const ByteView taken = mBytes.first(static_cast<std::size_t>(size));
+        mBytes = mBytes.subspan(static_cast<std::size_t>(size));
+        return taken;
+    }
+    std::uint64_t number(std::uint64_t size) {
+        std::uint64_t value = 0;
+        for (const std::uint8_t byte : take(size))
+            value = value << 8 | byte;
+        return value;
+    }
+    std::uint32_t id(bool wide) { return static_cast<std::uint32_t>(number(wide ? 4 : 2)); }
+
+    ByteView rest() const { return mBytes; }
+
+private:
+    ByteView mBytes;
+};
+
+struct Box {
+    std::string_view type;
+    ByteView content;
+};
+
+Box nextBox(Cursor& cursor) {
+    const std::size_t whole = cursor.rest().size();
+    std::uint64_t size = cursor.number(4);
+    const ByteView type = cursor.take(4);
+    if (size == 1)
+        size = cursor.number(8);
+    const std::size_t head = whole - cursor.rest().size();
+    if (size == 0)
+        size = whole; // up to the end
+    if (size < head)
+        throw std::out_of_range("a box is smaller than its head");
+    return {{reinterpret_cast<const char*>(type.data()), type.size()}, cursor.take(size - head)};
+}
+
+std::vector<Box> boxesOf(ByteView content) {
+    std::vector<Box> boxes;
+    for (Cursor cursor(content); !cursor.isAtEnd();)
+        boxes.push_back(nextBox(cursor));
+    return boxes;
+}
+
+// Does not look behind the box.
+ByteView boxIn(ByteView content, std::string_view type) {
+    for (Cursor cursor(content);;)
+        if (const Box box = nextBox(cursor); box.type == type)
+            return box.content;
+}
+
+/// The version of a full box and what follows version and flags.
+struct FullBox {
+    explicit FullBox(ByteView box) : content(box) {
+        version = static_cast<int>(content.number(1));
+        flags = content.number(3);
+    }
+
+    Cursor content;
+    int version = 0;
+    std::uint64_t flags = 0;
+};
+
+std::uint32_t primaryItem(ByteView pitm) {
+    FullBox box(pitm);
+    return box.content.id(box.version > 0);
+}
+
+// The items that an item is put together from, in order; none when it is coded itself.
+Items partsOf(ByteView meta, std::uint32_t item) {
+    for (const Box& candidate : boxesOf(meta)) {
+        if (candidate.type != "iref")
+            continue;
+        FullBox box(candidate.content);
+        const bool wide = box.version > 0;
+        for (const Box& reference : boxesOf(box.content.rest())) {
+            Cursor cursor(reference.content);
+            if (reference.type != "dimg" || cursor.id(wide) != item)
+                continue;
+            Items parts(cursor.id(false));
+            for (std::uint32_t& part : parts)
+                part = cursor.id(wide);
+            return parts;
+        }
+    }
+    return {};
+}
+
+// The bytes that each item takes in the file.
+std::map<std::uint32_t, std::uint64_t> itemSizes(ByteView iloc) {
+    FullBox box(iloc);
+    Cursor& cursor = box.content;
+    const std::uint64_t fields = cursor.number(2);
+    const auto width = [&](int field) { return fields >> (12 - 4 * field) & 15; };
+    std::map<std::uint32_t, std::uint64_t> sizes;
+    for (std::uint32_t count = cursor.id(box.version == 2); count > 0; --count) {
+        const std::uint32_t item = cursor.id(box.version == 2);
+        if (box.version > 0)
+            cursor.take(2); // where the offsets count from
+        cursor.take(2 + width(2));
+        for (std::uint64_t extents = cursor.number(2); extents > 0; --extents) {
+            cursor.take((box.version > 0 ? width(3) : 0) + width(0));
+            sizes[item] += cursor.number(width(1));
+        }
+    }
+    return sizes;
+}
+
+// The properties of an item, as numbers counted from 1.
+Items propertiesOf(ByteView ipma, std::uint32_t item) {
+    FullBox box(ipma);
+    const bool wide = (box.flags & 1) != 0;
+    for (std::uint64_t count = box.content.number(4); count > 0; --count) {
+        const bool found = box.content.id(box.version > 0) == item;
+        Items properties(box.content.number(1));
+        for (std::uint32_t& property : properties)
+            property = static_cast<std::uint32_t>(box.content.number(wide ? 2 : 1)) & (wide ? 0x7FFF : 0x7F);
+        if (found)
+            return properties;
+    }
+    return {};
+}
+
+Chroma chromaOf(const Box& configuration) {
+    Cursor cursor(configuration.content);
+    if (configuration.type == "av1C") {
+        cursor.take(2);
+        const std::uint64_t halves = cursor.number(1) >> 2 & 3; // both ways, horizontally
+        return halves == 0 ? Chroma::Full : halves == 2 ? Chroma::HalfWidth : Chroma::Half;
+    }
+    cursor.take(16);
+    const std::uint64_t format = cursor.number(1) & 3;
+    return format == 3 ? Chroma::Full : format == 2 ? Chroma::HalfWidth : Chroma::Half;
+}
+
+HeifCoding codingOf(ByteView file) {
+    const ByteView meta = FullBox(boxIn(file, "meta")).content.rest();
+    Items items = {primaryItem(boxIn(meta, "pitm"))};
+    // A picture of tiles may itself be turned or framed by another item.
+    for (int depth = 0; depth < 3; ++depth) {
+        Items parts = partsOf(meta, items[0]);
+        if (parts.empty())
+            break;
+        items = std::move(parts);
+    }
+    HeifCoding coding;
+    auto sizes = itemSizes(boxIn(meta, "iloc"));
+    for (const std::uint32_t item : items)
+        coding.bytes += sizes[item];
+    const ByteView properties = boxIn(meta, "iprp");
+    const std::vector<Box> all = boxesOf(boxIn(properties, "ipco"));
+    for (const std::uint32_t number : propertiesOf(boxIn(properties, "ipma"), items[0])) {
+        if (number == 0 || number > all.size())
+            continue;
+        const Box& property = all[number - 1];
+        if (property.type == "hvcC" || property.type == "av1C") {
+            coding.isAv1 = property.type == "av1C";
+            coding.chroma = chromaOf(property);
+        }
+    }
+    return coding;
+}
+
+} // namespace
+
+std::optional<HeifCoding> heifCoding(ByteView file) {
+    try {
+        return codingOf(file);
+    } catch (const std::out_of_range&) {
+        return std::nullopt;
+    }
+}
+
+} // namespace orvela

@@ -1,0 +1,17 @@
+#pragma once
+
+#include "files/FileFormat.h"
+
+namespace orvela {
+
+/// How the primary picture of a HEIF is coded, its tiles together.
+struct HeifCoding {
+    bool isAv1 = false;
+    Chroma chroma = Chroma::Half; ///< of a grey picture Half too
+    std::uint64_t bytes = 0;      ///< that it takes, without metadata and other pictures
+};
+
+/// Reads it from the boxes of the file; none where they do not tell.
+std::optional<HeifCoding> heifCoding(ByteView file);
+
+} // namespace orvela

@@ -1,0 +1,152 @@
+#include "files/HeifReader.h"
+
+#include "files/ChildProcess.h"
+#include "files/HeifBoxes.h"
+#include "files/HeifLibrary.h"
+#include "files/HeifRate.h"
+#include "files/Refusal.h"
+
+#include <algorithm>
+#include <cstring>
+
+namespace orvela {
+
+namespace {
+
+namespace fs = std::filesystem;
+
+// What decoding takes beside the result at the most.
+constexpr std::uint64_t kDecoderBytesPerPixel = 32;
+constexpr std::uint64_t kDecoderBytes = 100'000'000;
+
+/// What the child sends first; profile and samples follow.
+struct Head {
+    std::int32_t width;
+    std::int32_t height;
+    std::int32_t bits;
+    std::int32_t hasAlpha;
+    std::int32_t pictures;
+    std::uint64_t profileSize;
+};
+
+/// The file in the hands of the library; lives in the child.
+class Decoder {
+public:
+    explicit Decoder(ByteView file) : mContext(heif_context_alloc()) {
+        checkHeif(
+            heif_context_read_from_memory_without_copy(mContext.get(), file.data(), file.size(), nullptr));
+        heif_image_handle* handle = nullptr;
+        checkHeif(heif_context_get_primary_image_handle(mContext.get(), &handle));
+        mHandle.reset(handle);
+    }
+
+    void send(const ChildProcess::Sink& sink) const;
+
+private:
+    Bytes profile() const;
+    void sendSamples(const ChildProcess::Sink& sink, const Head& head) const;
+
+    HeifContext mContext;
+    HeifHandle mHandle;
+};
+
+Bytes Decoder::profile() const {
+    const heif_color_profile_type type = heif_image_handle_get_color_profile_type(mHandle.get());
+    if (type != heif_color_profile_type_prof && type != heif_color_profile_type_rICC)
+        return {};
+    Bytes profile(heif_image_handle_get_raw_color_profile_size(mHandle.get()));
+    checkHeif(heif_image_handle_get_raw_color_profile(mHandle.get(), profile.data()));
+    return profile;
+}
+
+void Decoder::send(const ChildProcess::Sink& sink) const {
+    const Bytes icc = profile();
+    const Head head{heif_image_handle_get_width(mHandle.get()),
+                    heif_image_handle_get_height(mHandle.get()),
+                    heif_image_handle_get_luma_bits_per_pixel(mHandle.get()),
+                    heif_image_handle_has_alpha_channel(mHandle.get()),
+                    heif_context_get_number_of_top_level_images(mContext.get()),
+                    icc.size()};
+    sink.send(head);
+    sink.send(icc.data(), icc.size());
+    sendSamples(sink, head);
+}
+
+void Decoder::sendSamples(const ChildProcess::Sink& sink, const Head& head) const {
+    const bool deep = head.bits > 8;
+    heif_image* decoded = nullptr;
+    checkHeif(heif_decode_image(mHandle.get(), &decoded, heif_colorspace_RGB,
+                                interleavedChroma(deep, head.hasAlpha != 0), nullptr));
+    const HeifImage image(decoded);
+    if (heif_image_get_width(decoded, heif_channel_interleaved) != head.width ||
+        heif_image_get_height(decoded, heif_channel_interleaved) != head.height)
+        throw std::runtime_error("the picture has other dimensions than the file says");
+    int stride = 0;
+    const std::uint8_t* plane = heif_image_get_plane_readonly(decoded, heif_channel_interleaved, &stride);
+    std::vector<std::uint16_t> row(static_cast<std::size_t>(head.width) * (head.hasAlpha != 0 ? 4 : 3));
+    for (int y = 0; y < head.height; ++y) {
+        const std::uint8_t* line = plane + static_cast<std::ptrdiff_t>(y) * stride;
+        if (!deep) {
+            sink.send(line, row.size());
+            continue;
+        }
+        std::memcpy(row.data(), line, row.size() * 2);
+        // Repeating the high bits below the low ones makes full scale 65535.
+        for (std::uint16_t& sample : row)
+            sample = static_cast<std::uint16_t>(sample << (16 - head.bits) | sample >> (2 * head.bits - 16));
+        sink.send(row.data(), row.size() * 2);
+    }
+}
+
+void takeCoding(Photograph& photograph, ByteView file) {
+    const std::optional<HeifCoding> coding = heifCoding(file);
+    photograph.encoding.compression = coding && coding->isAv1 ? "av1" : "hevc";
+    photograph.encoding.chroma = coding ? coding->chroma : Chroma::Half;
+    if (!coding)
+        return;
+    const double pixels = static_cast<double>(photograph.width) * photograph.height;
+    photograph.encoding.heifRate = std::make_shared<const HeifRate>(
+        HeifRate{heifSample(photograph), static_cast<double>(coding->bytes) / pixels});
+}
+
+Photograph receive(ChildProcess& child, const fs::path& path, std::uint64_t& pixels) {
+    const Head head = child.receive<Head>();
+    Photograph photograph;
+    photograph.source = path;
+    photograph.width = head.width;
+    photograph.height = head.height;
+    checkEdges(head.width, head.height, path);
+    pixels = static_cast<std::uint64_t>(head.width) * static_cast<std::uint64_t>(head.height);
+    if (head.bits < 8 || head.bits > 16)
+        refuse(path, "has an unknown number of bits per sample", "save it with 8, 10 or 12 bits");
+    photograph.depth = head.bits > 8 ? 16 : 8;
+    photograph.model = head.hasAlpha != 0 ? ColorModel::RgbAlpha : ColorModel::Rgb;
+    photograph.pages = std::max(1, head.pictures);
+    photograph.encoding.format = FileFormat::Heif;
+    photograph.encoding.bitDepth = head.bits;
+    photograph.iccProfile.resize(head.profileSize);
+    child.receive(photograph.iccProfile.data(), head.profileSize);
+    photograph.samples.resize(pixels * static_cast<std::uint64_t>(samplesPerPixel(photograph.model)) *
+                              static_cast<std::uint64_t>(photograph.depth / 8));
+    child.receive(photograph.samples.data(), photograph.samples.size());
+    return photograph;
+}
+
+} // namespace
+
+Photograph readHeif(ByteView file, const fs::path& path) {
+    std::uint64_t pixels = 0;
+    try {
+        ChildProcess child([&](const ChildProcess::Sink& sink) { Decoder(file).send(sink); });
+        Photograph photograph = receive(child, path, pixels);
+        takeCoding(photograph, file);
+        return photograph;
+    } catch (const ChildFailure& failure) {
+        // The decoder has no words of its own for want of memory.
+        if (isBeyondMemory(kDecoderBytes + pixels * kDecoderBytesPerPixel))
+            throw std::bad_alloc();
+        refuse(path, std::string("is damaged or cut short (") + failure.what() + ")", kCopyAgain);
+    }
+}
+
+} // namespace orvela

@@ -1,0 +1,14 @@
+#pragma once
+
+#include "files/FileFormat.h"
+
+namespace orvela {
+
+/// Reads the primary picture of a HEIF: 8 bits, or 10 and 12 bits as 16, turned upright as the file says. A
+/// child process decodes it.
+/// @param path  for messages and as the source of the result
+/// @throws PhotographError for files that are cut short or damaged
+/// @throws std::bad_alloc
+Photograph readHeif(ByteView file, const std::filesystem::path& path);
+
+} // namespace orvela

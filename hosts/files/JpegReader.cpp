@@ -1,0 +1,161 @@
+#include "files/JpegReader.h"
+
+#include "files/JpegErrors.h"
+#include "files/Refusal.h"
+
+#include <jerror.h>
+
+#include <algorithm>
+#include <map>
+#include <string_view>
+
+namespace orvela {
+
+namespace {
+
+namespace fs = std::filesystem;
+
+constexpr int kProfileMarker = JPEG_APP0 + 2;
+
+class Decoder {
+public:
+    Decoder(ByteView file, const fs::path& path) : mPath(path) {
+        mJpeg.err = mErrors.manager();
+        attempt([&] {
+            jpeg_create_decompress(&mJpeg);
+            jpeg_mem_src(&mJpeg, file.data(), file.size());
+            jpeg_save_markers(&mJpeg, kProfileMarker, 0xFFFF);
+            jpeg_read_header(&mJpeg, TRUE);
+        });
+    }
+    ~Decoder() { jpeg_destroy_decompress(&mJpeg); }
+    Decoder(const Decoder&) = delete;
+    Decoder& operator=(const Decoder&) = delete;
+
+    void readPicture(Photograph& photograph);
+    Bytes profile() const;
+    Encoding encoding();
+
+private:
+    template <typename Work>
+    void attempt(const Work& work);
+    ColorModel model() const;
+    JpegLayout::Color color() const;
+
+    const fs::path& mPath;
+    JpegErrors mErrors;
+    jpeg_decompress_struct mJpeg{};
+};
+
+template <typename Work>
+void Decoder::attempt(const Work& work) {
+    if (mErrors.attempt(work))
+        return;
+    // The object dies unborn when this is the constructor's; what it holds is released twice at most.
+    jpeg_destroy_decompress(&mJpeg);
+    mErrors.throwIfOutOfMemory();
+    if (mErrors.code() == JWRN_JPEG_EOF)
+        refuse(mPath, "the file is cut short", kCopyAgain);
+    refuse(mPath, "is damaged or cut short (" + mErrors.text() + ")", kCopyAgain);
+}
+
+ColorModel Decoder::model() const {
+    switch (mJpeg.out_color_space) {
+    case JCS_GRAYSCALE:
+        return ColorModel::Grey;
+    case JCS_RGB:
+        return ColorModel::Rgb;
+    case JCS_CMYK:
+        return ColorModel::Cmyk;
+    default:
+        refuse(mPath, "has " + std::to_string(mJpeg.num_components) + " colour components of an unknown kind",
+               "convert it to RGB, grey or CMYK");
+    }
+}
+
+JpegLayout::Color Decoder::color() const {
+    switch (mJpeg.jpeg_color_space) {
+    case JCS_GRAYSCALE:
+        return JpegLayout::Color::Grey;
+    case JCS_RGB:
+        return JpegLayout::Color::Rgb;
+    case JCS_CMYK:
+        return JpegLayout::Color::Cmyk;
+    case JCS_YCCK:
+        return JpegLayout::Color::Ycck;
+    default:
+        return JpegLayout::Color::YCbCr;
+    }
+}
+
+void Decoder::readPicture(Photograph& photograph) {
+    photograph.model = model();
+    photograph.width = static_cast<int>(mJpeg.image_width);
+    photograph.height = static_cast<int>(mJpeg.image_height);
+    checkEdges(photograph.width, photograph.height, mPath);
+    const std::size_t row = mJpeg.image_width * static_cast<std::size_t>(samplesPerPixel(photograph.model));
+    photograph.samples.resize(row * mJpeg.image_height);
+    attempt([&] {
+        jpeg_start_decompress(&mJpeg);
+        while (mJpeg.output_scanline < mJpeg.output_height) {
+            JSAMPROW line = photograph.samples.data() + row * mJpeg.output_scanline;
+            jpeg_read_scanlines(&mJpeg, &line, 1);
+        }
+    });
+    if (photograph.model == ColorModel::Cmyk)
+        for (std::uint8_t& ink : photograph.samples)
+            ink = static_cast<std::uint8_t>(255 - ink);
+    photograph.encoding = encoding();
+    // Reads on to the end marker, and forgets the tables.
+    attempt([&] { jpeg_finish_decompress(&mJpeg); });
+}
+
+Encoding Decoder::encoding() {
+    Encoding encoding;
+    encoding.format = FileFormat::Jpeg;
+    encoding.progressive = mJpeg.progressive_mode != 0;
+    JpegLayout& layout = encoding.jpeg.emplace();
+    layout.color = color();
+    layout.adobeMarker = mJpeg.num_components == 4 && mJpeg.saw_Adobe_marker != 0;
+    for (int i = 0; i < mJpeg.num_components; ++i) {
+        const jpeg_component_info& info = mJpeg.comp_info[i];
+        if (info.quant_table == nullptr)
+            refuse(mPath, "is damaged or cut short (a colour component is missing)", kCopyAgain);
+        JpegLayout::Component& component = layout.components.emplace_back();
+        component.horizontal = info.h_samp_factor;
+        component.vertical = info.v_samp_factor;
+        component.table = info.quant_tbl_no;
+        std::copy_n(info.quant_table->quantval, component.quantizer.size(), component.quantizer.begin());
+    }
+    return encoding;
+}
+
+// The parts by their numbers, up to the first that is missing.
+Bytes Decoder::profile() const {
+    using namespace std::string_view_literals;
+    constexpr std::string_view signature = "ICC_PROFILE\0"sv;
+    constexpr std::size_t head = signature.size() + 2; // with the number of the part and of all parts
+    std::map<int, ByteView> parts;
+    for (jpeg_saved_marker_ptr marker = mJpeg.marker_list; marker != nullptr; marker = marker->next) {
+        const ByteView data(marker->data, marker->data_length);
+        if (data.size() > head && std::equal(signature.begin(), signature.end(), data.begin()))
+            parts[data[signature.size()]] = data.subspan(head);
+    }
+    Bytes profile;
+    for (int number = 1; parts.contains(number); ++number)
+        profile.insert(profile.end(), parts[number].begin(), parts[number].end());
+    return profile;
+}
+
+} // namespace
+
+Photograph readJpeg(ByteView file, const fs::path& path) {
+    Photograph photograph;
+    photograph.source = path;
+    Decoder decoder(file, path);
+    photograph.iccProfile = decoder.profile();
+    decoder.readPicture(photograph);
+    return photograph;
+}
+
+} // namespace orvela

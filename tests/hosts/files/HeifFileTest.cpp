@@ -1,0 +1,164 @@
+#include "files/ChildProcess.h"
+#include "files/HeifBoxes.h"
+#include "files/HeifRate.h"
+#include "files/PhotographReader.h"
+#include "files/PhotographWriter.h"
+#include "hosts/TestFiles.h"
+#include "hosts/TestPhotograph.h"
+
+#include <gmock/gmock.h>
+
+#include <cmath>
+#include <csignal>
+#include <new>
+#include <thread>
+
+using namespace orvela;
+
+namespace {
+
+using testing::ElementsAre;
+using testing::HasSubstr;
+
+WriteOptions overwriting() {
+    WriteOptions options;
+    options.overwrite = true;
+    return options;
+}
+
+HeifCoding codingOf(const TestFolder& folder, const std::string& name) {
+    const std::string text = folder.text(name);
+    return heifCoding(Bytes(text.begin(), text.end())).value();
+}
+
+TEST(HeifFile, KeepsTheResolutionOfColour) {
+    const TestFolder folder;
+    folder.run("convert $S/coffee.png -resize 128x96! p.png && vips heifsave p.png full.heic "
+               "--subsample-mode off && "
+               "vips heifsave p.png half.heic --subsample-mode on && "
+               "vips heifsave p.png full.avif --subsample-mode off --compression av1");
+    for (const char* name : {"full.heic", "half.heic", "full.avif"}) {
+        const Photograph photograph = readPhotograph(folder / name);
+        writePhotograph(photograph, folder / ("new-" + std::string(name)));
+        EXPECT_EQ(codingOf(folder, "new-" + std::string(name)).chroma, photograph.encoding.chroma) << name;
+        EXPECT_EQ(photograph.encoding.chroma, *name == 'f' ? Chroma::Full : Chroma::Half);
+    }
+    Photograph photograph = readPhotograph(folder / "full.heic");
+    photograph.encoding.chroma = Chroma::HalfWidth;
+    writePhotograph(photograph, folder / "wide.heic");
+    EXPECT_EQ(readPhotograph(folder / "wide.heic").encoding.chroma, Chroma::HalfWidth);
+    EXPECT_THAT(folder.output("exiftool -a -ee -G -ChromaFormat wide.heic"), HasSubstr("4:2:2"));
+    WriteOptions half;
+    half.chromaSubsampled = true;
+    writePhotograph(photograph, folder / "asked.heic", half);
+    EXPECT_EQ(codingOf(folder, "asked.heic").chroma, Chroma::Half);
+}
+
+// The same pixels written once more take about as many bytes, whatever the quality was.
+TEST(HeifFile, TakesAsManyBytesAsTheSource) {
+    const TestFolder folder;
+    folder.run("convert $S/rocket.jpg -resize 384x256! p.png");
+    for (const char* quality : {"35", "60", "85"}) {
+        folder.run(std::string("vips heifsave p.png s.heic --Q ") + quality);
+        writePhotograph(readPhotograph(folder / "s.heic"), folder / "t.heic", overwriting());
+        const double growth = static_cast<double>(codingOf(folder, "t.heic").bytes) /
+                              static_cast<double>(codingOf(folder, "s.heic").bytes);
+        EXPECT_GT(growth, 0.8) << quality;
+        EXPECT_LT(growth, 1.25) << quality;
+    }
+}
+
+// Of a picture that was coded before too, whose bytes rise little in between.
+TEST(HeifFile, FindsTheQualityOfASize) {
+    const auto even = [](int quality) { return std::exp(0.07 * quality - 4); };
+    const auto coded = [&](int quality) {
+        return even(quality) * std::exp(-0.05 * std::clamp(quality - 40, 0, 20));
+    };
+    int calls = 0;
+    for (const int quality : {25, 33, 42, 52, 60, 77, 95}) {
+        EXPECT_NEAR(matchingQuality(even(quality), even), quality, 1);
+        const int found = matchingQuality(coded(quality), [&](int q) { return ++calls, coded(q); });
+        EXPECT_NEAR(coded(found) / coded(quality), 1, 0.1) << quality << " " << found;
+    }
+    EXPECT_LE(calls, 5 * 7);
+    EXPECT_EQ(matchingQuality(1e-9, even), kLowestHeifQuality);
+    EXPECT_EQ(matchingQuality(1e9, even), kHighestHeifQuality);
+}
+
+// Squares of 192 from the middle of each sixteenth: of 4096 rows the first is 416, the 193rd 1440.
+TEST(HeifFile, SamplesThePictureInSquares) {
+    const Photograph photograph =
+        testPhotograph(ColorModel::Rgb, 8, 768, 4096, [](std::size_t i) { return i / 3 / 768 % 251; });
+    const Photograph sample = heifSample(photograph);
+    EXPECT_EQ(sample.width, 768);
+    EXPECT_EQ(sample.height, 768);
+    EXPECT_EQ(sample.samples[0], 416 % 251);
+    EXPECT_EQ(sample.samples[std::size_t{3} * 768 * 192], 1440 % 251);
+    EXPECT_EQ(sample.samples.back(), (416 + 3 * 1024 + 191) % 251);
+}
+
+// A channel of transparency under another name is one of the pictures beside the picture.
+TEST(HeifFile, NamesThePicturesThatItDrops) {
+    const TestFolder folder;
+    folder.run("convert $S/coffee.png -resize 128x96! -alpha set -channel A -evaluate set 50% a.png && "
+               "vips heifsave a.png alpha.heic");
+    EXPECT_EQ(readPhotograph(folder / "alpha.heic").model, ColorModel::RgbAlpha);
+    const std::pair<const char*, const char*> cases[] = {{"urn:com:tst:aux:hdrgainmap", "the gain map"},
+                                                         {"urn:mpeg:hevc:2015:auxid:2", "the depth map"}};
+    for (const auto& [kind, name] : cases) {
+        folder.run(std::string("sed 's/urn:mpeg:hevc:2015:auxid:1/") + kind + "/' alpha.heic > s.heic");
+        const Photograph photograph = readPhotograph(folder / "s.heic");
+        EXPECT_EQ(photograph.model, ColorModel::Rgb);
+        EXPECT_THAT(writePhotograph(photograph, folder / "t.jpg", overwriting()),
+                    ElementsAre((folder / "s.heic").string() + ": the JPEG file cannot hold: " + name));
+    }
+}
+
+TEST(HeifFile, ReadsBoxesThatAreCutAnywhere) {
+    const TestFolder folder;
+    folder.run("convert $S/coffee.png -resize 128x96! p.png && vips heifsave p.png s.heic");
+    const std::string text = folder.text("s.heic");
+    const Bytes file(text.begin(), text.end());
+    for (std::size_t size = 0; size < std::min<std::size_t>(file.size(), 900); ++size)
+        EXPECT_EQ(heifCoding(ByteView(file).first(size)).value_or(HeifCoding()).chroma, Chroma::Half) << size;
+}
+
+volatile std::size_t excessive = std::size_t{1} << 46;
+
+std::string failureOf(const std::function<void(const ChildProcess::Sink&)>& work) {
+    try {
+        ChildProcess(work).receive<int>();
+    } catch (const ChildFailure& failure) {
+        return failure.what();
+    } catch (const std::bad_alloc&) {
+        return "memory";
+    }
+    return "none";
+}
+
+TEST(ChildProcess, TellsHowItEnded) {
+    EXPECT_EQ(failureOf([](const auto& sink) { sink.send(7); }), "none");
+    EXPECT_EQ(failureOf([](const auto&) { throw std::runtime_error("broken"); }), "broken");
+    EXPECT_EQ(failureOf([](const auto&) { throw std::bad_alloc(); }), "memory");
+    EXPECT_EQ(failureOf([](const auto&) { std::raise(SIGKILL); }), "memory");
+    EXPECT_THAT(failureOf([](const auto&) { std::raise(SIGTERM); }), HasSubstr("signal 15"));
+    // A thread's exception ends the process; so does an allocation that fails on any thread.
+    EXPECT_EQ(
+        failureOf([](const auto&) { std::thread([] { Bytes().reserve(std::size_t{1} << 46); }).join(); }),
+        "memory");
+    EXPECT_TRUE(isBeyondMemory(std::uint64_t{1} << 60));
+    EXPECT_FALSE(isBeyondMemory(1'000'000));
+}
+
+TEST(ChildProcess, IsGivenUpWhenAsked) {
+    std::atomic<bool> stop{false};
+    ChildProcess child([](const auto& sink) {
+        sink.send(1);
+        ::pause();
+    });
+    EXPECT_EQ(child.receive<int>(&stop), 1);
+    stop = true;
+    EXPECT_THROW(child.receive<int>(&stop), StoppedError);
+}
+
+} // namespace
