@@ -7,8 +7,8 @@
 namespace orvela {
 
 Photograph heifSample(const Photograph& photograph) {
-    constexpr int across = 4;
-    constexpr int edge = 192; // a multiple of the largest coding block
+    constexpr int across = 12;
+    constexpr int edge = 64; // of a coding block
     Photograph sample;
     sample.depth = photograph.depth;
     sample.model = photograph.model;
@@ -21,11 +21,13 @@ Photograph heifSample(const Photograph& photograph) {
                pixel;
     };
     sample.samples.resize(offset(sample, 0, sample.height));
-    // Where a row or column of the sample comes from: each square from the middle of its share of the
-    // picture.
+    // Where a row or column of the sample comes from: each block is one in the middle of its share of the
+    // picture. Blocks of the coding itself, since a picture that was coded before takes more when they are
+    // parted elsewhere.
     const auto origin = [&](int at, int size) {
         const int share = size / across;
-        return size <= across * edge ? at : at / edge * share + (share - edge) / 2 + at % edge;
+        const int middle = at / edge * share + (share - edge) / 2;
+        return size <= across * edge ? at : middle / edge * edge + at % edge;
     };
     for (int y = 0; y < sample.height; ++y)
         for (int x = 0; x < sample.width; x += edge)

@@ -11,7 +11,8 @@ struct HeifRate {
     double bytesPerPixel = 0; ///< of the whole picture in its file
 };
 
-/// Squares from all over the picture, put together to 768 pixels both ways; a smaller picture is taken whole.
+/// Coding blocks from all over the picture, put together to 768 pixels both ways; a smaller picture is taken
+/// whole.
 Photograph heifSample(const Photograph& photograph);
 
 /// The lowest and highest quality that is chosen without being asked for.

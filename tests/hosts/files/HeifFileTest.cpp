@@ -85,16 +85,17 @@ TEST(HeifFile, FindsTheQualityOfASize) {
     EXPECT_EQ(matchingQuality(1e9, even), kHighestHeifQuality);
 }
 
-// Squares of 192 from the middle of each sixteenth: of 4096 rows the first is 416, the 193rd 1440.
-TEST(HeifFile, SamplesThePictureInSquares) {
+// One block of 64 from the middle of each of 12 x 12 parts, where the coding has one: the parts are 341 rows
+// high, their blocks begin at 138, 479, ... 3889, rounded down.
+TEST(HeifFile, SamplesThePictureInBlocks) {
     const Photograph photograph =
         testPhotograph(ColorModel::Rgb, 8, 768, 4096, [](std::size_t i) { return i / 3 / 768 % 251; });
     const Photograph sample = heifSample(photograph);
     EXPECT_EQ(sample.width, 768);
     EXPECT_EQ(sample.height, 768);
-    EXPECT_EQ(sample.samples[0], 416 % 251);
-    EXPECT_EQ(sample.samples[std::size_t{3} * 768 * 192], 1440 % 251);
-    EXPECT_EQ(sample.samples.back(), (416 + 3 * 1024 + 191) % 251);
+    EXPECT_EQ(sample.samples[0], 128 % 251);
+    EXPECT_EQ(sample.samples[std::size_t{3} * 768 * 64], 448 % 251);
+    EXPECT_EQ(sample.samples.back(), (3840 + 63) % 251);
 }
 
 // A channel of transparency under another name is one of the pictures beside the picture.
