@@ -8,7 +8,6 @@ namespace {
 
 namespace fs = std::filesystem;
 
-constexpr std::size_t kClassicTiffLimit = 4'000'000'000;
 constexpr Bytes::value_type kExifHead[] = {'E', 'x', 'i', 'f', 0, 0};
 
 struct GFree {
@@ -34,30 +33,11 @@ Encoding settingsFor(const Photograph& photograph, FileFormat format, const fs::
     settings.chromaSubsampled = options.chromaSubsampled.value_or(settings.chromaSubsampled);
     settings.lossless = options.lossless.value_or(settings.lossless);
     settings.progressive = options.progressive.value_or(settings.progressive);
-    if (!options.compression.empty())
-        settings.compression = options.compression;
     if (format == FileFormat::Heif)
         settings.compression = target.extension() == ".avif"   ? "av1"
                                : settings.compression == "av1" ? "av1"
                                                                : "hevc";
-    else if (settings.compression.empty())
-        settings.compression = "lzw";
     return settings;
-}
-
-int saveTiff(VipsImage* image, const Photograph& photograph, const Encoding& settings, void** data,
-             std::size_t* size) {
-    const int compression =
-        vips_enum_from_nick("orvela", VIPS_TYPE_FOREIGN_TIFF_COMPRESSION, settings.compression.c_str());
-    if (compression < 0)
-        return -1;
-    const bool plain = photograph.model == ColorModel::Grey || photograph.model == ColorModel::Rgb;
-    if (compression == VIPS_FOREIGN_TIFF_COMPRESSION_JPEG && (photograph.depth != 8 || !plain)) {
-        vips_error("tiff", "JPEG compression takes 8-bit grey or RGB only");
-        return -1;
-    }
-    return vips_tiffsave_buffer(image, data, size, "compression", compression, "Q", settings.quality,
-                                "bigtiff", photograph.samples.size() > kClassicTiffLimit, nullptr);
 }
 
 int save(VipsImage* image, const Photograph& photograph, FileFormat format, const Encoding& settings,
@@ -70,8 +50,6 @@ int save(VipsImage* image, const Photograph& photograph, FileFormat format, cons
                                     "interlace", settings.progressive, "optimize_coding", TRUE, nullptr);
     case FileFormat::Png:
         return vips_pngsave_buffer(image, data, size, "interlace", settings.progressive, nullptr);
-    case FileFormat::Tiff:
-        return saveTiff(image, photograph, settings, data, size);
     case FileFormat::WebP:
         return vips_webpsave_buffer(image, data, size, "Q", settings.quality, "lossless", settings.lossless,
                                     "alpha_q", 100, nullptr);
@@ -81,7 +59,8 @@ int save(VipsImage* image, const Photograph& photograph, FileFormat format, cons
                                     settings.compression == "av1" ? VIPS_FOREIGN_HEIF_COMPRESSION_AV1
                                                                   : VIPS_FOREIGN_HEIF_COMPRESSION_HEVC,
                                     nullptr);
-    case FileFormat::Psd: // refused by formatObstacle
+    case FileFormat::Tiff: // see TiffWriter
+    case FileFormat::Psd:  // refused by formatObstacle
         break;
     }
     return -1;
