@@ -41,8 +41,9 @@ private:
     ExitStatus runGuarded(const Job& job);
     void runJob(const Job& job);
     void makeFolder();
-    Photograph read(const fs::path& source);
-    std::optional<TraceOptions> traceOf(const Job& job) const;
+    bool runPage(const Job& job, PhotographReader& reader, PhotographWriter& writer);
+    Photograph read(PhotographReader& reader);
+    std::optional<TraceOptions> traceOf(const Job& job, const Photograph& photograph) const;
     ExitStatus failed(ExitStatus status, const std::string& text);
     void note(const std::string& text);
 
@@ -53,6 +54,7 @@ private:
     RowScheduler mScheduler;
     ProgressLine mProgress;
     std::size_t mIndex = 0;
+    std::string mName; ///< of the photograph, and of its page, before what is told about it
 };
 
 ExitStatus Batch::failed(ExitStatus status, const std::string& text) {
@@ -66,7 +68,7 @@ void Batch::note(const std::string& text) {
 }
 
 ExitStatus Batch::runGuarded(const Job& job) {
-    const std::string name = job.source.string() + ": ";
+    mName = job.source.string() + ": ";
     ExceptionStack::clear(); // of what earlier photographs left
     try {
         mScheduler.execute([&] { runJob(job); });
@@ -79,35 +81,56 @@ ExitStatus Batch::runGuarded(const Job& job) {
         return failed(ExitStatus::PhotographFailed, error.what());
     } catch (const EngineFailure& error) {
         return error.isOutOfMemory()
-                   ? failed(ExitStatus::OutOfMemory, name + error.what() + kMemoryAdvice)
-                   : failed(ExitStatus::PhotographFailed, name + error.what() + "; nothing was written");
+                   ? failed(ExitStatus::OutOfMemory, mName + error.what() + kMemoryAdvice)
+                   : failed(ExitStatus::PhotographFailed, mName + error.what() + "; nothing was written");
     } catch (const std::exception& error) {
         if (isOutOfMemory(error))
-            return failed(ExitStatus::OutOfMemory, name + "not enough memory" + kMemoryAdvice);
-        return failed(ExitStatus::PhotographFailed, name + innermostMessage(error).toStdString());
+            return failed(ExitStatus::OutOfMemory, mName + "not enough memory" + kMemoryAdvice);
+        return failed(ExitStatus::PhotographFailed, mName + innermostMessage(error).toStdString());
     } catch (...) {
-        return failed(ExitStatus::PhotographFailed, name + "failed for an unknown reason; report this");
+        return failed(ExitStatus::PhotographFailed, mName + "failed for an unknown reason; report this");
     }
 }
 
 void Batch::runJob(const Job& job) {
-    mProgress.begin(QString::fromLocal8Bit(job.source.filename().c_str()));
     makeFolder();
     WriteOptions writing = mOptions.writing;
     writing.stop = &mSignals.stopRequested();
     checkTargetPath(job.target, job.source, writing.overwrite);
-    Photograph photograph = read(job.source);
-    checkTarget(photograph, job.target, writing);
-    const std::optional<Photograph> result =
-        enhance(std::move(photograph), mSettings, traceOf(job), mSignals, mProgress);
-    if (!result)
-        return;
-    mProgress.step(1, 1, QStringLiteral("Writing"));
-    for (const std::string& warning : writePhotograph(*result, job.target, writing))
+    mProgress.begin(QString::fromLocal8Bit(job.source.filename().c_str()));
+    PhotographReader reader(job.source, mOptions.reading);
+    PhotographWriter writer(job.target, writing);
+    for (int page = 0; page < reader.pages(); ++page) {
+        mProgress.page(page, reader.pages());
+        if (reader.pages() > 1)
+            mName = job.source.string() + ": page " + std::to_string(page + 1) + ": ";
+        if (!runPage(job, reader, writer))
+            return;
+    }
+    for (const std::string& warning : writer.commit())
         note(warning);
     mProgress.clear();
     if (!mOptions.quiet)
         std::cout << job.source.string() << " -> " << job.target.string() << std::endl;
+}
+
+// Enhances the next page; false when a signal ended it.
+bool Batch::runPage(const Job& job, PhotographReader& reader, PhotographWriter& writer) {
+    // From the second page on there is a temporary file that has to be removed.
+    mSignals.stay(writer.hasBegun());
+    Photograph photograph = read(reader);
+    checkTarget(photograph, job.target, mOptions.writing);
+    if (!photograph.copied) {
+        const std::optional<TraceOptions> trace = traceOf(job, photograph);
+        std::optional<Photograph> result =
+            enhance(std::move(photograph), mSettings, trace, mSignals, mProgress);
+        if (!result)
+            return false;
+        photograph = std::move(*result);
+    }
+    mProgress.step(1, 1, QStringLiteral("Writing"));
+    writer.add(photograph);
+    return true;
 }
 
 // A failure shows when the first target is looked at.
@@ -118,17 +141,19 @@ void Batch::makeFolder() {
 }
 
 // Reading cannot be stopped half-way, but leaves nothing behind either: a signal ends the program at once.
-Photograph Batch::read(const fs::path& source) {
+Photograph Batch::read(PhotographReader& reader) {
     const StopAction leave(mSignals, [this] { mSignals.leave(); });
-    return readPhotograph(source);
+    return reader.next();
 }
 
-std::optional<TraceOptions> Batch::traceOf(const Job& job) const {
+std::optional<TraceOptions> Batch::traceOf(const Job& job, const Photograph& photograph) const {
     if (!mOptions.trace)
         return std::nullopt;
     fs::path folder = *mOptions.trace;
     if (mJobs.size() > 1)
         folder /= std::to_string(mIndex + 1) + "-" + job.source.filename().string();
+    if (photograph.pages > 1)
+        folder /= "page-" + std::to_string(photograph.page + 1);
     return TraceOptions{folder, mOptions.writing.overwrite};
 }
 

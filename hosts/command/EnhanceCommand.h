@@ -4,6 +4,7 @@
 #include "command/SettingOptions.h"
 #include "command/StopSignals.h"
 #include "command/Targets.h"
+#include "files/PhotographReader.h"
 #include "files/PhotographWriter.h"
 
 #include <optional>
@@ -26,6 +27,7 @@ struct EnhanceOptions {
     std::optional<std::string> trace; ///< folder for what each step did
     int threads = 0;                  ///< 0: one per processor
     bool quiet = false;
+    ReadOptions reading;
     WriteOptions writing;
 
     /// Declares the arguments to the parser, which fills this object when it parses.

@@ -73,6 +73,8 @@ void declareSettings(CLI::App& app, SettingOptions& settings) {
 
 void EnhanceOptions::declare(CLI::App& app) {
     app.add_option("PHOTO", photographs, "photographs, folders of photographs or patterns");
+    app.add_flag("--first-frame", reading.firstOnly,
+                 "of animations and files of several pages only the first picture");
     declareTargets(app, *this);
     declareEncoding(app, writing);
     declareSettings(app, settings);

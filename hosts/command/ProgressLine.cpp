@@ -34,6 +34,12 @@ ProgressLine::~ProgressLine() {
 void ProgressLine::begin(const QString& photograph) {
     ++mCurrent;
     mPhotograph = photograph;
+    page(0, 1);
+}
+
+void ProgressLine::page(int page, int pages) {
+    mPage = page;
+    mPages = pages;
     step(0, 1, QStringLiteral("Reading"));
     mStepShare = 0;
 }
@@ -59,7 +65,7 @@ void ProgressLine::clear() {
 }
 
 double ProgressLine::doneShare() const {
-    return std::min(1.0, mStepStart + mStepShare * mPercent / 100);
+    return (mPage + std::min(1.0, mStepStart + mStepShare * mPercent / 100)) / mPages;
 }
 
 QString ProgressLine::timeLeft() const {
@@ -74,9 +80,12 @@ QString ProgressLine::timeLeft() const {
 void ProgressLine::show() {
     if (!mActive)
         return;
-    const QString line = QStringLiteral("[%1/%2] %3  %4  %5 %%6")
-                             .arg(QString::number(mCurrent), QString::number(mPhotographs), mPhotograph,
-                                  mStep, QString::number(static_cast<int>(doneShare() * 100)), timeLeft());
+    const QString page =
+        mPages > 1 ? QStringLiteral("  page %1 of %2").arg(mPage + 1).arg(mPages) : QString();
+    const QString line =
+        QStringLiteral("[%1/%2] %3  %4  %5 %%6")
+            .arg(QString::number(mCurrent), QString::number(mPhotographs), mPhotograph + page, mStep,
+                 QString::number(static_cast<int>(doneShare() * 100)), timeLeft());
     std::fprintf(stderr, "\r\x1b[K%s", qUtf8Printable(line.left(terminalWidth() - 1)));
     std::fflush(stderr);
     mShown = true;

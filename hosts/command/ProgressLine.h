@@ -17,6 +17,9 @@ public:
     /// The next photograph begins.
     void begin(const QString& photograph);
 
+    /// A page of `pages` begins, counted from 0.
+    void page(int page, int pages);
+
     /// A step of `total` begins, counted from 0.
     void step(int step, int total, const QString& name);
 
@@ -34,6 +37,8 @@ private:
     const int mPhotographs;
     const bool mActive;
     int mCurrent = 0;
+    int mPage = 0;
+    int mPages = 1;
     QString mPhotograph;
     QString mStep;
     double mStepStart = 0; ///< share of the photograph that was done before the step

@@ -49,7 +49,8 @@ void StopSignals::onStop(std::function<void()> stop) {
 }
 
 void StopSignals::leave() const {
-    std::_Exit(kSignalBase + mReceived);
+    if (!mStay)
+        std::_Exit(kSignalBase + mReceived);
 }
 
 void StopSignals::wait() {

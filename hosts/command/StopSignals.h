@@ -24,9 +24,11 @@ public:
     /// True from the first signal on; may be handed to whoever can stop early.
     const std::atomic<bool>& stopRequested() const { return mStopRequested; }
 
-    /// Ends the program at once with the status of the signal. For an action while nothing would be left
-    /// behind.
-    [[noreturn]] void leave() const;
+    /// Ends the program at once with the status of the signal, unless it has to stay.
+    void leave() const;
+
+    /// Whether leaving at once would leave something behind; then the work ends in good order.
+    void stay(bool needed) { mStay = needed; }
 
 private:
     friend class StopAction;
@@ -40,6 +42,7 @@ private:
     std::atomic<int> mReceived = 0;
     std::atomic<bool> mStopRequested = false;
     std::atomic<bool> mEnding = false;
+    std::atomic<bool> mStay = false;
     std::mutex mMutex;
     std::function<void()> mStop;
     std::thread mThread;

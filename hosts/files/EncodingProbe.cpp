@@ -27,39 +27,6 @@ bool pngIsComplete(ByteView file) {
     return false;
 }
 
-std::string probeTiffCompression(ByteView file) {
-    const bool little = file.size() > 2 && file[0] == 'I';
-    const auto get = [&](std::size_t at, std::size_t bytes) -> std::uint32_t {
-        return at + bytes <= file.size() ? number(file.subspan(at, bytes), little) : 0;
-    };
-    const bool big = get(2, 2) == 43;
-    // Offsets of a large TIFF are 64 bits wide; the low half serves any file that fits into memory here.
-    const std::size_t directory = big ? get(little ? 8 : 12, 4) : get(4, 4);
-    const std::size_t entry = big ? 20 : 12;
-    const std::size_t count = big ? get(directory + (little ? 0 : 6), 2) : get(directory, 2);
-    std::uint32_t code = 1;
-    for (std::size_t i = 0; i < count; ++i) {
-        const std::size_t at = directory + (big ? 8 : 2) + i * entry;
-        if (get(at, 2) == 259)
-            code = get(at + (big ? 12 : 8), 2);
-    }
-    switch (code) {
-    case 1:
-        return "none";
-    case 7:
-        return "jpeg";
-    case 8:
-    case 32946:
-        return "deflate";
-    case 32773:
-        return "packbits";
-    case 50000:
-        return "zstd";
-    default:
-        return "lzw";
-    }
-}
-
 bool webpIsLossless(ByteView file) {
     constexpr std::string_view lossless = "VP8L";
     constexpr std::string_view lossy = "VP8 ";

@@ -9,10 +9,6 @@ namespace orvela {
 /// Whether the PNG goes on to the end of its last chunk.
 bool pngIsComplete(ByteView file);
 
-/// Library name of the compression in the first directory of a TIFF. Kinds that this program does not write
-/// give a lossless one.
-std::string probeTiffCompression(ByteView file);
-
 /// Whether the (first) picture of a WebP is encoded without loss.
 bool webpIsLossless(ByteView file);
 

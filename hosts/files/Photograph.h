@@ -80,11 +80,15 @@ struct Encoding {
     bool lossless = false;        ///< WebP without loss
     bool progressive = false;     ///< interlaced or progressive
     std::string compression;      ///< by its library name: TIFF "lzw" and others, HEIF "hevc" or "av1"
+    int quality = 0;              ///< TIFF with JPEG compression: 1 to 100; 0 when unknown
     int bitDepth = 0;             ///< HEIF: bits per sample in the file (8, 10 or 12); 0 when unknown
     Chroma chroma = Chroma::Full; ///< HEIF
     std::shared_ptr<const HeifRate> heifRate; ///< HEIF
     std::optional<JpegLayout> jpeg;           ///< JPEG
 };
+
+/// How a page of a TIFF is stored and what it holds beside its picture. See TiffPage.h.
+struct TiffPage;
 
 /// A photograph in memory: interleaved samples, rows from the top without padding, 8 bits or native 16 bits
 /// each. CMYK samples are raw ink values, 0 without ink; where a format stores them inverted, the inversion
@@ -98,9 +102,15 @@ struct Photograph {
     std::vector<std::uint8_t> iccProfile; ///< empty when there is none
     double xResolution = 0;               ///< pixels per millimetre; 0 when the file gives none
     double yResolution = 0;               ///< pixels per millimetre; 0 when the file gives none
-    int pages = 1;                        ///< pages or animation frames of the file; only the first is held
+    int pages = 1;                        ///< of the file, which the target has to take; this is one of them
+    int page = 0;                         ///< which one, counted from 0
+    bool copied =
+        false; ///< a page that is no picture (a transparency mask): without samples, goes as it stands
     Encoding encoding;
     std::shared_ptr<const Metadata> metadata; ///< of the file it was read from; null when it comes from none
+    std::shared_ptr<const TiffPage> tiffPage; ///< null when it comes from no TIFF
+    std::vector<std::string> unheld;          ///< names of what of the file is not in here: "the other pages"
+    std::vector<std::string> notes;           ///< what reading made of it: "its palette was resolved"
     std::filesystem::path source;             ///< that file, for messages and so that it is never overwritten
 };
 

@@ -10,8 +10,6 @@ namespace {
 
 namespace fs = std::filesystem;
 
-constexpr std::size_t kClassicTiffLimit = 4'000'000'000;
-
 struct GFree {
     void operator()(void* data) const { g_free(data); }
 };
@@ -23,26 +21,7 @@ Encoding settingsFor(const Photograph& photograph, FileFormat format, const Writ
         settings = photograph.encoding;
     settings.lossless = options.lossless.value_or(settings.lossless);
     settings.progressive = options.progressive.value_or(settings.progressive);
-    if (!options.compression.empty())
-        settings.compression = options.compression;
-    if (settings.compression.empty())
-        settings.compression = "lzw";
     return settings;
-}
-
-int saveTiff(VipsImage* image, const Photograph& photograph, const Encoding& settings, int quality,
-             void** data, std::size_t* size) {
-    const int compression =
-        vips_enum_from_nick("orvela", VIPS_TYPE_FOREIGN_TIFF_COMPRESSION, settings.compression.c_str());
-    if (compression < 0)
-        return -1;
-    const bool plain = photograph.model == ColorModel::Grey || photograph.model == ColorModel::Rgb;
-    if (compression == VIPS_FOREIGN_TIFF_COMPRESSION_JPEG && (photograph.depth != 8 || !plain)) {
-        vips_error("tiff", "JPEG compression takes 8-bit grey or RGB only");
-        return -1;
-    }
-    return vips_tiffsave_buffer(image, data, size, "compression", compression, "Q", quality, "bigtiff",
-                                photograph.samples.size() > kClassicTiffLimit, nullptr);
 }
 
 int save(VipsImage* image, const Photograph& photograph, FileFormat format, const WriteOptions& options,
@@ -52,14 +31,13 @@ int save(VipsImage* image, const Photograph& photograph, FileFormat format, cons
     switch (format) {
     case FileFormat::Png:
         return vips_pngsave_buffer(image, data, size, "interlace", settings.progressive, nullptr);
-    case FileFormat::Tiff:
-        return saveTiff(image, photograph, settings, quality(92), data, size);
     case FileFormat::WebP:
         return vips_webpsave_buffer(image, data, size, "Q", quality(90), "lossless", settings.lossless,
                                     "alpha_q", 100, nullptr);
     case FileFormat::Jpeg: // these have encoders of their own
     case FileFormat::Heif:
-    case FileFormat::Psd: // refused by formatObstacle
+    case FileFormat::Tiff: // see TiffWriter
+    case FileFormat::Psd:  // refused by formatObstacle
         break;
     }
     return -1;

@@ -4,8 +4,8 @@
 
 namespace orvela {
 
-/// The picture as the bytes of a file of that format, with its ICC profile. Only HEIF, to which nothing can
-/// be added afterwards, gets its Exif and XMP, out of `metadata`, already here.
+/// The picture as the bytes of a file of that format, not TIFF, with its ICC profile. Only HEIF, to which
+/// nothing can be added afterwards, gets its Exif and XMP, out of `metadata`, already here.
 /// @param target  for messages; .avif asks for AV1 compression
 /// @throws PhotographError when the picture cannot be encoded or a setting is unknown
 /// @throws StoppedError when `options.stop` was set

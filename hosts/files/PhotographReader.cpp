@@ -1,74 +1,23 @@
 #include "files/PhotographReader.h"
 
+#include "files/Animation.h"
 #include "files/EncodingProbe.h"
 #include "files/HeifReader.h"
 #include "files/JpegReader.h"
 #include "files/PsdFile.h"
 #include "files/Refusal.h"
-#include "files/Vips.h"
+#include "files/SourceFile.h"
+#include "files/TiffReader.h"
+#include "files/VipsPhotograph.h"
 #include "metadata/MetadataReader.h"
 
-#include <fcntl.h>
-#include <sys/stat.h>
-#include <unistd.h>
-
 #include <algorithm>
-#include <cerrno>
-#include <cstring>
-#include <system_error>
 
 namespace orvela {
 
 namespace {
 
 namespace fs = std::filesystem;
-
-/// A file opened for reading, closed at the end.
-class OpenFile {
-public:
-    explicit OpenFile(const fs::path& path)
-        : mHandle(::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK)) {
-        if (mHandle >= 0)
-            return;
-        if (errno == ENOENT || errno == ENOTDIR)
-            refuse(path, "there is no such file", "check the name");
-        if (errno == EACCES || errno == EPERM)
-            refuse(path, "no permission to read it", "ask its owner for read access");
-        refuse(path, std::string("cannot be opened (") + std::strerror(errno) + ")", "check the file system");
-    }
-    ~OpenFile() { ::close(mHandle); }
-    OpenFile(const OpenFile&) = delete;
-    OpenFile& operator=(const OpenFile&) = delete;
-
-    int handle() const { return mHandle; }
-
-private:
-    int mHandle;
-};
-
-Bytes readFile(const fs::path& path) {
-    const OpenFile file(path);
-    struct stat status {};
-    ::fstat(file.handle(), &status);
-    if (S_ISDIR(status.st_mode))
-        refuse(path, "is a folder", "name the photographs in it");
-    if (!S_ISREG(status.st_mode))
-        refuse(path, "is not a regular file", "save the photograph to a file first");
-    if (status.st_size == 0)
-        refuse(path, "the file is empty", kCopyAgain);
-    Bytes bytes(static_cast<std::size_t>(status.st_size));
-    for (std::size_t at = 0; at < bytes.size();) {
-        const ssize_t got = ::read(file.handle(), bytes.data() + at, bytes.size() - at);
-        if (got < 0 && errno == EINTR)
-            continue;
-        if (got < 0)
-            refuse(path, std::string("cannot be read (") + std::strerror(errno) + ")", "check the disk");
-        if (got == 0)
-            refuse(path, "the file became shorter while it was read", "try again when it is complete");
-        at += static_cast<std::size_t>(got);
-    }
-    return bytes;
-}
 
 VipsImage* load(const Bytes& file, FileFormat format) {
     void* data = const_cast<std::uint8_t*>(file.data());
@@ -81,15 +30,13 @@ VipsImage* load(const Bytes& file, FileFormat format) {
     case FileFormat::Png:
         run(vips_pngload_buffer);
         break;
-    case FileFormat::Tiff:
-        run(vips_tiffload_buffer);
-        break;
     case FileFormat::WebP:
         run(vips_webpload_buffer);
         break;
     case FileFormat::Jpeg: // these have readers of their own
     case FileFormat::Heif:
-    case FileFormat::Psd:
+    case FileFormat::Tiff: // see loadPage
+    case FileFormat::Psd:  // see PsdFile
         break;
     }
     return image;
@@ -102,47 +49,8 @@ VipsHandle open(const fs::path& path, const Bytes& file, FileFormat format) {
         refuse(path, "the file is cut short", kCopyAgain);
     VipsHandle image(load(file, format));
     if (!image)
-        refuse(path, "is damaged or cut short (" + takeVipsError() + ")", kCopyAgain);
+        refuseUnread(path);
     return image;
-}
-
-// Of the kinds it names, scRGB always has float samples, which depthOf refuses.
-ColorModel modelOf(const fs::path& path, VipsImage* image) {
-    const int bands = vips_image_get_bands(image);
-    const VipsInterpretation kind = vips_image_get_interpretation(image);
-    const bool grey = kind == VIPS_INTERPRETATION_B_W || kind == VIPS_INTERPRETATION_GREY16;
-    const bool rgb = kind == VIPS_INTERPRETATION_sRGB || kind == VIPS_INTERPRETATION_RGB ||
-                     kind == VIPS_INTERPRETATION_RGB16 || kind == VIPS_INTERPRETATION_scRGB;
-    if (bands > 4)
-        refuse(path, "has more than four channels", "save it flattened, without extra channels");
-    if (grey && bands <= 2)
-        return bands == 1 ? ColorModel::Grey : ColorModel::GreyAlpha;
-    if (rgb && bands >= 3)
-        return bands == 3 ? ColorModel::Rgb : ColorModel::RgbAlpha;
-    if (kind == VIPS_INTERPRETATION_CMYK && bands == 4)
-        return ColorModel::Cmyk;
-    const char* name = vips_enum_nick(VIPS_TYPE_INTERPRETATION, kind);
-    refuse(path,
-           std::string("has the colour model \"") + name + "\" with " + std::to_string(bands) + " channels",
-           "convert it to RGB, grey or CMYK");
-}
-
-int depthOf(const fs::path& path, VipsImage* image) {
-    const VipsBandFormat format = vips_image_get_format(image);
-    if (format == VIPS_FORMAT_UCHAR && vips_image_get_coding(image) == VIPS_CODING_NONE)
-        return 8;
-    if (format == VIPS_FORMAT_USHORT)
-        return 16;
-    refuse(path,
-           std::string("has samples of the kind \"") + vips_enum_nick(VIPS_TYPE_BAND_FORMAT, format) + "\"",
-           "convert it to 8 or 16 bits per channel");
-}
-
-int numberField(VipsImage* image, const char* name) {
-    int value = 0;
-    if (vips_image_get_typeof(image, name) != 0)
-        vips_image_get_int(image, name, &value);
-    return value;
 }
 
 Encoding encodingOf(const Bytes& file, FileFormat format) {
@@ -150,60 +58,50 @@ Encoding encodingOf(const Bytes& file, FileFormat format) {
     encoding.format = format;
     if (format == FileFormat::Png)
         encoding.progressive = file.size() > 28 && file[28] == 1;
-    if (format == FileFormat::Tiff)
-        encoding.compression = probeTiffCompression(file);
     if (format == FileFormat::WebP)
         encoding.lossless = webpIsLossless(file);
     return encoding;
 }
 
+Photograph decodeFile(const Bytes& file, FileFormat format, const fs::path& path) {
+    const VipsHandle image = open(path, file, format);
+    Photograph photograph = describeImage(path, image.get());
+    photograph.encoding = encodingOf(file, format);
+    takeSamples(photograph, path, image.get());
+    return photograph;
+}
+
+void refuseAnimation(const fs::path& path, const char* kind, int frames) {
+    refuse(path, "is " + std::string(kind) + " of " + std::to_string(frames) + " frames",
+           "--first-frame enhances the first");
+}
+
+// How many pictures the file shows one after the other.
+int framesOf(const fs::path& path, const Bytes& file, FileFormat format, bool firstOnly) {
+    int frames = 1;
+    if (format == FileFormat::Png)
+        frames = pngFrames(file);
+    if (format == FileFormat::WebP)
+        frames = webpFrames(file);
+    if (format == FileFormat::Heif) {
+        const HeifPictures pictures = heifPictures(file);
+        if (pictures.frames > 0 && !pictures.still)
+            refuse(path, "is an image sequence without a still picture", "save its frames as pictures");
+        frames = pictures.frames;
+    }
+    if (frames > 1 && !firstOnly)
+        refuseAnimation(path, format == FileFormat::Heif ? "an image sequence" : "an animation", frames);
+    return frames;
+}
+
 // Exif's density counts only where the container says nothing.
 void takeResolution(Photograph& photograph) {
-    const std::optional<Density> density = densityOf(*photograph.metadata);
+    const std::optional<Density> density =
+        photograph.metadata ? densityOf(*photograph.metadata) : std::optional<Density>();
     if (!density || density->millimetres() == 0)
         return;
     photograph.xResolution = density->x.value() / density->millimetres();
     photograph.yResolution = density->y.value() / density->millimetres();
-}
-
-void takeProfile(Photograph& photograph, VipsImage* image) {
-    const void* data = nullptr;
-    std::size_t size = 0;
-    if (vips_image_get_typeof(image, VIPS_META_ICC_NAME) == 0 ||
-        vips_image_get_blob(image, VIPS_META_ICC_NAME, &data, &size) != 0)
-        return;
-    const auto* bytes = static_cast<const std::uint8_t*>(data);
-    photograph.iccProfile.assign(bytes, bytes + size);
-}
-
-int storeRows(VipsRegion* region, VipsRect* area, void* target) {
-    auto* samples = static_cast<std::uint8_t*>(target);
-    const std::size_t row = VIPS_IMAGE_SIZEOF_LINE(region->im);
-    for (int y = area->top; y < area->top + area->height; ++y)
-        std::memcpy(samples + static_cast<std::size_t>(y) * row, VIPS_REGION_ADDR(region, 0, y), row);
-    return 0;
-}
-
-void takeSamples(Photograph& photograph, const fs::path& path, VipsImage* image) {
-    photograph.samples.resize(VIPS_IMAGE_SIZEOF_IMAGE(image));
-    if (vips_sink_disc(image, storeRows, photograph.samples.data()) != 0)
-        refuse(path, "is damaged or cut short (" + takeVipsError() + ")", kCopyAgain);
-}
-
-Photograph decode(const Bytes& file, FileFormat format, const fs::path& path) {
-    const VipsHandle image = open(path, file, format);
-    Photograph photograph;
-    photograph.source = path;
-    photograph.width = vips_image_get_width(image.get());
-    photograph.height = vips_image_get_height(image.get());
-    photograph.model = modelOf(path, image.get());
-    photograph.depth = depthOf(path, image.get());
-    checkEdges(photograph.width, photograph.height, path);
-    photograph.encoding = encodingOf(file, format);
-    photograph.pages = std::max(1, numberField(image.get(), VIPS_META_N_PAGES));
-    takeProfile(photograph, image.get());
-    takeSamples(photograph, path, image.get());
-    return photograph;
 }
 
 Photograph read(const Bytes& file, FileFormat format, const fs::path& path) {
@@ -215,22 +113,53 @@ Photograph read(const Bytes& file, FileFormat format, const fs::path& path) {
     case FileFormat::Psd:
         return readPsd(file, path);
     default:
-        return decode(file, format, path);
+        return decodeFile(file, format, path);
     }
 }
 
 } // namespace
 
-Photograph readPhotograph(const fs::path& path) {
-    const Bytes file = readFile(path);
-    const std::optional<FileFormat> format = formatOfContent(file);
+PhotographReader::PhotographReader(const fs::path& path, const ReadOptions& options)
+    : mOptions(options), mFile(std::make_unique<SourceFile>(path)) {
+    const std::optional<FileFormat> format =
+        formatOfContent(mFile->read(0, std::min<std::uint64_t>(mFile->size(), 16)));
     if (!format)
         refuse(path, "is not a picture of a known kind",
                "JPEG, PNG, TIFF, WebP, PSD and HEIF files can be read");
-    Photograph photograph = read(file, *format, path);
-    photograph.metadata = std::make_shared<const Metadata>(readMetadata(file, *format));
+    mFormat = *format;
+    if (mFormat != FileFormat::Tiff)
+        return;
+    mTiff = std::make_unique<TiffFile>(*mFile, options.firstOnly ? 1 : TiffFile::kAll);
+    mPages = mTiff->pages();
+}
+
+PhotographReader::~PhotographReader() = default;
+
+Photograph PhotographReader::next() {
+    Photograph photograph = mTiff ? readTiffPage(*mFile, *mTiff, mNext) : readOther();
+    photograph.source = mFile->path();
+    photograph.encoding.format = mFormat;
+    photograph.pages = mPages;
+    photograph.page = mNext++;
+    if (mTiff && mTiff->hasMore())
+        photograph.unheld.emplace_back("the other pages");
     takeResolution(photograph);
     return photograph;
+}
+
+Photograph PhotographReader::readOther() {
+    const Bytes file = mFile->read(0, mFile->size());
+    const int frames = framesOf(mFile->path(), file, mFormat, mOptions.firstOnly);
+    Photograph photograph = read(file, mFormat, mFile->path());
+    if (frames > 1)
+        photograph.unheld.push_back(frames > 2 ? "the other " + std::to_string(frames - 1) + " frames"
+                                               : "the other frame");
+    photograph.metadata = std::make_shared<const Metadata>(readMetadata(file, mFormat));
+    return photograph;
+}
+
+Photograph readPhotograph(const fs::path& path, const ReadOptions& options) {
+    return PhotographReader(path, options).next();
 }
 
 } // namespace orvela

@@ -1,10 +1,15 @@
 #include "files/PhotographWriter.h"
 
 #include "files/Conversion.h"
+#include "files/LibTiff.h"
 #include "files/PhotographEncoder.h"
 #include "files/TargetFile.h"
 #include "files/Thumbnail.h"
+#include "files/TiffFields.h"
+#include "files/TiffWriter.h"
 #include "metadata/MetadataWriter.h"
+
+#include <algorithm>
 
 namespace orvela {
 
@@ -20,7 +25,28 @@ FileFormat targetFormat(const Photograph& photograph, const fs::path& target) {
     const std::string obstacle = formatObstacle(*format, photograph);
     if (!obstacle.empty())
         throw PhotographError(target.string() + ": " + obstacle);
+    if (photograph.pages > 1 && *format != FileFormat::Tiff)
+        throw PhotographError(target.string() + ": " + formatName(*format) + " cannot hold the " +
+                              std::to_string(photograph.pages) + " pages of " + photograph.source.string() +
+                              "; choose a TIFF target, or --first-frame for the first page");
     return *format;
+}
+
+PreparedMetadata metadataFor(const Photograph& photograph, FileFormat target) {
+    PreparedMetadata metadata =
+        prepareMetadata(photograph.metadata ? *photograph.metadata : Metadata(), target,
+                        {photograph.width, photograph.height, thumbnailsOf(photograph)});
+    metadata.lost.insert(metadata.lost.end(), photograph.unheld.begin(), photograph.unheld.end());
+    return metadata;
+}
+
+bool hasMakerNote(const Bytes& exif) {
+    if (exif.empty())
+        return false;
+    const TiffView view(exif);
+    const ExifDirectories directories = exifDirectories(view, view.first());
+    const TagDirectory* found = directories.find(tiff::ExifIfd);
+    return found != nullptr && found->find(tiff::MakerNote) != nullptr;
 }
 
 } // namespace
@@ -30,26 +56,100 @@ void checkTarget(const Photograph& photograph, const fs::path& target, const Wri
     checkTargetPath(target, photograph.source, options.overwrite);
 }
 
-std::vector<std::string> writePhotograph(const Photograph& photograph, const fs::path& target,
-                                         const WriteOptions& options) {
-    const FileFormat format = targetFormat(photograph, target);
-    checkTargetPath(target, photograph.source, options.overwrite);
+PhotographWriter::PhotographWriter(fs::path target, const WriteOptions& options)
+    : mTarget(std::move(target)), mOptions(options) {}
+
+PhotographWriter::~PhotographWriter() = default;
+
+void PhotographWriter::add(const Photograph& photograph) {
+    const FileFormat format = targetFormat(photograph, mTarget);
+    if (!hasBegun()) {
+        checkTargetPath(mTarget, photograph.source, mOptions.overwrite);
+        mSource = photograph.source;
+        mPages = photograph.pages;
+    }
     const Conversion conversion = conversionFor(format, photograph);
     std::optional<Photograph> changed;
     if (changesSamples(conversion))
         changed = converted(photograph, conversion);
     const Photograph& written = changed ? *changed : photograph;
-    PreparedMetadata metadata =
-        prepareMetadata(photograph.metadata ? *photograph.metadata : Metadata(), format,
-                        {photograph.width, photograph.height, thumbnailsOf(written)});
+    PreparedMetadata metadata = metadataFor(written, format);
     const std::vector<std::string> lost = losses(conversion);
     metadata.lost.insert(metadata.lost.begin(), lost.begin(), lost.end());
-    Bytes encoded = encodePhotograph(written, format, target, options, metadata.metadata);
+    if (format == FileFormat::Tiff)
+        addPage(written, metadata);
+    else
+        addEncoded(written, metadata);
+    take(metadataNotes(metadata), photograph.page);
+    take(photograph.notes, photograph.page);
+}
+
+void PhotographWriter::addPage(const Photograph& photograph, PreparedMetadata& prepared) {
+    const Metadata& metadata = prepared.metadata;
+    const ByteOrder order = photograph.tiffPage     ? photograph.tiffPage->order
+                            : metadata.exif.empty() ? ByteOrder::Little
+                                                    : TiffView(metadata.exif).order();
+    try {
+        const TiffStorage storage = tiffStorage(photograph, mOptions);
+        if (!hasBegun()) {
+            mFile = std::make_unique<TargetFile>(mTarget);
+            mTiff = std::make_unique<TiffWriter>(*mFile, order, metadata.exif, mOptions.stop);
+        } else if (hasMakerNote(metadata.exif)) {
+            prepared.lost.emplace_back("what the maker note refers to by its place");
+        }
+        if (photograph.copied)
+            mTiff->addCopy(photograph.tiffPage->blocks, copiedFields(*photograph.tiffPage));
+        else
+            mTiff->addPicture(photograph, storage, pageFields(photograph, metadata, order, prepared.lost));
+    } catch (const TiffError& error) {
+        throw PhotographError(mTarget.string() + ": TIFF encoding failed (" + error.what() +
+                              "); choose other settings or another format");
+    }
+}
+
+void PhotographWriter::addEncoded(const Photograph& photograph, PreparedMetadata& metadata) {
+    Bytes encoded = encodePhotograph(photograph, metadata.target, mTarget, mOptions, metadata.metadata);
     embedMetadata(metadata, encoded);
-    TargetFile file(target);
-    file.write(encoded, options.stop);
-    file.commit(options.overwrite);
-    return metadataNotes(metadata, photograph.source.string());
+    mFile = std::make_unique<TargetFile>(mTarget);
+    mFile->write(encoded, mOptions.stop);
+}
+
+void PhotographWriter::take(const std::vector<std::string>& notes, int page) {
+    for (const std::string& text : notes) {
+        const auto same =
+            std::find_if(mNotes.begin(), mNotes.end(), [&](const Note& note) { return note.text == text; });
+        if (same == mNotes.end())
+            mNotes.push_back({text, page, 1});
+        else
+            ++same->times;
+    }
+}
+
+std::string PhotographWriter::prefix(const Note& note) const {
+    std::string text = mSource.string() + ": ";
+    if (mPages == 1)
+        return text;
+    text += "page " + std::to_string(note.page + 1);
+    if (note.times > 1)
+        text += " and " + std::to_string(note.times - 1) + " more";
+    return text + ": ";
+}
+
+std::vector<std::string> PhotographWriter::commit() {
+    if (mTiff)
+        mTiff->finish();
+    mFile->commit(mOptions.overwrite);
+    std::vector<std::string> warnings;
+    for (const Note& note : mNotes)
+        warnings.push_back(prefix(note) + note.text);
+    return warnings;
+}
+
+std::vector<std::string> writePhotograph(const Photograph& photograph, const fs::path& target,
+                                         const WriteOptions& options) {
+    PhotographWriter writer(target, options);
+    writer.add(photograph);
+    return writer.commit();
 }
 
 } // namespace orvela

@@ -30,14 +30,59 @@ struct WriteOptions {
 void checkTarget(const Photograph& photograph, const std::filesystem::path& target,
                  const WriteOptions& options);
 
-/// Writes the photograph in the format that the target's extension names, with its metadata.
+struct PreparedMetadata;
+class TargetFile;
+class TiffWriter;
+
+/// Writes photographs in the format that the target's extension names, with their metadata: the one of most
+/// files, or all pages of a TIFF one after the other, of which one at a time is in memory.
 /// The target appears whole or not at all: the bytes go to a temporary name in its folder, which is removed
-/// on every failure, and take the final name once they are on the disk. Without `overwrite` a file that
+/// when the object dies, and take the final name once they are on the disk. Without `overwrite` a file that
 /// appears under the final name meanwhile is left alone.
-/// @return warnings: what the format cannot hold, metadata that could not be carried over
-/// @throws PhotographError when the format is unknown or cannot hold the picture
-/// @throws TargetError when the target cannot be written
-/// @throws StoppedError when `stop` was set
+class PhotographWriter {
+public:
+    PhotographWriter(std::filesystem::path target, const WriteOptions& options);
+    ~PhotographWriter();
+    PhotographWriter(const PhotographWriter&) = delete;
+    PhotographWriter& operator=(const PhotographWriter&) = delete;
+
+    /// Adds the only photograph or the next page.
+    /// @throws PhotographError when the format is unknown or cannot hold the picture
+    /// @throws TargetError when the target cannot be written
+    /// @throws StoppedError when `stop` was set
+    void add(const Photograph& photograph);
+
+    /// True from the first page on: then there is a temporary file.
+    bool hasBegun() const { return mFile != nullptr; }
+
+    /// Gives the target its name, after all pages were added.
+    /// @return warnings, one a line: what of the photographs and their metadata could not be carried over
+    /// @throws TargetError when the target cannot be written
+    /// @throws StoppedError when `stop` was set
+    std::vector<std::string> commit();
+
+private:
+    struct Note {
+        std::string text;
+        int page;  ///< the first one that it is about
+        int times; ///< the number of them
+    };
+
+    void addPage(const Photograph& photograph, PreparedMetadata& prepared);
+    void addEncoded(const Photograph& photograph, PreparedMetadata& metadata);
+    void take(const std::vector<std::string>& notes, int page);
+    std::string prefix(const Note& note) const;
+
+    std::filesystem::path mTarget;
+    WriteOptions mOptions;
+    std::filesystem::path mSource;
+    int mPages = 1;
+    std::unique_ptr<TargetFile> mFile;
+    std::unique_ptr<TiffWriter> mTiff; ///< null for other formats
+    std::vector<Note> mNotes;
+};
+
+/// Writes a photograph of one page; see PhotographWriter.
 std::vector<std::string> writePhotograph(const Photograph& photograph, const std::filesystem::path& target,
                                          const WriteOptions& options = {});
 

@@ -109,10 +109,23 @@ void TargetFile::write(ByteView bytes, const std::atomic<bool>* stop) {
         const ssize_t written = ::write(mHandle, bytes.data(), std::min(chunk, bytes.size()));
         if (written < 0 && errno != EINTR)
             refuseSystem(mTarget, errno);
-        bytes = bytes.subspan(static_cast<std::size_t>(std::max<ssize_t>(0, written)));
+        const auto count = static_cast<std::size_t>(std::max<ssize_t>(0, written));
+        bytes = bytes.subspan(count);
+        mSize += count;
     }
     if (stop != nullptr && *stop)
         throw StoppedError(mTarget.string() + ": stopped; nothing was written");
+}
+
+void TargetFile::overwrite(std::uint64_t at, ByteView bytes) {
+    while (!bytes.empty()) {
+        const ssize_t written = ::pwrite(mHandle, bytes.data(), bytes.size(), static_cast<off_t>(at));
+        if (written < 0 && errno != EINTR)
+            refuseSystem(mTarget, errno);
+        const auto count = static_cast<std::size_t>(std::max<ssize_t>(0, written));
+        bytes = bytes.subspan(count);
+        at += count;
+    }
 }
 
 void TargetFile::commit(bool overwrite) {

@@ -27,6 +27,12 @@ public:
     /// @throws TargetError, StoppedError
     void write(ByteView bytes, const std::atomic<bool>* stop);
 
+    /// Writes over bytes that are there already. @throws TargetError
+    void overwrite(std::uint64_t at, ByteView bytes);
+
+    /// How much was written.
+    std::uint64_t size() const { return mSize; }
+
     /// Syncs the file, gives it the final name and syncs the folder. Without `overwrite` the system itself
     /// refuses a name that exists.
     /// @throws TargetError
@@ -38,6 +44,7 @@ private:
     std::filesystem::path mTarget;
     std::filesystem::path mTemporary;
     int mHandle = -1;
+    std::uint64_t mSize = 0;
 };
 
 } // namespace orvela

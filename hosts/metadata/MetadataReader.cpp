@@ -16,14 +16,14 @@ namespace orvela {
 
 namespace {
 
-Metadata readContainer(ByteView file, FileFormat format) {
+Metadata readContainer(ByteView file, FileFormat format, std::size_t page) {
     switch (format) {
     case FileFormat::Jpeg:
         return readJpegMetadata(file);
     case FileFormat::Png:
         return readPngMetadata(file);
     case FileFormat::Tiff:
-        return readTiffMetadata(file);
+        return readTiffMetadata(file, page);
     case FileFormat::WebP:
         return readWebPMetadata(file);
     case FileFormat::Psd:
@@ -36,8 +36,8 @@ Metadata readContainer(ByteView file, FileFormat format) {
 
 } // namespace
 
-Metadata readMetadata(ByteView file, FileFormat format) {
-    Metadata metadata = readContainer(file, format);
+Metadata readMetadata(ByteView file, FileFormat format, std::size_t page) {
+    Metadata metadata = readContainer(file, format, page);
     const auto damaged = [&](const char* what) {
         if (std::find(metadata.damaged.begin(), metadata.damaged.end(), what) == metadata.damaged.end())
             metadata.damaged.emplace_back(what);

@@ -5,7 +5,6 @@
 #include "metadata/MetadataReader.h"
 #include "metadata/PngMetadata.h"
 #include "metadata/TagLibrary.h"
-#include "metadata/TiffMetadata.h"
 #include "metadata/Utf8.h"
 #include "metadata/WebPMetadata.h"
 
@@ -246,18 +245,13 @@ void Preparation::fitTiff() {
     }
 }
 
-Names differences(const Metadata& wanted, const Metadata& found, FileFormat target, const Bytes& encoded) {
+Names differences(const Metadata& wanted, const Metadata& found) {
     Names names;
     const auto check = [&](bool same, const char* name) {
         if (!same)
             names.emplace_back(name);
     };
-    if (target == FileFormat::Tiff && !wanted.exif.empty() &&
-        TiffView(wanted.exif).order() == TiffView(encoded).order()) {
-        const Names missing = missingInTiff(wanted, encoded);
-        names.insert(names.end(), missing.begin(), missing.end());
-    }
-    check(target == FileFormat::Tiff || wanted.exif == found.exif, "the Exif data");
+    check(wanted.exif == found.exif, "the Exif data");
     check(wanted.xmp == found.xmp, "the XMP data");
     check(sameResources(wanted.resources, found.resources), "Photoshop's data");
     check(wanted.texts == found.texts, "the texts");
@@ -291,23 +285,21 @@ void embedMetadata(PreparedMetadata& prepared, Bytes& encoded) {
         embedIntoWebP(metadata, encoded);
         break;
     case FileFormat::Tiff:
-        lose(embedIntoTiff(metadata, encoded));
-        break;
     case FileFormat::Heif:
     case FileFormat::Psd:
         break;
     }
-    lose(differences(metadata, readMetadata(encoded, prepared.target), prepared.target, encoded));
+    lose(differences(metadata, readMetadata(encoded, prepared.target)));
 }
 
-std::vector<std::string> metadataNotes(const PreparedMetadata& prepared, const std::string& name) {
+std::vector<std::string> metadataNotes(const PreparedMetadata& prepared) {
     std::vector<std::string> notes;
     const auto& damaged = prepared.metadata.damaged;
     if (!prepared.lost.empty())
-        notes.push_back(name + ": the " + formatName(prepared.target) +
+        notes.push_back(std::string("the ") + formatName(prepared.target) +
                         " file cannot hold: " + joined(prepared.lost, "; "));
     if (!damaged.empty())
-        notes.push_back(name + ": damaged, carried over as far as possible: " + joined(damaged, "; "));
+        notes.push_back("damaged, carried over as far as possible: " + joined(damaged, "; "));
     return notes;
 }
 

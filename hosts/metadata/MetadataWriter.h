@@ -24,11 +24,11 @@ struct PreparedMetadata {
 PreparedMetadata prepareMetadata(const Metadata& source, FileFormat target, const PictureFacts& picture);
 
 /// Puts the metadata into an encoded picture, in place of what the encoder wrote, and reads it back. What did
-/// not arrive joins what is lost. A HEIF's Exif and XMP must have been written by its encoder.
+/// not arrive joins what is lost. A HEIF's Exif and XMP must have been written by its encoder, a TIFF's by
+/// TiffWriter.
 void embedMetadata(PreparedMetadata& prepared, Bytes& encoded);
 
-/// What there is to tell about the photograph of that name: at most one line about what is lost, one about
-/// what is damaged.
-std::vector<std::string> metadataNotes(const PreparedMetadata& prepared, const std::string& name);
+/// What there is to tell: at most one line about what is lost, one about what is damaged.
+std::vector<std::string> metadataNotes(const PreparedMetadata& prepared);
 
 } // namespace orvela

@@ -86,17 +86,6 @@ RewrittenExif encode(const Exiv2::ExifData& tags, ByteOrder order) {
 
 } // namespace
 
-RewrittenExif rewriteExif(ByteView block, ByteOrder order) {
-    prepareLibrary();
-    try {
-        Exiv2::ExifData tags;
-        Exiv2::ExifParser::decode(tags, block.data(), static_cast<std::uint32_t>(block.size()));
-        return encode(tags, order);
-    } catch (const Exiv2::AnyError& error) {
-        throw DamagedBytes(error.what());
-    }
-}
-
 RewrittenExif rewriteTiffExif(ByteView file) {
     prepareLibrary();
     try {
@@ -135,14 +124,6 @@ std::vector<std::string> iptcNames(ByteView iptc) {
             std::find(names.begin(), names.end(), datum.tagName()) == names.end())
             names.push_back(datum.tagName());
     return names;
-}
-
-std::string exifTagName(std::uint16_t directory, std::uint16_t tag) {
-    const char* group = directory == tiff::ExifIfd      ? "Photo"
-                        : directory == tiff::GpsIfd     ? "GPSInfo"
-                        : directory == tiff::InteropIfd ? "Iop"
-                                                        : "Image";
-    return Exiv2::ExifKey(tag, group).tagName();
 }
 
 } // namespace orvela

@@ -14,10 +14,6 @@ struct RewrittenExif {
     std::vector<std::string> lost; ///< names of the tags that vanished or changed
 };
 
-/// @param block  from the byte order mark on
-/// @throws DamagedBytes when the library cannot read it
-RewrittenExif rewriteExif(ByteView block, ByteOrder order);
-
 /// The tags of a TIFF's first page that describe the picture, as a block in the file's byte order.
 /// @throws DamagedBytes when the library cannot read it
 RewrittenExif rewriteTiffExif(ByteView file);
@@ -26,8 +22,5 @@ bool isWellFormedXmp(ByteView packet);
 
 /// "Keywords", "City", ...: each kind of an IPTC block once, without what tells of the block itself.
 std::vector<std::string> iptcNames(ByteView iptc);
-
-/// @param directory  the tag that leads to its directory; 0 for the first one
-std::string exifTagName(std::uint16_t directory, std::uint16_t tag);
 
 } // namespace orvela

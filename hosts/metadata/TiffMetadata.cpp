@@ -184,161 +184,6 @@ void takeResources(const TagDirectory& page, Metadata& metadata) {
     appendResource(metadata.resources, resource::Iptc, iptc);
 }
 
-// Moves what an encoded TIFF consists of: every offset in it grows.
-void shiftOffsets(Bytes& file, const TiffView& encoded, std::size_t shift) {
-    constexpr std::size_t pages = 65536;
-    const TagChain chain = encoded.chain(pages);
-    if (!chain.complete)
-        throw DamagedBytes("its directories cannot be followed");
-    const auto grow = [&](std::size_t at, std::uint64_t old, std::size_t size) {
-        store(file, at + shift, old + shift, size, encoded.order());
-    };
-    for (const TagDirectory& directory : chain.list) {
-        for (const TagEntry& entry : directory.entries) {
-            const std::size_t field = entry.place + 4 + encoded.offsetSize();
-            if (entry.valueAt != field)
-                grow(field, entry.valueAt, encoded.offsetSize());
-            if (entry.tag != tiff::StripOffsets && entry.tag != tiff::TileOffsets)
-                continue;
-            const std::size_t each = tagTypeSize(entry.type);
-            for (std::size_t i = 0; i < entry.count; ++i)
-                grow(entry.valueAt + i * each, encoded.value(entry, i), each);
-        }
-        if (directory.next != 0)
-            grow(directory.linkAt, directory.next, encoded.offsetSize());
-    }
-}
-
-/// Writes directories to the end of a TIFF.
-class DirectoryWriter {
-public:
-    explicit DirectoryWriter(Bytes& file)
-        : mFile(file), mOrder(TiffView(file).order()), mBig(TiffView(file).isBig()) {}
-
-    /// An entry with its value; a long one goes to the file's end.
-    Bytes entry(const TagField& field) {
-        Bytes bytes = head(field.tag, field.type, field.count);
-        if (field.value.size() > offsetSize()) {
-            padToEven(mFile);
-            append(bytes, mFile.size(), offsetSize(), mOrder);
-            append(mFile, field.value);
-        } else {
-            append(bytes, field.value);
-            bytes.resize(4 + 2 * offsetSize());
-        }
-        return bytes;
-    }
-
-    /// An entry whose value stands in the file already, unless it is short enough for the entry.
-    Bytes reference(const TagEntry& old) {
-        const auto count = static_cast<std::uint32_t>(old.count);
-        if (old.value.size() <= offsetSize())
-            return entry({old.tag, old.type, count, copyOf(old.value)});
-        Bytes bytes = head(old.tag, old.type, count);
-        append(bytes, old.valueAt, offsetSize(), mOrder);
-        return bytes;
-    }
-
-    Bytes pointer(std::uint16_t tag, std::size_t place) {
-        TagField field{tag, tiff::Long, 1, {}};
-        append(field.value, place, 4, mOrder);
-        return entry(field);
-    }
-
-    std::size_t directory(const std::map<std::uint16_t, Bytes>& entries, std::size_t next) {
-        padToEven(mFile);
-        const std::size_t place = mFile.size();
-        append(mFile, entries.size(), mBig ? 8 : 2, mOrder);
-        for (const auto& [tag, bytes] : entries)
-            append(mFile, bytes);
-        append(mFile, next, offsetSize(), mOrder);
-        return place;
-    }
-
-private:
-    std::size_t offsetSize() const { return mBig ? 8 : 4; }
-
-    Bytes head(std::uint16_t tag, std::uint16_t type, std::uint32_t count) const {
-        Bytes bytes;
-        append(bytes, tag, 2, mOrder);
-        append(bytes, type, 2, mOrder);
-        append(bytes, count, offsetSize(), mOrder);
-        return bytes;
-    }
-
-    Bytes& mFile;
-    ByteOrder mOrder;
-    bool mBig;
-};
-
-using Entries = std::map<std::uint16_t, Bytes>;
-
-Entries entriesOf(const ExifDirectories& block, std::uint16_t pointer, DirectoryWriter& writer) {
-    Entries entries;
-    const TagDirectory* directory = block.find(pointer);
-    if (directory == nullptr)
-        return entries;
-    for (const TagEntry& entry : directory->entries)
-        if (!isPointer(entry.tag) && !(pointer == 0 && isTiffStructure(entry.tag)))
-            entries.emplace(entry.tag, writer.reference(entry));
-    return entries;
-}
-
-// The first directory's entries of a block that is the beginning of the file. Directories of a BigTIFF have
-// another form, so that those below are written anew; the values stay where they are.
-Entries blockEntries(const TiffView& block, bool big, DirectoryWriter& writer) {
-    const ExifDirectories directories = exifDirectories(block, block.first());
-    Entries first = entriesOf(directories, 0, writer);
-    const auto below = [&](std::uint16_t pointer) {
-        Entries entries = entriesOf(directories, pointer, writer);
-        const TagDirectory* interop = directories.find(tiff::InteropIfd);
-        if (pointer == tiff::ExifIfd && interop != nullptr)
-            entries.emplace(
-                tiff::InteropIfd,
-                writer.pointer(tiff::InteropIfd,
-                               big ? writer.directory(entriesOf(directories, tiff::InteropIfd, writer), 0)
-                                   : interop->place));
-        return writer.directory(entries, 0);
-    };
-    for (const std::uint16_t pointer : {tiff::ExifIfd, tiff::GpsIfd})
-        if (const TagDirectory* old = directories.find(pointer))
-            first.emplace(pointer, writer.pointer(pointer, big ? below(pointer) : old->place));
-    return first;
-}
-
-// What has a tag of its own in a TIFF.
-std::vector<TagField> ownFields(const Metadata& metadata, ByteOrder order) {
-    std::vector<TagField> fields;
-    const auto add = [&](std::uint16_t tag, std::uint16_t type, Bytes value) {
-        const auto count = static_cast<std::uint32_t>(value.size() / tagTypeSize(type));
-        if (count > 0)
-            fields.push_back({tag, type, count, std::move(value)});
-    };
-    add(tiff::Xmp, tiff::Byte, metadata.xmp);
-    const ImageResources resources = imageResources(metadata.resources);
-    if (const ImageResource* iptc = resources.find(resource::Iptc)) {
-        Bytes padded = copyOf(iptc->data);
-        padded.resize((padded.size() + 3) / 4 * 4);
-        add(tiff::Iptc, tiff::Long, std::move(padded));
-    }
-    add(tiff::Resources, tiff::Byte, withoutResources(metadata.resources, {resource::Iptc}));
-    if (metadata.density)
-        for (TagField& field : densityFields(*metadata.density, order))
-            fields.push_back(std::move(field));
-    return fields;
-}
-
-// The block in the byte order of the file.
-RewrittenExif blockFor(const Metadata& metadata, const TiffView& encoded) {
-    if (metadata.exif.empty())
-        return {};
-    const TiffView block(metadata.exif);
-    if (ExifBlock(metadata.exif).isDamaged())
-        throw DamagedBytes("the Exif data is damaged");
-    return block.order() == encoded.order() ? RewrittenExif{metadata.exif, {}}
-                                            : rewriteExif(metadata.exif, encoded.order());
-}
-
 } // namespace
 
 Metadata readTiffMetadata(ByteView file, std::size_t page) {
@@ -366,55 +211,25 @@ Metadata readTiffMetadata(ByteView file, std::size_t page) {
     return metadata;
 }
 
-std::vector<std::string> embedIntoTiff(const Metadata& metadata, Bytes& encoded) {
-    const TiffView view(encoded);
-    RewrittenExif block = blockFor(metadata, view);
-    Bytes file = block.block;
-    file.resize(std::max(file.size(), view.headerSize()));
-    padToEven(file);
-    std::copy_n(encoded.begin(), view.headerSize(), file.begin());
-    const std::size_t shift = file.size() - view.headerSize();
-    append(file, behind(encoded, view.headerSize()));
-    shiftOffsets(file, view, shift);
-
-    const TagDirectory page = view.directory(view.first());
-    DirectoryWriter writer(file);
-    Entries entries;
-    for (const TagField& field : ownFields(metadata, view.order()))
-        entries.emplace(field.tag, writer.entry(field));
-    if (!block.block.empty())
-        entries.merge(blockEntries(TiffView(block.block), view.isBig(), writer));
-    for (const TagEntry& entry : page.entries)
-        if (isTiffStructure(entry.tag))
-            entries[entry.tag] = copyOf(slice(file, entry.place + shift, view.entrySize()));
-    const std::size_t next = page.next == 0 ? 0 : page.next + shift;
-    const std::size_t first = writer.directory(entries, next);
-    store(file, view.linkAt(), first, view.offsetSize(), view.order());
-    encoded = std::move(file);
-    return std::move(block.lost);
-}
-
-std::vector<std::string> missingInTiff(const Metadata& metadata, ByteView encoded) {
-    if (metadata.exif.empty())
-        return {};
-    const TiffView wanted(metadata.exif);
-    const TiffView found(encoded);
-    const ExifDirectories there = exifDirectories(found, found.first());
-    std::vector<std::string> names;
-    for (const auto& [pointer, directory] : exifDirectories(wanted, wanted.first()).list) {
-        const TagDirectory* other = there.find(pointer);
-        for (const TagEntry& entry : directory.entries) {
-            if (isPointer(entry.tag) ||
-                (pointer == 0 && (isTiffStructure(entry.tag) || isResolution(entry.tag))))
-                continue;
-            const TagEntry* same = other == nullptr ? nullptr : other->find(entry.tag);
-            const bool moved = same != nullptr && entry.tag == tiff::MakerNote &&
-                               same->valueAt != entry.valueAt && entry.value.size() > 8;
-            if (same == nullptr || moved || !sameBytes(same->value, entry.value))
-                names.push_back(exifTagName(pointer, entry.tag));
-        }
+std::vector<TagField> tiffFields(const Metadata& metadata, ByteOrder order) {
+    std::vector<TagField> fields;
+    const auto add = [&](std::uint16_t tag, std::uint16_t type, Bytes value) {
+        const auto count = static_cast<std::uint32_t>(value.size() / tagTypeSize(type));
+        if (count > 0)
+            fields.push_back({tag, type, count, std::move(value)});
+    };
+    add(tiff::Xmp, tiff::Byte, metadata.xmp);
+    const ImageResources resources = imageResources(metadata.resources);
+    if (const ImageResource* iptc = resources.find(resource::Iptc)) {
+        Bytes padded = copyOf(iptc->data);
+        padded.resize((padded.size() + 3) / 4 * 4);
+        add(tiff::Iptc, tiff::Long, std::move(padded));
     }
-    return names;
+    add(tiff::Resources, tiff::Byte, withoutResources(metadata.resources, {resource::Iptc}));
+    if (metadata.density)
+        for (TagField& field : densityFields(*metadata.density, order))
+            fields.push_back(std::move(field));
+    return fields;
 }
 
 } // namespace orvela

@@ -16,6 +16,8 @@ constexpr std::array<std::uint16_t, 54> kStructure = {
     0x0152, 0x0153, 0x0154, 0x0155, 0x015B, 0x0200, 0x0201, 0x0202, 0x0203, 0x0205, 0x0206,
     0x0207, 0x0208, 0x0209, 0x0211, 0x0212, 0x0213, 0x0214, 0x02BC, 0x83BB, 0x8649};
 
+constexpr std::size_t kSharedValues = 1 << 16;
+
 } // namespace
 
 const TagEntry* TagDirectory::find(std::uint16_t tag) const {
@@ -66,8 +68,13 @@ TagDirectory TiffView::directory(std::size_t place) const {
         throw DamagedBytes("a directory is longer than the whole");
     TagDirectory directory;
     directory.place = place;
-    for (std::uint64_t i = 0; i < count; ++i)
+    std::size_t claimed = 0; // entries may share short values, but nobody stores much more than there is
+    for (std::uint64_t i = 0; i < count; ++i) {
         directory.entries.push_back(entry(place + countSize + i * entrySize()));
+        claimed += directory.entries.back().value.size();
+        if (claimed > mBytes.size() + kSharedValues)
+            throw DamagedBytes("a directory claims more values than there are");
+    }
     directory.linkAt = place + countSize + count * entrySize();
     directory.size = directory.linkAt + offsetSize() - place;
     // Some cameras leave the last link out.

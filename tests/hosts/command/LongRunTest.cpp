@@ -68,6 +68,26 @@ TEST_F(LongRunTest, SignalsStopTheRunAndLeaveNothing) {
     }
 }
 
+// From the second page on there is a part of the result, which must not stay.
+TEST_F(LongRunTest, SignalsLeaveNoPartOfSeveralPages) {
+    largePicture("big.tif");
+    ASSERT_EQ(QProcess::execute("convert", {ORVELA_SAMPLES "/coffee.png", path("big.tif"), path("s.tif")}),
+              0);
+    QFile::remove(path("big.tif"));
+    for (const int delay : {0, 100, 400}) { // while the second page is read and while it is enhanced
+        QProcess process;
+        begin(process, "enhance s.tif --mode landscapepro");
+        while (files().size() < 2) {
+            process.waitForFinished(2);
+            ASSERT_EQ(process.state(), QProcess::Running) << "it ended before there was a part";
+        }
+        process.waitForFinished(delay);
+        kill(static_cast<pid_t>(process.processId()), SIGTERM);
+        EXPECT_EQ(finish(process).status, 128 + SIGTERM);
+        EXPECT_EQ(files(), QStringList(QStringLiteral("s.tif"))) << delay;
+    }
+}
+
 TEST_F(LongRunTest, ATerminalShowsProgressAndAPipeDoesNot) {
     sample("a%1.png");
     const std::string text = onTerminal(mFolder.path(), {"enhance", "a%1.png"});
@@ -75,6 +95,11 @@ TEST_F(LongRunTest, ATerminalShowsProgressAndAPipeDoesNot) {
     EXPECT_NE(text.find(" %"), std::string::npos);
     EXPECT_TRUE(text.ends_with("\r\x1b[Ka%1.png -> a%1-enhanced.png\r\n")) << text;
     EXPECT_EQ(onTerminal(mFolder.path(), {"enhance", "a%1.png", "--quiet", "--force"}), "");
+    ASSERT_EQ(QProcess::execute("convert", {path("a%1.png"), path("a%1.png"), path("s.tif")}), 0);
+    const std::string pages = onTerminal(mFolder.path(), {"enhance", "s.tif"});
+    EXPECT_NE(pages.find("[1/1] s.tif  page 1 of 2  Orvela (Iteration Phase I)  "), std::string::npos)
+        << pages;
+    EXPECT_NE(pages.find("[1/1] s.tif  page 2 of 2  Reading  50 %"), std::string::npos) << pages;
     EXPECT_EQ(orvela("enhance a%1.png --force").err, "");
 }
 

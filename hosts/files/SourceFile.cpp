@@ -1,0 +1,86 @@
+#include "files/SourceFile.h"
+
+#include "files/Refusal.h"
+
+#include <fcntl.h>
+#include <sys/mman.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <cstring>
+#include <new>
+
+namespace orvela {
+
+namespace {
+
+namespace fs = std::filesystem;
+
+int openFile(const fs::path& path) {
+    const int handle = ::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);
+    if (handle >= 0)
+        return handle;
+    if (errno == ENOENT || errno == ENOTDIR)
+        refuse(path, "there is no such file", "check the name");
+    if (errno == EACCES || errno == EPERM)
+        refuse(path, "no permission to read it", "ask its owner for read access");
+    refuse(path, std::string("cannot be opened (") + std::strerror(errno) + ")", "check the file system");
+}
+
+std::uint64_t sizeOf(int handle, const fs::path& path) {
+    struct stat status {};
+    ::fstat(handle, &status);
+    if (S_ISDIR(status.st_mode))
+        refuse(path, "is a folder", "name the photographs in it");
+    if (!S_ISREG(status.st_mode))
+        refuse(path, "is not a regular file", "save the photograph to a file first");
+    if (status.st_size == 0)
+        refuse(path, "the file is empty", kCopyAgain);
+    return static_cast<std::uint64_t>(status.st_size);
+}
+
+} // namespace
+
+SourceFile::SourceFile(fs::path path) : mPath(std::move(path)), mHandle(openFile(mPath)) {
+    try {
+        mSize = sizeOf(mHandle, mPath);
+    } catch (...) {
+        ::close(mHandle);
+        throw;
+    }
+}
+
+SourceFile::~SourceFile() {
+    if (mView != nullptr)
+        ::munmap(mView, mSize);
+    ::close(mHandle);
+}
+
+Bytes SourceFile::read(std::uint64_t at, std::uint64_t size) const {
+    Bytes bytes(size);
+    for (std::size_t done = 0; done < bytes.size();) {
+        const ssize_t got =
+            ::pread(mHandle, bytes.data() + done, bytes.size() - done, static_cast<off_t>(at + done));
+        if (got < 0 && errno == EINTR)
+            continue;
+        if (got < 0)
+            refuse(mPath, std::string("cannot be read (") + std::strerror(errno) + ")", "check the disk");
+        if (got == 0)
+            refuse(mPath, "the file became shorter while it was read", "try again when it is complete");
+        done += static_cast<std::size_t>(got);
+    }
+    return bytes;
+}
+
+ByteView SourceFile::view() {
+    if (mView == nullptr) {
+        void* const view = ::mmap(nullptr, mSize, PROT_READ, MAP_PRIVATE, mHandle, 0);
+        if (view == MAP_FAILED)
+            throw std::bad_alloc();
+        mView = view;
+    }
+    return {static_cast<const std::uint8_t*>(mView), mSize};
+}
+
+} // namespace orvela

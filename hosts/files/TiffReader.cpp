@@ -1,0 +1,106 @@
+#include "files/TiffReader.h"
+
+#include "files/JpegQuality.h"
+#include "files/Refusal.h"
+#include "files/TiffStorage.h"
+#include "files/VipsPhotograph.h"
+#include "metadata/MetadataReader.h"
+
+#include <tiff.h>
+#include <unistd.h>
+
+namespace orvela {
+
+namespace {
+
+namespace fs = std::filesystem;
+
+struct SourceRelease {
+    void operator()(VipsSource* source) const { g_object_unref(source); }
+};
+
+VipsHandle loadPage(const SourceFile& file, int page) {
+    ::lseek(file.handle(), 0, SEEK_SET); // the library begins to read where the last page was
+    const std::unique_ptr<VipsSource, SourceRelease> source(vips_source_new_from_descriptor(file.handle()));
+    VipsImage* image = nullptr;
+    if (source)
+        vips_tiffload_source(source.get(), &image, "page", page, "access", VIPS_ACCESS_SEQUENTIAL, "fail_on",
+                             VIPS_FAIL_ON_TRUNCATED, nullptr);
+    return VipsHandle(image);
+}
+
+// libvips takes YCbCr samples for RGB, except those of JPEG compression.
+bool isPlainYcbcr(const TiffPage& page) {
+    return page.number(TIFFTAG_PHOTOMETRIC, PHOTOMETRIC_MINISBLACK) == PHOTOMETRIC_YCBCR &&
+           page.number(TIFFTAG_COMPRESSION, COMPRESSION_NONE) != COMPRESSION_JPEG;
+}
+
+// The tables stand before the strips or tiles, or in each of them.
+int qualityOf(const TiffFile& tiff, const TiffPage& page, int index) {
+    const TiffField* tables = page.find(TIFFTAG_JPEGTABLES);
+    const int shared = tables == nullptr ? 0 : jpegQuality(tables->value);
+    return shared > 0 ? shared : jpegQuality(tiff.readBlocks(page, index, 1).front());
+}
+
+// Size and profile, as the directory tells them.
+Photograph describePage(const TiffPage& page, const fs::path& name) {
+    Photograph photograph;
+    const auto width = static_cast<std::int64_t>(page.number(TIFFTAG_IMAGEWIDTH, 0));
+    const auto height = static_cast<std::int64_t>(page.number(TIFFTAG_IMAGELENGTH, 0));
+    checkEdges(width, height, name);
+    photograph.width = static_cast<int>(width);
+    photograph.height = static_cast<int>(height);
+    if (const TiffField* profile = page.find(TIFFTAG_ICCPROFILE))
+        photograph.iccProfile = profile->value;
+    return photograph;
+}
+
+Photograph decodeYcbcr(const TiffFile& tiff, const TiffPage& page, int index) {
+    Photograph photograph = describePage(page, tiff.pageName(index));
+    photograph.samples = tiff.readRgb(index);
+    photograph.notes.emplace_back("its YCbCr samples were converted to RGB");
+    return photograph;
+}
+
+Photograph decodeMask(const TiffFile& tiff, TiffPage& page, int index) {
+    Photograph photograph = describePage(page, tiff.pageName(index));
+    photograph.copied = true;
+    photograph.model = ColorModel::Grey;
+    page.blocks = tiff.readBlocks(page, index);
+    return photograph;
+}
+
+Photograph decodeWithVips(const SourceFile& file, const TiffPage& page, const fs::path& name, int index) {
+    startVips();
+    vips_error_clear();
+    const VipsHandle image = loadPage(file, index);
+    if (!image)
+        refuseUnread(name);
+    Photograph photograph = describeImage(name, image.get());
+    takeSamples(photograph, name, image.get());
+    if (page.number(TIFFTAG_PHOTOMETRIC, PHOTOMETRIC_MINISBLACK) == PHOTOMETRIC_PALETTE)
+        photograph.notes.emplace_back("its palette was resolved");
+    else if (page.number(TIFFTAG_BITSPERSAMPLE, 1) < 8)
+        photograph.notes.emplace_back("its samples were expanded to 8 bits");
+    return photograph;
+}
+
+} // namespace
+
+Photograph readTiffPage(SourceFile& file, const TiffFile& tiff, int index) {
+    const auto page = std::make_shared<TiffPage>(tiff.page(index));
+    Photograph photograph = TiffFile::isMask(*page) ? decodeMask(tiff, *page, index)
+                            : isPlainYcbcr(*page)   ? decodeYcbcr(tiff, *page, index)
+                                                  : decodeWithVips(file, *page, tiff.pageName(index), index);
+    const std::uint64_t compression = page->number(TIFFTAG_COMPRESSION, COMPRESSION_NONE);
+    photograph.encoding.compression = tiffCompressionName(compression);
+    if (compression == COMPRESSION_JPEG)
+        photograph.encoding.quality = qualityOf(tiff, *page, index);
+    if (!photograph.copied)
+        photograph.metadata =
+            std::make_shared<const Metadata>(readMetadata(file.view(), FileFormat::Tiff, tiff.place(index)));
+    photograph.tiffPage = page;
+    return photograph;
+}
+
+} // namespace orvela

@@ -1,0 +1,100 @@
+#include "files/VipsPhotograph.h"
+
+#include "files/Refusal.h"
+
+#include <cstring>
+
+namespace orvela {
+
+namespace {
+
+namespace fs = std::filesystem;
+
+// Of the kinds it names, scRGB always has float samples, which depthOf refuses.
+ColorModel modelOf(const fs::path& path, VipsImage* image) {
+    const int bands = vips_image_get_bands(image);
+    const VipsInterpretation kind = vips_image_get_interpretation(image);
+    const bool grey = kind == VIPS_INTERPRETATION_B_W || kind == VIPS_INTERPRETATION_GREY16;
+    const bool rgb = kind == VIPS_INTERPRETATION_sRGB || kind == VIPS_INTERPRETATION_RGB ||
+                     kind == VIPS_INTERPRETATION_RGB16 || kind == VIPS_INTERPRETATION_scRGB;
+    if (bands > 4)
+        refuse(path, "has more than four channels", "save it flattened, without extra channels");
+    if (grey && bands <= 2)
+        return bands == 1 ? ColorModel::Grey : ColorModel::GreyAlpha;
+    if (rgb && bands >= 3)
+        return bands == 3 ? ColorModel::Rgb : ColorModel::RgbAlpha;
+    if (kind == VIPS_INTERPRETATION_CMYK && bands == 4)
+        return ColorModel::Cmyk;
+    const char* name = vips_enum_nick(VIPS_TYPE_INTERPRETATION, kind);
+    refuse(path,
+           std::string("has the colour model \"") + name + "\" with " + std::to_string(bands) + " channels",
+           "convert it to RGB, grey or CMYK");
+}
+
+int depthOf(const fs::path& path, VipsImage* image) {
+    const VipsBandFormat format = vips_image_get_format(image);
+    if (format == VIPS_FORMAT_UCHAR && vips_image_get_coding(image) == VIPS_CODING_NONE)
+        return 8;
+    if (format == VIPS_FORMAT_USHORT)
+        return 16;
+    refuse(path,
+           std::string("has samples of the kind \"") + vips_enum_nick(VIPS_TYPE_BAND_FORMAT, format) + "\"",
+           "convert it to 8 or 16 bits per channel");
+}
+
+void takeProfile(Photograph& photograph, VipsImage* image) {
+    const void* data = nullptr;
+    std::size_t size = 0;
+    if (vips_image_get_typeof(image, VIPS_META_ICC_NAME) == 0 ||
+        vips_image_get_blob(image, VIPS_META_ICC_NAME, &data, &size) != 0)
+        return;
+    const auto* bytes = static_cast<const std::uint8_t*>(data);
+    photograph.iccProfile.assign(bytes, bytes + size);
+}
+
+int storeRows(VipsRegion* region, VipsRect* area, void* target) {
+    auto* samples = static_cast<std::uint8_t*>(target);
+    const std::size_t row = VIPS_IMAGE_SIZEOF_LINE(region->im);
+    for (int y = area->top; y < area->top + area->height; ++y)
+        std::memcpy(samples + static_cast<std::size_t>(y) * row, VIPS_REGION_ADDR(region, 0, y), row);
+    return 0;
+}
+
+} // namespace
+
+void refuseUnread(const fs::path& path) {
+    refuse(path, "is damaged or cut short (" + takeVipsError() + ")", kCopyAgain);
+}
+
+std::string textField(VipsImage* image, const char* name) {
+    const char* text = nullptr;
+    if (vips_image_get_typeof(image, name) == 0 || vips_image_get_string(image, name, &text) != 0)
+        return {};
+    return text;
+}
+
+int numberField(VipsImage* image, const char* name) {
+    int value = 0;
+    if (vips_image_get_typeof(image, name) != 0)
+        vips_image_get_int(image, name, &value);
+    return value;
+}
+
+Photograph describeImage(const fs::path& path, VipsImage* image) {
+    Photograph photograph;
+    photograph.width = vips_image_get_width(image);
+    photograph.height = vips_image_get_height(image);
+    photograph.model = modelOf(path, image);
+    photograph.depth = depthOf(path, image);
+    checkEdges(photograph.width, photograph.height, path);
+    takeProfile(photograph, image);
+    return photograph;
+}
+
+void takeSamples(Photograph& photograph, const fs::path& path, VipsImage* image) {
+    photograph.samples.resize(VIPS_IMAGE_SIZEOF_IMAGE(image));
+    if (vips_sink_disc(image, storeRows, photograph.samples.data()) != 0)
+        refuseUnread(path);
+}
+
+} // namespace orvela

@@ -1,0 +1,25 @@
+#pragma once
+
+#include "files/FileFormat.h"
+#include "files/Vips.h"
+
+// Photographs of what libvips decodes.
+
+namespace orvela {
+
+/// Refuses a file that libvips could not read, with its message. @throws PhotographError
+[[noreturn]] void refuseUnread(const std::filesystem::path& path);
+
+/// A field of the image; empty or 0 when it is missing.
+std::string textField(VipsImage* image, const char* name);
+int numberField(VipsImage* image, const char* name);
+
+/// Size, colour model, depth and profile of the image.
+/// @param path  for messages
+/// @throws PhotographError when the filter cannot take such a picture
+Photograph describeImage(const std::filesystem::path& path, VipsImage* image);
+
+/// Decodes the samples. @throws PhotographError
+void takeSamples(Photograph& photograph, const std::filesystem::path& path, VipsImage* image);
+
+} // namespace orvela
