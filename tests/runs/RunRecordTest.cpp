@@ -29,7 +29,7 @@ std::vector<fs::path> photographs() {
     std::vector<fs::path> found;
     for (const char* folder : {ORVELA_PHOTOS, ORVELA_SAMPLES}) {
         for (const auto& entry : fs::directory_iterator(folder)) {
-            if (entry.path().extension() != ".md")
+            if (entry.is_regular_file() && entry.path().extension() != ".md")
                 found.push_back(entry.path());
         }
     }
