@@ -3,6 +3,7 @@
 #include "files/Photograph.h"
 
 #include <fcntl.h>
+#include <malloc.h>
 #include <poll.h>
 #include <pthread.h>
 #include <sys/mman.h>
@@ -24,7 +25,7 @@ namespace {
 
 constexpr int kLookAgain = 100;         // milliseconds
 constexpr std::size_t kStack = 1 << 20; // bytes
-constexpr int kMostIdle = 300; // looks without any work done: a thread waits for another that never started
+constexpr int kMostIdle = 100; // looks without any work done: a thread waits for another that never started
 
 } // namespace
 
@@ -43,15 +44,16 @@ bool* lacksMemory = nullptr; // in the child: where it tells so
     ::_exit(1);
 }
 
-// Neither messages of the libraries nor a core file, and no life of its own. Stacks of a usual size, eight
-// times what codecs are content with elsewhere, would fill a small address space, and a codec may wait for a
-// thread that could not start.
+// Neither messages of the libraries nor a core file, and no life of its own. In a small address space a codec
+// may wait for a thread that could not start: stacks of a usual size are eight times what codecs are content
+// with elsewhere, and a heap for each thread takes the room of all.
 void detach() {
     ::prctl(PR_SET_PDEATHSIG, SIGKILL);
     ::prctl(PR_SET_DUMPABLE, 0);
     const int nowhere = ::open("/dev/null", O_RDWR);
     for (const int handle : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO})
         ::dup2(nowhere, handle);
+    ::mallopt(M_ARENA_MAX, 1);
     pthread_attr_t attributes{};
     ::pthread_attr_init(&attributes);
     ::pthread_attr_setstacksize(&attributes, kStack);
