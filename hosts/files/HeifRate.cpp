@@ -52,13 +52,15 @@ int matchingQuality(double bytesPerPixel, const std::function<double(int)>& enco
     Trial high{kHighestHeifQuality + 1, 0};
     Trial best{60, 1e9};
     int quality = best.quality;
-    for (int count = 0; count < most && high.quality - low.quality > 1; ++count) {
+    for (int count = 0; count < most; ++count) {
         const Trial trial{quality, std::log(encode(quality) / bytesPerPixel)};
         if (std::abs(trial.excess) < std::abs(best.excess))
             best = trial;
         if (std::abs(trial.excess) < near)
             break;
         (trial.excess > 0 ? high : low) = trial;
+        if (high.quality - low.quality <= 1)
+            break;
         const double next =
             low.excess < 0 && high.excess > 0
                 ? low.quality - low.excess * (high.quality - low.quality) / (high.excess - low.excess)
