@@ -22,9 +22,10 @@ struct EnhanceOptions {
     TargetOptions targets;
     SettingOptions settings;
     std::optional<std::string> savePreset;
-    std::optional<std::string> log;   ///< file for the engine's log
-    std::optional<std::string> trace; ///< folder for what each step did
-    int threads = 0;                  ///< 0: one per processor
+    std::optional<std::string> log;      ///< file for the engine's log
+    std::optional<std::string> trace;    ///< folder for what each step did
+    std::optional<double> maxMegapixels; ///< of a photograph; larger ones are refused
+    int threads = 0;                     ///< 0: one per processor
     bool quiet = false;
     WriteOptions writing;
 
@@ -33,7 +34,7 @@ struct EnhanceOptions {
 };
 
 /// Enhances the photographs one after the other; a failed one does not keep the others from being done.
-/// @throws UsageError and PresetError before any work has started
+/// @throws UsageError and PresetError before any work has started, also when nothing would change
 ExitStatus enhancePhotographs(const EnhanceOptions& options, StopSignals& signals);
 
 } // namespace orvela

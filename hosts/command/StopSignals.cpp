@@ -48,7 +48,15 @@ void StopSignals::onStop(std::function<void()> stop) {
         mStop();
 }
 
+void StopSignals::beforeLeaving(std::function<void()> tidy) {
+    const std::lock_guard lock(mMutex);
+    mTidy = std::move(tidy);
+}
+
+// Called by an action, which holds the mutex.
 void StopSignals::leave() const {
+    if (mTidy)
+        mTidy();
     std::_Exit(kSignalBase + mReceived);
 }
 

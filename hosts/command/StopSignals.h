@@ -25,8 +25,11 @@ public:
     const std::atomic<bool>& stopRequested() const { return mStopRequested; }
 
     /// Ends the program at once with the status of the signal. For an action while nothing would be left
-    /// behind.
+    /// behind but what beforeLeaving() puts in order.
     [[noreturn]] void leave() const;
+
+    /// What leave() calls first, on the signal thread; null for nothing.
+    void beforeLeaving(std::function<void()> tidy);
 
 private:
     friend class StopAction;
@@ -42,6 +45,7 @@ private:
     std::atomic<bool> mEnding = false;
     std::mutex mMutex;
     std::function<void()> mStop;
+    std::function<void()> mTidy;
     std::thread mThread;
 };
 

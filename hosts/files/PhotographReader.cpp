@@ -5,70 +5,19 @@
 #include "files/JpegReader.h"
 #include "files/PsdFile.h"
 #include "files/Refusal.h"
+#include "files/SourceFile.h"
 #include "files/Vips.h"
 #include "metadata/MetadataReader.h"
 
-#include <fcntl.h>
-#include <sys/stat.h>
-#include <unistd.h>
-
 #include <algorithm>
-#include <cerrno>
 #include <cstring>
-#include <system_error>
+#include <limits>
 
 namespace orvela {
 
 namespace {
 
 namespace fs = std::filesystem;
-
-/// A file opened for reading, closed at the end.
-class OpenFile {
-public:
-    explicit OpenFile(const fs::path& path)
-        : mHandle(::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK)) {
-        if (mHandle >= 0)
-            return;
-        if (errno == ENOENT || errno == ENOTDIR)
-            refuse(path, "there is no such file", "check the name");
-        if (errno == EACCES || errno == EPERM)
-            refuse(path, "no permission to read it", "ask its owner for read access");
-        refuse(path, std::string("cannot be opened (") + std::strerror(errno) + ")", "check the file system");
-    }
-    ~OpenFile() { ::close(mHandle); }
-    OpenFile(const OpenFile&) = delete;
-    OpenFile& operator=(const OpenFile&) = delete;
-
-    int handle() const { return mHandle; }
-
-private:
-    int mHandle;
-};
-
-Bytes readFile(const fs::path& path) {
-    const OpenFile file(path);
-    struct stat status {};
-    ::fstat(file.handle(), &status);
-    if (S_ISDIR(status.st_mode))
-        refuse(path, "is a folder", "name the photographs in it");
-    if (!S_ISREG(status.st_mode))
-        refuse(path, "is not a regular file", "save the photograph to a file first");
-    if (status.st_size == 0)
-        refuse(path, "the file is empty", kCopyAgain);
-    Bytes bytes(static_cast<std::size_t>(status.st_size));
-    for (std::size_t at = 0; at < bytes.size();) {
-        const ssize_t got = ::read(file.handle(), bytes.data() + at, bytes.size() - at);
-        if (got < 0 && errno == EINTR)
-            continue;
-        if (got < 0)
-            refuse(path, std::string("cannot be read (") + std::strerror(errno) + ")", "check the disk");
-        if (got == 0)
-            refuse(path, "the file became shorter while it was read", "try again when it is complete");
-        at += static_cast<std::size_t>(got);
-    }
-    return bytes;
-}
 
 VipsImage* load(const Bytes& file, FileFormat format) {
     void* data = const_cast<std::uint8_t*>(file.data());
@@ -102,7 +51,7 @@ VipsHandle open(const fs::path& path, const Bytes& file, FileFormat format) {
         refuse(path, "the file is cut short", kCopyAgain);
     VipsHandle image(load(file, format));
     if (!image)
-        refuse(path, "is damaged or cut short (" + takeVipsError() + ")", kCopyAgain);
+        refuseUnread(path, takeVipsError());
     return image;
 }
 
@@ -187,10 +136,17 @@ int storeRows(VipsRegion* region, VipsRect* area, void* target) {
 void takeSamples(Photograph& photograph, const fs::path& path, VipsImage* image) {
     photograph.samples.resize(VIPS_IMAGE_SIZEOF_IMAGE(image));
     if (vips_sink_disc(image, storeRows, photograph.samples.data()) != 0)
-        refuse(path, "is damaged or cut short (" + takeVipsError() + ")", kCopyAgain);
+        refuseUnread(path, takeVipsError());
 }
 
-Photograph decode(const Bytes& file, FileFormat format, const fs::path& path) {
+double mostPixelsPerByte(const Bytes& file, FileFormat format) {
+    // Deflate makes at most 1032 bytes of one; the 25th byte tells the bits of a sample.
+    if (format == FileFormat::Png && file.size() > 24 && file[24] > 0)
+        return 1032.0 * 8 / file[24];
+    return std::numeric_limits<double>::infinity();
+}
+
+Photograph decode(const Bytes& file, FileFormat format, const fs::path& path, const ReadLimits& limits) {
     const VipsHandle image = open(path, file, format);
     Photograph photograph;
     photograph.source = path;
@@ -198,7 +154,11 @@ Photograph decode(const Bytes& file, FileFormat format, const fs::path& path) {
     photograph.height = vips_image_get_height(image.get());
     photograph.model = modelOf(path, image.get());
     photograph.depth = depthOf(path, image.get());
-    checkEdges(photograph.width, photograph.height, path);
+    const auto sampleBytes =
+        static_cast<std::uint64_t>(samplesPerPixel(photograph.model) * photograph.depth / 8);
+    checkPicture(
+        {photograph.width, photograph.height, sampleBytes, file.size(), mostPixelsPerByte(file, format)},
+        path, limits);
     photograph.encoding = encodingOf(file, format);
     photograph.pages = std::max(1, numberField(image.get(), VIPS_META_N_PAGES));
     takeProfile(photograph, image.get());
@@ -206,28 +166,30 @@ Photograph decode(const Bytes& file, FileFormat format, const fs::path& path) {
     return photograph;
 }
 
-Photograph read(const Bytes& file, FileFormat format, const fs::path& path) {
+Photograph read(const Bytes& file, FileFormat format, const fs::path& path, const ReadLimits& limits) {
     switch (format) {
     case FileFormat::Jpeg:
-        return readJpeg(file, path);
+        return readJpeg(file, path, limits);
     case FileFormat::Heif:
-        return readHeif(file, path);
+        return readHeif(file, path, limits);
     case FileFormat::Psd:
-        return readPsd(file, path);
+        return readPsd(file, path, limits);
     default:
-        return decode(file, format, path);
+        return decode(file, format, path, limits);
     }
 }
 
 } // namespace
 
-Photograph readPhotograph(const fs::path& path) {
-    const Bytes file = readFile(path);
+Photograph readPhotograph(const fs::path& path, const ReadLimits& limits) {
+    const Bytes file = readWholeFile(path, UINTMAX_MAX, limits.mappedBytes);
+    if (file.empty())
+        refuse(path, "the file is empty", kCopyAgain);
     const std::optional<FileFormat> format = formatOfContent(file);
     if (!format)
         refuse(path, "is not a picture of a known kind",
                "JPEG, PNG, TIFF, WebP, PSD and HEIF files can be read");
-    Photograph photograph = read(file, *format, path);
+    Photograph photograph = read(file, *format, path, limits);
     photograph.metadata = std::make_shared<const Metadata>(readMetadata(file, *format));
     takeResolution(photograph);
     return photograph;

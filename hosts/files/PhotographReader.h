@@ -1,5 +1,6 @@
 #pragma once
 
+#include "files/DeclaredPicture.h"
 #include "files/Photograph.h"
 
 namespace orvela {
@@ -10,8 +11,8 @@ namespace orvela {
 /// turns them upright. Of a file with several pages or frames the first is read; of a PSD the merged picture.
 /// @throws PhotographError when the file is missing, a folder, empty, cut short, unreadable, no picture, or a
 ///         picture that the filter cannot take: over 32767 pixels wide or high, more than four channels,
-///         floating point samples, Lab and other colour models
-/// @throws std::bad_alloc when the memory does not suffice
-Photograph readPhotograph(const std::filesystem::path& path);
+///         floating point samples, Lab and other colour models, more pixels than the limit
+/// @throws MemoryError, std::bad_alloc when the memory does not suffice
+Photograph readPhotograph(const std::filesystem::path& path, const ReadLimits& limits = {});
 
 } // namespace orvela

@@ -13,17 +13,24 @@ namespace {
 namespace fs = std::filesystem;
 
 FileFormat targetFormat(const Photograph& photograph, const fs::path& target) {
+    const FileFormat format = writtenFormat(target);
+    const std::string obstacle = formatObstacle(format, photograph);
+    if (!obstacle.empty())
+        throw PhotographError(target.string() + ": " + obstacle);
+    return format;
+}
+
+} // namespace
+
+FileFormat writtenFormat(const fs::path& target) {
     const std::optional<FileFormat> format = formatOfExtension(target);
     if (!format)
         throw PhotographError(target.string() + ": the extension \"" + target.extension().string() +
                               "\" names no known format; use .jpg, .png, .tif, .webp or .heic");
-    const std::string obstacle = formatObstacle(*format, photograph);
-    if (!obstacle.empty())
-        throw PhotographError(target.string() + ": " + obstacle);
+    if (*format == FileFormat::Psd)
+        throw PhotographError(target.string() + ": " + formatObstacle(*format, {}));
     return *format;
 }
-
-} // namespace
 
 void checkTarget(const Photograph& photograph, const fs::path& target, const WriteOptions& options) {
     targetFormat(photograph, target);
@@ -46,10 +53,13 @@ std::vector<std::string> writePhotograph(const Photograph& photograph, const fs:
     metadata.lost.insert(metadata.lost.begin(), lost.begin(), lost.end());
     Bytes encoded = encodePhotograph(written, format, target, options, metadata.metadata);
     embedMetadata(metadata, encoded);
-    TargetFile file(target);
+    std::vector<std::string> notes = metadataNotes(metadata, photograph.source.string());
+    TargetFile file(target, photograph.source);
     file.write(encoded, options.stop);
+    if (options.keepTime && !file.takeTimes(photograph.source))
+        notes.push_back(target.string() + ": the time stamps of the photograph could not be kept");
     file.commit(options.overwrite);
-    return metadataNotes(metadata, photograph.source.string());
+    return notes;
 }
 
 } // namespace orvela
