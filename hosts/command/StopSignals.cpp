@@ -48,9 +48,18 @@ void StopSignals::onStop(std::function<void()> stop) {
         mStop();
 }
 
+void StopSignals::beforeLeaving(std::function<void()> tidy) {
+    const std::lock_guard lock(mMutex);
+    mTidy = std::move(tidy);
+}
+
+// Called by an action, which holds the mutex.
 void StopSignals::leave() const {
-    if (!mStay)
-        std::_Exit(kSignalBase + mReceived);
+    if (mStay)
+        return;
+    if (mTidy)
+        mTidy();
+    std::_Exit(kSignalBase + mReceived);
 }
 
 void StopSignals::wait() {

@@ -27,6 +27,9 @@ public:
     /// Ends the program at once with the status of the signal, unless it has to stay.
     void leave() const;
 
+    /// What leave() calls first, on the signal thread; null for nothing.
+    void beforeLeaving(std::function<void()> tidy);
+
     /// Whether leaving at once would leave something behind; then the work ends in good order.
     void stay(bool needed) { mStay = needed; }
 
@@ -45,6 +48,7 @@ private:
     std::atomic<bool> mStay = false;
     std::mutex mMutex;
     std::function<void()> mStop;
+    std::function<void()> mTidy;
     std::thread mThread;
 };
 

@@ -174,13 +174,4 @@ void ChildProcess::reportEnd() {
     throw ChildFailure(mOutcome->failure.data());
 }
 
-bool isBeyondMemory(std::uint64_t bytes) {
-    void* there =
-        ::mmap(nullptr, bytes, PROT_READ | PROT_WRITE, MAP_PRIVATE | MAP_ANONYMOUS | MAP_NORESERVE, -1, 0);
-    if (there == MAP_FAILED)
-        return true;
-    ::munmap(there, bytes);
-    return false;
-}
-
 } // namespace orvela

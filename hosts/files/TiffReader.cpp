@@ -43,11 +43,11 @@ int qualityOf(const TiffFile& tiff, const TiffPage& page, int index) {
 }
 
 // Size and profile, as the directory tells them.
-Photograph describePage(const TiffPage& page, const fs::path& name) {
+Photograph describePage(const TiffPage& page, const fs::path& name, const ReadLimits& limits) {
     Photograph photograph;
     const auto width = static_cast<std::int64_t>(page.number(TIFFTAG_IMAGEWIDTH, 0));
     const auto height = static_cast<std::int64_t>(page.number(TIFFTAG_IMAGELENGTH, 0));
-    checkEdges(width, height, name);
+    checkPicture({width, height}, name, limits);
     photograph.width = static_cast<int>(width);
     photograph.height = static_cast<int>(height);
     if (const TiffField* profile = page.find(TIFFTAG_ICCPROFILE))
@@ -55,28 +55,31 @@ Photograph describePage(const TiffPage& page, const fs::path& name) {
     return photograph;
 }
 
-Photograph decodeYcbcr(const TiffFile& tiff, const TiffPage& page, int index) {
-    Photograph photograph = describePage(page, tiff.pageName(index));
+Photograph decodeYcbcr(const TiffFile& tiff, const TiffPage& page, int index, const ReadLimits& limits) {
+    Photograph photograph = describePage(page, tiff.pageName(index), limits);
     photograph.samples = tiff.readRgb(index);
     photograph.notes.emplace_back("its YCbCr samples were converted to RGB");
     return photograph;
 }
 
-Photograph decodeMask(const TiffFile& tiff, TiffPage& page, int index) {
-    Photograph photograph = describePage(page, tiff.pageName(index));
+Photograph decodeMask(const TiffFile& tiff, TiffPage& page, int index, const ReadLimits& limits) {
+    Photograph photograph = describePage(page, tiff.pageName(index), limits);
     photograph.copied = true;
     photograph.model = ColorModel::Grey;
     page.blocks = tiff.readBlocks(page, index);
     return photograph;
 }
 
-Photograph decodeWithVips(const SourceFile& file, const TiffPage& page, const fs::path& name, int index) {
+Photograph decodeWithVips(const SourceFile& file, const TiffPage& page, const fs::path& name, int index,
+                          const ReadLimits& limits) {
     startVips();
     vips_error_clear();
     const VipsHandle image = loadPage(file, index);
     if (!image)
-        refuseUnread(name);
+        refuseUnread(name, takeVipsError());
     Photograph photograph = describeImage(name, image.get());
+    // The file is in view, not in memory, and stays so.
+    checkPicture({photograph.width, photograph.height, sampleBytes(photograph)}, name, limits);
     takeSamples(photograph, name, image.get());
     if (page.number(TIFFTAG_PHOTOMETRIC, PHOTOMETRIC_MINISBLACK) == PHOTOMETRIC_PALETTE)
         photograph.notes.emplace_back("its palette was resolved");
@@ -87,11 +90,12 @@ Photograph decodeWithVips(const SourceFile& file, const TiffPage& page, const fs
 
 } // namespace
 
-Photograph readTiffPage(SourceFile& file, const TiffFile& tiff, int index) {
+Photograph readTiffPage(SourceFile& file, const TiffFile& tiff, int index, const ReadLimits& limits) {
     const auto page = std::make_shared<TiffPage>(tiff.page(index));
-    Photograph photograph = TiffFile::isMask(*page) ? decodeMask(tiff, *page, index)
-                            : isPlainYcbcr(*page)   ? decodeYcbcr(tiff, *page, index)
-                                                  : decodeWithVips(file, *page, tiff.pageName(index), index);
+    Photograph photograph = TiffFile::isMask(*page) ? decodeMask(tiff, *page, index, limits)
+                            : isPlainYcbcr(*page)
+                                ? decodeYcbcr(tiff, *page, index, limits)
+                                : decodeWithVips(file, *page, tiff.pageName(index), index, limits);
     const std::uint64_t compression = page->number(TIFFTAG_COMPRESSION, COMPRESSION_NONE);
     photograph.encoding.compression = tiffCompressionName(compression);
     if (compression == COMPRESSION_JPEG)
