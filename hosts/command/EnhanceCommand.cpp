@@ -255,6 +255,12 @@ ExitStatus finish(std::optional<LogFile>& log) {
     }
 }
 
+ExitStatus enhanceAll(const EnhanceOptions& options, const RunSettings& settings, const std::vector<Job>& jobs,
+                      StopSignals& signals, std::optional<LogFile>& log) {
+    const LeaveAction finishLog(signals, [&log] { finish(log); });
+    return Batch(options, settings, jobs, signals).run();
+}
+
 } // namespace
 
 ExitStatus enhancePhotographs(const EnhanceOptions& options, StopSignals& signals) {
@@ -268,6 +274,8 @@ ExitStatus enhancePhotographs(const EnhanceOptions& options, StopSignals& signal
     refuseOverlap(options, jobs);
     for (const std::string& note : settings.notes)
         Messages::tell(note);
+    if (!jobs.empty() && !hasRoomToBegin(options))
+        return ExitStatus::OutOfMemory;
     std::signal(SIGPIPE, SIG_IGN); // nobody reads the log any more: no reason to leave the photographs
     std::optional<LogFile> log;
     try {
@@ -276,12 +284,8 @@ ExitStatus enhancePhotographs(const EnhanceOptions& options, StopSignals& signal
     } catch (const std::runtime_error& error) { // of a preset or of a target
         return targetTrouble(error.what());
     }
-    signals.beforeLeaving([&log] { finish(log); });
     const ExitStatus found = report(sources);
-    if (!jobs.empty() && !hasRoomToBegin(options))
-        return ExitStatus::OutOfMemory;
-    const ExitStatus done = Batch(options, settings, jobs, signals).run();
-    signals.beforeLeaving(nullptr);
+    const ExitStatus done = enhanceAll(options, settings, jobs, signals, log);
     const ExitStatus worst = std::max(done, finish(log));
     // A photograph that failed says more than an argument that matched nothing.
     return worst == ExitStatus::Done ? found : worst;

@@ -48,7 +48,7 @@ void StopSignals::onStop(std::function<void()> stop) {
         mStop();
 }
 
-void StopSignals::beforeLeaving(std::function<void()> tidy) {
+void StopSignals::onLeave(std::function<void()> tidy) {
     const std::lock_guard lock(mMutex);
     mTidy = std::move(tidy);
 }

@@ -27,16 +27,15 @@ public:
     /// Ends the program at once with the status of the signal, unless it has to stay.
     void leave() const;
 
-    /// What leave() calls first, on the signal thread; null for nothing.
-    void beforeLeaving(std::function<void()> tidy);
-
     /// Whether leaving at once would leave something behind; then the work ends in good order.
     void stay(bool needed) { mStay = needed; }
 
 private:
     friend class StopAction;
+    friend class LeaveAction;
 
     void onStop(std::function<void()> stop);
+    void onLeave(std::function<void()> tidy);
 
     void wait();
     void take(int signal);
@@ -48,7 +47,7 @@ private:
     std::atomic<bool> mStay = false;
     std::mutex mMutex;
     std::function<void()> mStop;
-    std::function<void()> mTidy;
+    std::function<void()> mTidy; ///< what leave() calls first
     std::thread mThread;
 };
 
@@ -62,6 +61,20 @@ public:
     ~StopAction() { mSignals.onStop(nullptr); }
     StopAction(const StopAction&) = delete;
     StopAction& operator=(const StopAction&) = delete;
+
+private:
+    StopSignals& mSignals;
+};
+
+/// While it lives, `tidy` is called before the signals end the program at once, on the signal thread.
+class LeaveAction {
+public:
+    LeaveAction(StopSignals& signals, std::function<void()> tidy) : mSignals(signals) {
+        mSignals.onLeave(std::move(tidy));
+    }
+    ~LeaveAction() { mSignals.onLeave(nullptr); }
+    LeaveAction(const LeaveAction&) = delete;
+    LeaveAction& operator=(const LeaveAction&) = delete;
 
 private:
     StopSignals& mSignals;
