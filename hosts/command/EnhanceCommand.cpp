@@ -7,9 +7,12 @@
 #include "command/PresetTargets.h"
 #include "command/ProgressLine.h"
 #include "command/Sources.h"
+#include "files/Memory.h"
 #include "files/PhotographReader.h"
 #include "files/PhotographWriter.h"
 #include "files/TargetFile.h"
+
+#include <malloc.h>
 
 #include <algorithm>
 #include <iostream>
@@ -20,7 +23,16 @@ namespace fs = std::filesystem;
 
 namespace {
 
-constexpr char kMemoryAdvice[] = "; close other programs or use a smaller photograph";
+// What enhancing takes of memory for each pixel: the samples as they came and as they become, one channel of
+// them on its way, and planes of three colours for what goes in, what comes out, and the host's picture.
+constexpr std::uint64_t kSampleCopies = 2;
+constexpr std::uint64_t kChannelBytes = 2;
+constexpr std::uint64_t kPlanes = 3;
+constexpr std::uint64_t kPlaneBytes = 3;
+
+int threadsOf(const EnhanceOptions& options) {
+    return options.threads > 0 ? options.threads : RowScheduler::defaultThreads();
+}
 
 // The work on all photographs of one command.
 class Batch {
@@ -28,7 +40,8 @@ public:
     Batch(const EnhanceOptions& options, const RunSettings& settings, std::vector<Job> jobs,
           StopSignals& signals)
         : mOptions(options), mSettings(settings), mJobs(std::move(jobs)), mSignals(signals),
-          mScheduler(options.threads), mProgress(static_cast<int>(mJobs.size()), !options.quiet) {}
+          mScheduler(options.threads), mMapped(mappedByThreads(threadsOf(options))),
+          mProgress(static_cast<int>(mJobs.size()), !options.quiet) {}
 
     ExitStatus run() {
         ExitStatus worst = ExitStatus::Done;
@@ -41,6 +54,7 @@ private:
     ExitStatus runGuarded(const Job& job);
     void runJob(const Job& job);
     void makeFolder();
+    ReadOptions reading() const;
     bool runPage(const Job& job, PhotographReader& reader, PhotographWriter& writer);
     Photograph read(PhotographReader& reader);
     std::optional<TraceOptions> traceOf(const Job& job, const Photograph& photograph) const;
@@ -52,6 +66,7 @@ private:
     const std::vector<Job> mJobs;
     StopSignals& mSignals;
     RowScheduler mScheduler;
+    const std::uint64_t mMapped; ///< bytes, see ReadLimits
     ProgressLine mProgress;
     std::size_t mIndex = 0;
     std::string mName; ///< of the photograph, and of its page, before what is told about it
@@ -77,15 +92,17 @@ ExitStatus Batch::runGuarded(const Job& job) {
         return ExitStatus::Done;
     } catch (const TargetError& error) {
         return failed(ExitStatus::TargetTrouble, error.what());
+    } catch (const MemoryError& error) {
+        return failed(ExitStatus::OutOfMemory, error.what());
     } catch (const PhotographError& error) {
         return failed(ExitStatus::PhotographFailed, error.what());
     } catch (const EngineFailure& error) {
         return error.isOutOfMemory()
-                   ? failed(ExitStatus::OutOfMemory, mName + error.what() + kMemoryAdvice)
+                   ? failed(ExitStatus::OutOfMemory, mName + error.what() + "; " + kMemoryAdvice)
                    : failed(ExitStatus::PhotographFailed, mName + error.what() + "; nothing was written");
     } catch (const std::exception& error) {
         if (isOutOfMemory(error))
-            return failed(ExitStatus::OutOfMemory, mName + "not enough memory" + kMemoryAdvice);
+            return failed(ExitStatus::OutOfMemory, mName + "not enough memory; " + kMemoryAdvice);
         return failed(ExitStatus::PhotographFailed, mName + innermostMessage(error).toStdString());
     } catch (...) {
         return failed(ExitStatus::PhotographFailed, mName + "failed for an unknown reason; report this");
@@ -98,7 +115,7 @@ void Batch::runJob(const Job& job) {
     writing.stop = &mSignals.stopRequested();
     checkTargetPath(job.target, job.source, writing.overwrite);
     mProgress.begin(QString::fromLocal8Bit(job.source.filename().c_str()));
-    PhotographReader reader(job.source, mOptions.reading);
+    PhotographReader reader(job.source, reading());
     PhotographWriter writer(job.target, writing);
     for (int page = 0; page < reader.pages(); ++page) {
         mProgress.page(page, reader.pages());
@@ -138,6 +155,16 @@ void Batch::makeFolder() {
     std::error_code error;
     if (mOptions.targets.folder)
         fs::create_directories(*mOptions.targets.folder, error);
+}
+
+ReadOptions Batch::reading() const {
+    // The final touch keeps one more plane, the trace the last picture and the one to compare it with.
+    const std::uint64_t planes = kPlanes + (mSettings.runsFinalTouch ? 1 : 0) + (mOptions.trace ? 2 : 0);
+    ReadOptions reading = mOptions.reading;
+    reading.limits.sampleCopies = kSampleCopies;
+    reading.limits.workBytes = kChannelBytes + planes * kPlaneBytes;
+    reading.limits.mappedBytes = mMapped;
+    return reading;
 }
 
 // Reading cannot be stopped half-way, but leaves nothing behind either: a signal ends the program at once.
@@ -202,6 +229,21 @@ ExitStatus report(const Sources& sources) {
     return sources.unmatched.empty() ? ExitStatus::Done : ExitStatus::NothingMatched;
 }
 
+// A library whose threads cannot be started waits for them for ever, or ends the program.
+bool hasRoomToBegin(const EnhanceOptions& options) {
+    const std::uint64_t granted = grantedAddresses();
+    if (granted == kUnlimited)
+        return true;
+    ::mallopt(M_ARENA_MAX, 1); // each thread would reserve 64 MB for itself
+    const std::uint64_t needed = kLibraryBytes + kBesideBytes + mappedByThreads(threadsOf(options));
+    if (needed > granted)
+        std::cerr << "orvela: not enough memory: the limits of the process leave " << amountOf(granted)
+                  << ", " << amountOf(needed)
+                  << " are needed to begin; raise them (ulimit -v, ulimit -d) or use fewer --threads"
+                  << std::endl;
+    return needed <= granted;
+}
+
 ExitStatus targetTrouble(const std::string& text) {
     std::cerr << "orvela: " << text << std::endl;
     return ExitStatus::TargetTrouble;
@@ -218,6 +260,8 @@ ExitStatus enhancePhotographs(const EnhanceOptions& options, StopSignals& signal
     refuseOverlap(options, jobs);
     for (const std::string& note : settings.notes)
         std::cerr << "orvela: " << note << std::endl;
+    if (!jobs.empty() && !hasRoomToBegin(options))
+        return ExitStatus::OutOfMemory;
     try {
         savePreset(options, settings);
         openLog(options);

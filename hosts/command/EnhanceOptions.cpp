@@ -9,6 +9,15 @@ namespace {
 
 constexpr char kSettings[] = "Settings";
 
+// The library's own takes what is no number, and names the largest one there is when it refuses.
+const CLI::Validator kPositive(
+    [](const std::string& text) {
+        double number = 0;
+        const bool fits = CLI::detail::lexical_cast(text, number) && number > 0;
+        return fits ? std::string() : '"' + text + "\" is not a number above 0";
+    },
+    std::string());
+
 void declareTargets(CLI::App& app, EnhanceOptions& options) {
     app.add_option("-o,--output", options.targets.file, "file for the result of one photograph")
         ->option_text("FILE");
@@ -84,6 +93,10 @@ void EnhanceOptions::declare(CLI::App& app) {
     app.add_option("--threads", threads, "number of threads (one per processor)")
         ->option_text("N")
         ->check(CLI::Range(1, 1024));
+    app.add_option("--max-megapixels", reading.limits.megapixels,
+                   "refuse photographs with more million pixels")
+        ->option_text("N")
+        ->check(kPositive);
     app.add_flag("--quiet", quiet, "no progress and no results, only errors");
     app.add_option("--log", log, "write the engine's log to a file")->option_text("FILE");
     app.add_option("--trace", trace, "write what each step did to an empty folder: pictures and statistics")

@@ -19,7 +19,7 @@ constexpr int kProfileMarker = JPEG_APP0 + 2;
 
 class Decoder {
 public:
-    Decoder(ByteView file, const fs::path& path) : mPath(path) {
+    Decoder(ByteView file, const fs::path& path) : mFile(file), mPath(path) {
         mJpeg.err = mErrors.manager();
         attempt([&] {
             jpeg_create_decompress(&mJpeg);
@@ -32,7 +32,7 @@ public:
     Decoder(const Decoder&) = delete;
     Decoder& operator=(const Decoder&) = delete;
 
-    void readPicture(Photograph& photograph);
+    void readPicture(Photograph& photograph, const ReadLimits& limits);
     Bytes profile() const;
     Encoding encoding();
 
@@ -40,8 +40,10 @@ private:
     template <typename Work>
     void attempt(const Work& work);
     ColorModel model() const;
+    DeclaredPicture declared() const;
     JpegLayout::Color color() const;
 
+    const ByteView mFile;
     const fs::path& mPath;
     JpegErrors mErrors;
     jpeg_decompress_struct mJpeg{};
@@ -56,7 +58,7 @@ void Decoder::attempt(const Work& work) {
     mErrors.throwIfOutOfMemory();
     if (mErrors.code() == JWRN_JPEG_EOF)
         refuse(mPath, "the file is cut short", kCopyAgain);
-    refuse(mPath, "is damaged or cut short (" + mErrors.text() + ")", kCopyAgain);
+    refuseUnread(mPath, mErrors.text());
 }
 
 ColorModel Decoder::model() const {
@@ -88,11 +90,23 @@ JpegLayout::Color Decoder::color() const {
     }
 }
 
-void Decoder::readPicture(Photograph& photograph) {
+// Each block of 64 pixels takes a bit at least, unless its coding is arithmetic.
+DeclaredPicture Decoder::declared() const {
+    DeclaredPicture picture;
+    picture.width = mJpeg.image_width;
+    picture.height = mJpeg.image_height;
+    picture.sampleBytes = static_cast<std::uint64_t>(samplesPerPixel(model()));
+    picture.fileBytes = mFile.size();
+    if (mJpeg.arith_code == 0)
+        picture.mostPixelsPerByte = 64 * 8;
+    return picture;
+}
+
+void Decoder::readPicture(Photograph& photograph, const ReadLimits& limits) {
+    checkPicture(declared(), mPath, limits);
     photograph.model = model();
     photograph.width = static_cast<int>(mJpeg.image_width);
     photograph.height = static_cast<int>(mJpeg.image_height);
-    checkEdges(photograph.width, photograph.height, mPath);
     const std::size_t row = mJpeg.image_width * static_cast<std::size_t>(samplesPerPixel(photograph.model));
     photograph.samples.resize(row * mJpeg.image_height);
     attempt([&] {
@@ -149,12 +163,12 @@ Bytes Decoder::profile() const {
 
 } // namespace
 
-Photograph readJpeg(ByteView file, const fs::path& path) {
+Photograph readJpeg(ByteView file, const fs::path& path, const ReadLimits& limits) {
     Photograph photograph;
     photograph.source = path;
     Decoder decoder(file, path);
     photograph.iccProfile = decoder.profile();
-    decoder.readPicture(photograph);
+    decoder.readPicture(photograph, limits);
     return photograph;
 }
 

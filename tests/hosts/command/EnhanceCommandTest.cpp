@@ -24,13 +24,13 @@ protected:
 
 TEST_F(LimitedMemoryTest, WantOfMemoryHasItsOwnStatusAndDoesNotKeepTheOthers) {
     sample("good.png");
-    // 30000 x 30000 pixels in packed rows.
+    // 30000 x 30000 pixels in packed rows, in a file that could hold them.
     store("huge.psd", QByteArray::fromHex("38425053000100000000000000030000753000007530000800030000"
                                           "000000000000000000000001") +
-                          QByteArray(2 * 3 * 30000, '\0'));
+                          QByteArray(15'000'000, '\0'));
     const Answer answer = orvelaWithin(2'000'000'000, "enhance missing.png huge.psd good.png");
     EXPECT_EQ(answer.status, 5);
-    EXPECT_TRUE(answer.says("huge.psd: not enough memory; ")) << answer.err;
+    EXPECT_TRUE(answer.says("huge.psd: its 30000 x 30000 pixels need about ")) << answer.err;
     EXPECT_TRUE(exists("good-enhanced.png"));
 }
 
@@ -43,18 +43,18 @@ TEST_F(LimitedMemoryTest, CodecsDoNotEndTheProgram) {
         " && convert -size 4000x3000 gradient:red-blue flat.jpg && "
         "vips heifsave flat.jpg flat.heic && convert good.png -interlace JPEG claims.jpg && "
         "python3 -c \"b=bytearray(open('claims.jpg','rb').read()); f=b.find(b'\\xff\\xc2'); "
-        "b[f+5:f+9]=b'\\x2e\\xe0\\x2e\\xe0'; open('claims.jpg','wb').write(b)\"";
+        "b[f+5:f+9]=b'\\x1b\\x58\\x1b\\x58'; open('claims.jpg','wb').write(b)\"";
     ASSERT_EQ(std::system(make.c_str()), 0);
     for (const rlim_t megabytes : {230, 260, 300}) {
         const Answer answer = orvelaWithin(megabytes << 20, "enhance --force flat.heic good.png");
         EXPECT_EQ(answer.status, 5) << megabytes;
-        EXPECT_TRUE(answer.says("flat.heic: not enough memory; ")) << answer.err;
+        EXPECT_TRUE(answer.says("flat.heic: its 4000 x 3000 pixels need about 214 MB")) << answer.err;
         EXPECT_TRUE(answer.says("good.png -> good-enhanced.png")) << answer.err;
     }
     const Answer written = orvelaWithin(480U << 20, "enhance flat.jpg -o flat-new.heic");
     EXPECT_EQ(written.status, 5) << written.err;
     EXPECT_FALSE(exists("flat-new.heic"));
-    const Answer claimed = orvelaWithin(1000U << 20, "enhance claims.jpg");
+    const Answer claimed = orvelaWithin(700U << 20, "enhance claims.jpg");
     EXPECT_EQ(claimed.status, 5) << claimed.err;
 }
 #endif
