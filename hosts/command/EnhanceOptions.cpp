@@ -1,5 +1,5 @@
 #include "command/EnhanceCommand.h"
-#include "command/ModeNames.h"
+#include "command/NearestNames.h"
 
 #include <CLI/CLI.hpp>
 
@@ -26,6 +26,8 @@ void declareTargets(CLI::App& app, EnhanceOptions& options) {
         ->option_text("FOLDER");
     app.add_flag("--force", options.writing.overwrite,
                  "overwrite results, presets and logs of earlier runs (never a photograph that is read)");
+    app.add_flag("--keep-time", options.writing.keepTime,
+                 "give results the time stamps of their photographs");
 }
 
 void declareEncoding(CLI::App& app, WriteOptions& writing) {
@@ -55,7 +57,7 @@ void declareSettings(CLI::App& app, SettingOptions& settings) {
         ->group(kSettings);
     for (const std::string& label : labelsOfThreeSliders())
         app.add_option_function<std::string>(
-               "--" + ModeNames::plain(label),
+               "--" + NearestNames::plain(label),
                [&settings, label](const std::string& text) { settings.labelled[label] = text; },
                "shown number of that slider of Adjustments or Smart Levels")
             ->option_text("NUMBER")
@@ -73,8 +75,9 @@ void declareSettings(CLI::App& app, SettingOptions& settings) {
         ->option_text("NAME=NUMBER,...")
         ->group(kSettings);
     app.add_option("--preset", settings.preset,
-                   "read settings from a file; without --mode nothing else is on")
-        ->option_text("FILE")
+                   "read settings from a file, or a stored preset of the mode (Advanced); without --mode "
+                   "nothing else is on")
+        ->option_text("FILE|NAME")
         ->group(kSettings);
 }
 

@@ -1,8 +1,15 @@
+#include "command/EnhanceCommand.h"
+
 #include "ProgramRun.h"
+#include "hosts/FailingNew.h"
+#include "hosts/TestFiles.h"
 
 #include <sys/resource.h>
 
 #include <cstdlib>
+#include <iostream>
+#include <map>
+#include <sstream>
 
 using namespace orvela;
 
@@ -58,5 +65,51 @@ TEST_F(LimitedMemoryTest, CodecsDoNotEndTheProgram) {
     EXPECT_EQ(claimed.status, 5) << claimed.err;
 }
 #endif
+
+// Each larger allocation of the whole command fails once, with every kind of exception: the photograph that
+// it hits fails, with a status of its kind, and the other one is done.
+TEST(EnhanceCommand, ASurpriseAnywhereCostsOnePhotograph) {
+    const TestFolder folder;
+    folder.run("convert $S/coffee.png -resize 24x16! a.png && convert a.png b.tif");
+    EnhanceOptions options;
+    options.photographs = {(folder / "a.png").string(), (folder / "b.tif").string()};
+    options.targets.folder = folder / "out";
+    options.settings.mode = "PortraitPro";
+    options.writing.overwrite = options.quiet = true;
+    options.threads = 1;
+    sigset_t unblocked;
+    pthread_sigmask(SIG_SETMASK, nullptr, &unblocked);
+    StopSignals signals;
+    std::ostringstream said;
+    std::streambuf* const errors = std::cerr.rdbuf(said.rdbuf());
+    const std::pair<ExitStatus, std::function<void()>> kinds[] = {
+        {ExitStatus::OutOfMemory, [] { throw std::bad_alloc(); }},
+        {ExitStatus::PhotographFailed, [] { throw std::runtime_error("a surprise"); }},
+        {ExitStatus::PhotographFailed, [] { throw 42; }}};
+    for (const auto& [expected, failure] : kinds) {
+        std::map<ExitStatus, int> seen;
+        bool happened = true;
+        for (long n = 1; happened; ++n) {
+            std::filesystem::remove_all(folder / "out");
+            const FailingNew failing(1000, n, failure);
+            try {
+                const ExitStatus status = enhancePhotographs(options, signals);
+                ++seen[status];
+                EXPECT_GE(std::filesystem::exists(folder / "out/a.png") +
+                              std::filesystem::exists(folder / "out/b.tif"),
+                          status == ExitStatus::Done ? 2 : 1)
+                    << n;
+            } catch (...) { // before there was a batch
+                ++seen[ExitStatus::WrongUsage];
+            }
+            happened = FailingNew::happened();
+        }
+        EXPECT_GT(seen[expected], 50) << static_cast<int>(expected);
+    }
+    std::cerr.rdbuf(errors);
+    pthread_sigmask(SIG_SETMASK, &unblocked, nullptr);
+    EXPECT_NE(said.str().find("b.tif: a surprise\n"), std::string::npos);
+    EXPECT_NE(said.str().find("a.png: failed for an unknown reason; report this\n"), std::string::npos);
+}
 
 } // namespace
