@@ -11,6 +11,9 @@
 
 #include <QCoreApplication>
 
+#include <fcntl.h>
+#include <unistd.h>
+
 #include <CLI/CLI.hpp>
 #include <algorithm>
 #include <csignal>
@@ -76,7 +79,17 @@ ExitStatus perform(const Action& action) {
     }
 }
 
+// A file that is opened under the number of a closed output would take what the program tells.
+void occupyClosedOutputs() {
+    int handle = -1;
+    do
+        handle = ::open("/dev/null", O_RDONLY | O_CLOEXEC);
+    while (handle >= 0 && handle <= STDERR_FILENO);
+    ::close(handle);
+}
+
 int runProgram(int argc, char** argv) {
+    occupyClosedOutputs();
     StopSignals signals;
     std::signal(SIGXFSZ, SIG_IGN); // a file above the limit fails like a full disk
     QCoreApplication application(argc, argv);
