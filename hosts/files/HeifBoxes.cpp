@@ -1,5 +1,7 @@
 #include "files/HeifBoxes.h"
 
+#include <algorithm>
+#include <array>
 #include <map>
 #include <stdexcept>
 #include <string_view>
@@ -144,6 +146,14 @@ Items propertiesOf(ByteView ipma, std::uint32_t item) {
     return {};
 }
 
+std::vector<Box> chosen(const std::vector<Box>& all, const Items& numbers) {
+    std::vector<Box> boxes;
+    for (const std::uint32_t number : numbers)
+        if (number > 0 && number <= all.size())
+            boxes.push_back(all[number - 1]);
+    return boxes;
+}
+
 Chroma chromaOf(const Box& configuration) {
     Cursor cursor(configuration.content);
     if (configuration.type == "av1C") {
@@ -156,9 +166,20 @@ Chroma chromaOf(const Box& configuration) {
     return format == 3 ? Chroma::Full : format == 2 ? Chroma::HalfWidth : Chroma::Half;
 }
 
+// What tells how a picture is coded, shaped and turned, and what metadata speak of.
+bool isKnown(const Box& property) {
+    constexpr std::array<std::string_view, 12> names = {"ispe", "pixi", "hvcC", "av1C", "colr", "irot",
+                                                        "imir", "clap", "auxC", "rloc", "lsel", "a1lx"};
+    if (std::find(names.begin(), names.end(), property.type) != names.end())
+        return true;
+    Cursor cursor(property.content);
+    return property.type == "pasp" && cursor.number(4) == cursor.number(4); // pixels are square anyway
+}
+
 HeifCoding codingOf(ByteView file) {
     const ByteView meta = FullBox(boxIn(file, "meta")).content.rest();
-    Items items = {primaryItem(boxIn(meta, "pitm"))};
+    const std::uint32_t primary = primaryItem(boxIn(meta, "pitm"));
+    Items items = {primary};
     // A picture of tiles may itself be turned or framed by another item.
     for (int depth = 0; depth < 3; ++depth) {
         Items parts = partsOf(meta, items[0]);
@@ -172,15 +193,15 @@ HeifCoding codingOf(ByteView file) {
         coding.bytes += sizes[item];
     const ByteView properties = boxIn(meta, "iprp");
     const std::vector<Box> all = boxesOf(boxIn(properties, "ipco"));
-    for (const std::uint32_t number : propertiesOf(boxIn(properties, "ipma"), items[0])) {
-        if (number == 0 || number > all.size())
-            continue;
-        const Box& property = all[number - 1];
+    const ByteView ipma = boxIn(properties, "ipma");
+    for (const Box& property : chosen(all, propertiesOf(ipma, items[0])))
         if (property.type == "hvcC" || property.type == "av1C") {
             coding.isAv1 = property.type == "av1C";
             coding.chroma = chromaOf(property);
         }
-    }
+    for (const Box& property : chosen(all, propertiesOf(ipma, primary)))
+        if (!isKnown(property))
+            coding.otherProperties.emplace_back(property.type);
     return coding;
 }
 

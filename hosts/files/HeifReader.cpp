@@ -25,7 +25,6 @@ struct Head {
     std::int32_t height;
     std::int32_t bits;
     std::int32_t hasAlpha;
-    std::int32_t pictures;
     std::uint64_t profileSize;
 };
 
@@ -61,12 +60,9 @@ Bytes Decoder::profile() const {
 
 void Decoder::send(const ChildProcess::Sink& sink) const {
     const Bytes icc = profile();
-    const Head head{heif_image_handle_get_width(mHandle.get()),
-                    heif_image_handle_get_height(mHandle.get()),
+    const Head head{heif_image_handle_get_width(mHandle.get()), heif_image_handle_get_height(mHandle.get()),
                     heif_image_handle_get_luma_bits_per_pixel(mHandle.get()),
-                    heif_image_handle_has_alpha_channel(mHandle.get()),
-                    heif_context_get_number_of_top_level_images(mContext.get()),
-                    icc.size()};
+                    heif_image_handle_has_alpha_channel(mHandle.get()), icc.size()};
     sink.send(head);
     sink.send(icc.data(), icc.size());
     sendSamples(sink, head);
@@ -104,6 +100,8 @@ void takeCoding(Photograph& photograph, ByteView file) {
     photograph.encoding.chroma = coding ? coding->chroma : Chroma::Half;
     if (!coding)
         return;
+    for (const std::string& property : coding->otherProperties)
+        photograph.unheld.push_back("the HEIF property " + property);
     const double pixels = static_cast<double>(photograph.width) * photograph.height;
     photograph.encoding.heifRate = std::make_shared<const HeifRate>(
         HeifRate{heifSample(photograph), static_cast<double>(coding->bytes) / pixels});
@@ -121,7 +119,6 @@ Photograph receive(ChildProcess& child, const fs::path& path, std::uint64_t& pix
         refuse(path, "has an unknown number of bits per sample", "save it with 8, 10 or 12 bits");
     photograph.depth = head.bits > 8 ? 16 : 8;
     photograph.model = head.hasAlpha != 0 ? ColorModel::RgbAlpha : ColorModel::Rgb;
-    photograph.pages = std::max(1, head.pictures);
     photograph.encoding.format = FileFormat::Heif;
     photograph.encoding.bitDepth = head.bits;
     photograph.iccProfile.resize(head.profileSize);

@@ -33,9 +33,9 @@ FileFormat targetFormat(const Photograph& photograph, const fs::path& target) {
 }
 
 PreparedMetadata metadataFor(const Photograph& photograph, FileFormat target) {
-    PreparedMetadata metadata =
-        prepareMetadata(photograph.metadata ? *photograph.metadata : Metadata(), target,
-                        {photograph.width, photograph.height, thumbnailsOf(photograph)});
+    PreparedMetadata metadata = prepareMetadata(
+        photograph.metadata ? *photograph.metadata : Metadata(), target,
+        {photograph.width, photograph.height, thumbnailsOf(photograph), !photograph.iccProfile.empty()});
     metadata.lost.insert(metadata.lost.end(), photograph.unheld.begin(), photograph.unheld.end());
     return metadata;
 }

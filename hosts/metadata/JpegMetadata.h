@@ -15,8 +15,8 @@ inline constexpr char kExtendedXmp[] = "extended XMP";
 Metadata readJpegMetadata(ByteView file);
 
 /// Puts the metadata into an encoded JPEG, in place of what the encoder wrote, whose colour profile and Adobe
-/// marker stay. A block over the limits above must have been made to fit; a longer XMP packet goes into
-/// extension segments.
+/// marker stay. A longer Exif block goes on in further segments. A longer XMP packet must have been made to
+/// fit.
 void embedIntoJpeg(const Metadata& metadata, Bytes& encoded);
 
 } // namespace orvela

@@ -66,6 +66,7 @@ public:
         }
         moveResources();
         moveDensity();
+        moveColors();
         if (mResult.target == FileFormat::Jpeg)
             fitJpeg();
         fitTiff();
@@ -81,6 +82,7 @@ private:
     bool moveText(const Text& text);
     void moveResources();
     void moveDensity();
+    void moveColors();
     void fitJpeg();
     void fitTiff();
     void splitXmp();
@@ -96,16 +98,20 @@ private:
 
 void Preparation::adaptToPicture() {
     mExif.setDimensions(mPicture.width, mPicture.height);
-    bool turned = false;
+    const bool turned = mSource.format == FileFormat::Heif && mExif.orientation() >= 5;
     if (mSource.format == FileFormat::Heif) {
-        turned = mExif.makeUpright();
+        mExif.makeUpright();
         static const std::regex property("(tiff:Orientation(?:=[\"']|>))[2-8]");
         const std::string upright = std::regex_replace(std::string(asText(mSource.xmp)), property, "$011");
         metadata().xmp = copyOf(asBytes(upright));
     }
-    const bool inExif = mExif.renewThumbnails(mPicture.makeThumbnail, turned);
+    // A second directory of a TIFF would be a second page.
+    const bool inExif = mResult.target == FileFormat::Tiff
+                            ? !mExif.dropThumbnails()
+                            : mExif.renewThumbnails(mPicture.makeThumbnail, turned);
     const bool inResources = renewResourceThumbnail(metadata().resources, mPicture.makeThumbnail);
-    if (!inExif || !inResources)
+    const bool inHeif = mSource.heifThumbnail == 0 || mResult.target == FileFormat::Heif;
+    if (!inExif || !inResources || !inHeif)
         lose("the thumbnail");
 }
 
@@ -118,12 +124,12 @@ void Preparation::dropSegments() {
     metadata().segments.clear();
 }
 
-// Of texts and colours others tell; a background is of no use where nothing is transparent.
+// Of texts and colours others tell.
 void Preparation::dropChunks() {
     Names names;
     for (const Chunk& chunk : mSource.chunks) {
         const bool text = chunk.name == "tEXt" || chunk.name == "zTXt" || chunk.name == "iTXt";
-        if (!text && chunk.name != "bKGD" && !isPlainColour(chunk))
+        if (!text && !isPlainColour(chunk))
             names.push_back(chunk.name);
     }
     if (!names.empty())
@@ -187,6 +193,21 @@ void Preparation::moveDensity() {
     metadata().density.reset();
 }
 
+// RGB samples have no matrix, and an ICC profile says more than codes.
+void Preparation::moveColors() {
+    if (!mSource.colors || mSource.format == mResult.target)
+        return;
+    const ColorCodes& codes = *mSource.colors;
+    metadata().colors.reset();
+    if (codes.isPlain() || mPicture.hasProfile)
+        return;
+    if (mResult.target == FileFormat::Png || mResult.target == FileFormat::Heif)
+        metadata().colors = ColorCodes{codes.primaries, codes.transfer};
+    else
+        lose("the code of its colours (primaries " + std::to_string(codes.primaries) + ", transfer " +
+             std::to_string(codes.transfer) + ")");
+}
+
 // The packet goes into extension segments whole; the main one only refers to them.
 void Preparation::splitXmp() {
     const std::string_view packet = asText(mSource.xmp);
@@ -222,10 +243,14 @@ void Preparation::splitXmp() {
     }
 }
 
+// Some cameras let a long block go on in further segments; few programs know of that.
 void Preparation::fitJpeg() {
-    if (mExif.bytes().size() > kJpegExifLimit && mExif.dropThumbnails())
+    const auto isLong = [this] {
+        return mExif.bytes().size() > kJpegExifLimit && mSource.format != FileFormat::Jpeg;
+    };
+    if (isLong() && mExif.dropThumbnails())
         lose("the thumbnail");
-    if (mExif.bytes().size() > kJpegExifLimit) {
+    if (isLong()) {
         lose("the Exif data, of over 64 KiB");
         mExif = ExifBlock({});
     }
@@ -233,13 +258,8 @@ void Preparation::fitJpeg() {
         splitXmp();
 }
 
-// A second directory of a TIFF would be a second page.
 void Preparation::fitTiff() {
-    if (mResult.target != FileFormat::Tiff)
-        return;
-    if (mExif.dropThumbnails())
-        lose("the thumbnail");
-    if (mExif.isDamaged()) {
+    if (mResult.target == FileFormat::Tiff && mExif.isDamaged()) {
         lose("the Exif data, which are damaged");
         mExif = ExifBlock({});
     }
@@ -258,6 +278,8 @@ Names differences(const Metadata& wanted, const Metadata& found) {
     check(wanted.segments == found.segments, "APPn segments");
     check(wanted.chunks.size() <= found.chunks.size(), "PNG chunks");
     check(!wanted.density || found.density, "the density");
+    check(!wanted.colors || (found.colors && wanted.colors->looksLike(*found.colors)),
+          "the code of its colours");
     return names;
 }
 

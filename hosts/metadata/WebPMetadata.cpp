@@ -47,6 +47,9 @@ Metadata readWebPMetadata(ByteView file) {
     if (startsWith(metadata.exif, "Exif\0\0"sv))
         metadata.exif.erase(metadata.exif.begin(), metadata.exif.begin() + 6);
     metadata.xmp = chunkOf(mux, "XMP ");
+    int unknown = 0;
+    if (mux && WebPMuxNumChunks(mux.get(), WEBP_CHUNK_UNKNOWN, &unknown) == WEBP_MUX_OK && unknown > 0)
+        metadata.unheld.emplace_back("chunks of an unknown kind");
     return metadata;
 }
 

@@ -20,6 +20,7 @@ using namespace orvela;
 
 namespace {
 
+using testing::Contains;
 using testing::ElementsAre;
 using testing::EndsWith;
 using testing::HasSubstr;
@@ -97,9 +98,9 @@ TEST(Containers, CarryTextsAndColoursOfPng) {
     const std::string list = "exiftool -a -s -PNG:all -x Interlace ";
     EXPECT_EQ(folder.output(list + "t.png"), folder.output(list + "s.png"));
     EXPECT_THAT(folder.output(list + "t.png"), HasSubstr("A title"));
-    EXPECT_THAT(
-        convert(folder, "s.png", "t.jpg"),
-        ElementsAre(EndsWith("the JPEG file cannot hold: PNG texts Title; PNG chunks gAMA, cHRM, tIME")));
+    EXPECT_THAT(convert(folder, "s.png", "t.jpg"),
+                ElementsAre(EndsWith(
+                    "the JPEG file cannot hold: PNG texts Title; PNG chunks gAMA, cHRM, tIME, bKGD")));
     EXPECT_EQ(folder.output("exiftool -s3 -Artist -Copyright -Comment t.jpg"), "A. Writer\ngrün\ncafé\n");
     EXPECT_THAT(convert(folder, "t.jpg", "u.png"), IsEmpty());
     EXPECT_EQ(folder.output("exiftool -s3 -PNG:Comment -EXIF:Artist u.png"), "café\nA. Writer\n");
@@ -110,6 +111,27 @@ TEST(Containers, CarryTextsAndColoursOfPng) {
                       "+ chunk(b'tEXt', b'Author\\0A') ") +
                " && exiftool -q -overwrite_original -EXIF:Artist=A p.png");
     EXPECT_THAT(convert(folder, "p.png", "p.jpg"), IsEmpty());
+}
+
+// What tells of old samples, of a palette or of nothing known does not go.
+TEST(Containers, NameSmallChunksThatDoNotTravel) {
+    const TestFolder folder;
+    folder.run(
+        "convert $S/coffee.png -resize 64x48! -strip -define png:exclude-chunks=all s.png && "
+        "cp s.png d.png && convert s.png -colors 8 -define png:exclude-chunks=all png8:p.png && "
+        "convert s.png w.webp && " +
+        insert("s.png", kBehindPngHeader, "chunk(b'sBIT', bytes([8, 8, 8]))") + " && " +
+        insert("d.png", kBehindPngHeader, "chunk(b'sBIT', bytes([5, 6, 5]))") + " && " +
+        insert("p.png", kBehindPngHeader, "chunk(b'bKGD', bytes(1))") +
+        " && python3 -c \"import struct; b = open('w.webp', 'rb').read(); c = b'ABCD' + struct.pack('<I', "
+        "4) + bytes(4); h = bytes([0] * 4) + struct.pack('<I', 63)[:3] + struct.pack('<I', 47)[:3]; "
+        "b = b'WEBPVP8X' + struct.pack('<I', 10) + h + b[12:] + c; "
+        "open('w.webp', 'wb').write(b'RIFF' + struct.pack('<I', len(b)) + b)\"");
+    EXPECT_THAT(convert(folder, "s.png", "s.jpg"), IsEmpty());
+    EXPECT_THAT(convert(folder, "d.png", "e.png"), ElementsAre(EndsWith("hold: the PNG chunk sBIT")));
+    EXPECT_THAT(convert(folder, "p.png", "q.png"), Contains(EndsWith("hold: the PNG chunk bKGD")));
+    EXPECT_THAT(convert(folder, "w.webp", "x.webp"),
+                ElementsAre(EndsWith("hold: chunks of an unknown kind")));
 }
 
 TEST(Containers, CarryPhotoshopsResources) {
@@ -225,6 +247,13 @@ TEST(Containers, SplitLongXmpAndShortenLongExif) {
     metadata.exif = block.bytes();
     const PreparedMetadata tooLong = prepareMetadata(metadata, FileFormat::Jpeg, {1, 1, none});
     EXPECT_TRUE(tooLong.metadata.exif.empty());
+    // From a JPEG that holds it in several segments it goes into one that does.
+    folder.run("mkdir more");
+    metadata.format = FileFormat::Jpeg;
+    Photograph photograph = readPhotograph(folder / "t.jpg");
+    photograph.metadata = std::make_shared<const Metadata>(metadata);
+    EXPECT_THAT(writePhotograph(photograph, folder / "more/t.jpg"), IsEmpty());
+    EXPECT_EQ(readPhotograph(folder / "more/t.jpg").metadata->exif, metadata.exif);
     EXPECT_THAT(tooLong.lost, ElementsAre(HasSubstr("64 KiB")));
 }
 
