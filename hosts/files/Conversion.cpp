@@ -14,6 +14,11 @@ bool isGrey(ColorModel model) {
     return model == ColorModel::Grey || model == ColorModel::GreyAlpha;
 }
 
+bool isForGrey(const Bytes& profile) {
+    constexpr std::size_t colorSpace = 16;
+    return profile.size() > colorSpace && startsWith(ByteView(profile).subspan(colorSpace), "GRAY");
+}
+
 ColorModel modelAfter(ColorModel model, const Conversion& conversion) {
     if (model == ColorModel::Cmyk)
         return model;
@@ -71,7 +76,7 @@ Conversion conversionFor(FileFormat format, const Photograph& photograph) {
     default: // hold what the program reads, or are refused
         break;
     }
-    conversion.dropsProfile = conversion.colours && !photograph.iccProfile.empty();
+    conversion.dropsProfile = conversion.colours && isForGrey(photograph.iccProfile);
     return conversion;
 }
 

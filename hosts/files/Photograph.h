@@ -63,6 +63,7 @@ struct JpegLayout {
     Color color = Color::YCbCr;
     bool adobeMarker = false; ///< CMYK and YCCK: whether it is marked as such
     std::vector<Component> components;
+    bool arithmetic = false; ///< coded arithmetically instead of by Huffman's tables
 
     bool operator==(const JpegLayout&) const = default;
 };

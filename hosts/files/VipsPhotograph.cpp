@@ -66,20 +66,6 @@ void refuseUnread(const fs::path& path) {
     refuse(path, "is damaged or cut short (" + takeVipsError() + ")", kCopyAgain);
 }
 
-std::string textField(VipsImage* image, const char* name) {
-    const char* text = nullptr;
-    if (vips_image_get_typeof(image, name) == 0 || vips_image_get_string(image, name, &text) != 0)
-        return {};
-    return text;
-}
-
-int numberField(VipsImage* image, const char* name) {
-    int value = 0;
-    if (vips_image_get_typeof(image, name) != 0)
-        vips_image_get_int(image, name, &value);
-    return value;
-}
-
 Photograph describeImage(const fs::path& path, VipsImage* image) {
     Photograph photograph;
     photograph.width = vips_image_get_width(image);

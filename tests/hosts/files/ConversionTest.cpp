@@ -57,6 +57,13 @@ TEST(Conversion, IsToldInOneLine) {
                 ElementsAre((folder / "g.png").string() +
                             ": the HEIF file cannot hold: the ICC profile, which is one for grey"));
     EXPECT_EQ(readPhotograph(folder / "g.heic").model, ColorModel::Rgb);
+    // A profile for RGB, which some programs give to grey pictures, stays.
+    Photograph odd = grey;
+    folder.run("cp /usr/share/color/icc/sRGB.icc p.icc");
+    const std::string profile = folder.text("p.icc");
+    odd.iccProfile.assign(profile.begin(), profile.end());
+    EXPECT_THAT(writePhotograph(odd, folder / "o.webp"), testing::IsEmpty());
+    EXPECT_EQ(readPhotograph(folder / "o.webp").iccProfile, odd.iccProfile);
 }
 
 } // namespace
