@@ -1,6 +1,7 @@
 #include "files/PhotographReader.h"
 
 #include "files/Animation.h"
+#include "files/CameraRaw.h"
 #include "files/EncodingProbe.h"
 #include "files/HeifReader.h"
 #include "files/JpegReader.h"
@@ -76,6 +77,10 @@ void refuseAnimation(const fs::path& path, const char* kind, int frames) {
            "--first-frame enhances the first");
 }
 
+void refuseCameraRaw(const fs::path& path) {
+    refuse(path, "is a camera's raw file", "develop it first, and enhance the TIFF or JPEG that you get");
+}
+
 // How many pictures the file shows one after the other.
 int framesOf(const fs::path& path, const Bytes& file, FileFormat format, bool firstOnly) {
     int frames = 1;
@@ -121,8 +126,10 @@ Photograph read(const Bytes& file, FileFormat format, const fs::path& path) {
 
 PhotographReader::PhotographReader(const fs::path& path, const ReadOptions& options)
     : mOptions(options), mFile(std::make_unique<SourceFile>(path)) {
-    const std::optional<FileFormat> format =
-        formatOfContent(mFile->read(0, std::min<std::uint64_t>(mFile->size(), 16)));
+    const Bytes head = mFile->read(0, std::min<std::uint64_t>(mFile->size(), 16));
+    if (isCameraRaw(head))
+        refuseCameraRaw(path);
+    const std::optional<FileFormat> format = formatOfContent(head);
     if (!format)
         refuse(path, "is not a picture of a known kind",
                "JPEG, PNG, TIFF, WebP, PSD and HEIF files can be read");
@@ -130,6 +137,8 @@ PhotographReader::PhotographReader(const fs::path& path, const ReadOptions& opti
     if (mFormat != FileFormat::Tiff)
         return;
     mTiff = std::make_unique<TiffFile>(*mFile, options.firstOnly ? 1 : TiffFile::kAll);
+    if (mTiff->isCameraRaw())
+        refuseCameraRaw(path);
     mPages = mTiff->pages();
 }
 

@@ -20,9 +20,8 @@ struct ReadOptions {
 /// page; of a PSD the merged picture is read, of a HEIF the primary one.
 class PhotographReader {
 public:
-    /// @throws PhotographError when the file is missing, a folder, empty, unreadable, no picture, an
-    /// animation
-    ///         (unless asked for its first picture), or a TIFF with a damaged chain of pages
+    /// @throws PhotographError when the file is missing, a folder, empty, unreadable, no picture, a camera's
+    /// raw file, an animation (unless asked for its first picture), or a TIFF with a damaged chain of pages
     explicit PhotographReader(const std::filesystem::path& path, const ReadOptions& options = {});
     ~PhotographReader();
     PhotographReader(const PhotographReader&) = delete;
@@ -32,8 +31,7 @@ public:
 
     /// The next page: at first the first one, at most pages() of them.
     /// @throws PhotographError when it is cut short or a picture that the filter cannot take: over 32767
-    /// pixels
-    ///         wide or high, more than four channels, floating point samples, Lab and other colour models
+    /// pixels wide or high, more than four channels, floating point samples, Lab and other colour models
     /// @throws std::bad_alloc when the memory does not suffice
     Photograph next();
 

@@ -1,5 +1,6 @@
 #include "files/TiffFile.h"
 
+#include "files/CameraRaw.h"
 #include "files/LibTiff.h"
 #include "files/Refusal.h"
 
@@ -101,6 +102,10 @@ TiffPage TiffFile::page(int index) const {
         else
             page.fields.push_back(tiffField(entry));
     return page;
+}
+
+bool TiffFile::isCameraRaw() const {
+    return orvela::isCameraRaw(TiffView(mFile.view()));
 }
 
 bool TiffFile::isMask(const TiffPage& page) {

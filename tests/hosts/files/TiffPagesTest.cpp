@@ -353,6 +353,32 @@ TEST(TiffPages, TellWhatTheyBecome) {
     EXPECT_EQ(folder.output("exiftool -s3 -Compression -YCbCrSubSampling j.tif"), "JPEG\nYCbCr4:2:0 (2 2)\n");
 }
 
+// A preview before the data of a sensor is none of them; one smaller picture below another is no raw file.
+TEST(TiffPages, OfCameraRawFilesAreRefused) {
+    const TestFolder folder;
+    for (const int below : {PHOTOMETRIC_RGB, PHOTOMETRIC_CFA}) {
+        {
+            const Tiff tiff = openTiff(folder / "s.tif", "w");
+            toff_t places[] = {0};
+            TIFFSetField(tiff.get(), TIFFTAG_SUBIFD, 1, places);
+            writePage(tiff.get(), kPages[0], 0);
+            Page page = {16, 14, 8, 1, below};
+            page.samples = below == PHOTOMETRIC_RGB ? 3 : 1;
+            writePage(tiff.get(), page, 1);
+        }
+        if (below == PHOTOMETRIC_RGB) {
+            EXPECT_THAT(rewrite(folder / "s.tif", folder / "t.tif"), ElementsAre(HasSubstr("sub-images")));
+            continue;
+        }
+        try {
+            readPhotograph(folder / "s.tif");
+            ADD_FAILURE() << "read";
+        } catch (const PhotographError& error) {
+            EXPECT_THAT(error.what(), HasSubstr("s.tif: is a camera's raw file; "));
+        }
+    }
+}
+
 TEST(TiffPages, ThatAreDamagedAreNamed) {
     const TestFolder folder;
     writeTiff(folder / "s.tif", "wl", {kPages[0], kPages[1], kPages[3]});
