@@ -64,10 +64,21 @@ Encoding encodingOf(const Bytes& file, FileFormat format) {
     return encoding;
 }
 
+// Depth and kind of colour stand in the first chunk.
+void noteExpansion(Photograph& photograph, const Bytes& png) {
+    constexpr std::uint8_t palette = 3;
+    if (png.size() > 25 && png[25] == palette)
+        photograph.notes.emplace_back(kPaletteNote);
+    else if (png.size() > 25 && png[24] < 8)
+        photograph.notes.emplace_back(kBitsNote);
+}
+
 Photograph decodeFile(const Bytes& file, FileFormat format, const fs::path& path) {
     const VipsHandle image = open(path, file, format);
     Photograph photograph = describeImage(path, image.get());
     photograph.encoding = encodingOf(file, format);
+    if (format == FileFormat::Png)
+        noteExpansion(photograph, file);
     takeSamples(photograph, path, image.get());
     return photograph;
 }

@@ -8,6 +8,7 @@
 #include "files/TiffFields.h"
 #include "files/TiffWriter.h"
 #include "metadata/MetadataWriter.h"
+#include "metadata/PngMetadata.h"
 
 #include <algorithm>
 
@@ -110,6 +111,9 @@ void PhotographWriter::addPage(const Photograph& photograph, PreparedMetadata& p
 void PhotographWriter::addEncoded(const Photograph& photograph, PreparedMetadata& metadata) {
     Bytes encoded = encodePhotograph(photograph, metadata.target, mTarget, mOptions, metadata.metadata);
     embedMetadata(metadata, encoded);
+    // The library leaves out one that is damaged, or for other colours than the picture's.
+    if (metadata.target == FileFormat::Png && !photograph.iccProfile.empty() && !hasPngProfile(encoded))
+        metadata.lost.emplace_back("the ICC profile, which does not suit its colours or is damaged");
     mFile = std::make_unique<TargetFile>(mTarget);
     mFile->write(encoded, mOptions.stop);
 }

@@ -1,6 +1,8 @@
 #include "files/PsdFile.h"
 
 #include "files/Refusal.h"
+#include "metadata/ImageResources.h"
+#include "metadata/PsdMetadata.h"
 
 #include <algorithm>
 
@@ -11,7 +13,6 @@ namespace {
 namespace fs = std::filesystem;
 
 enum Mode { Bitmap = 0, Gray = 1, Indexed = 2, RGB = 3, CMYK = 4 };
-enum Resource { IccProfile = 1039, VersionInfo = 1057 };
 
 /// Big-endian numbers and byte runs, from the start of a file to its end.
 class Cursor {
@@ -75,21 +76,13 @@ Header readHeader(Cursor& cursor, const fs::path& path) {
     return header;
 }
 
-void readResources(Cursor cursor, Photograph& photograph, const fs::path& path) {
-    while (!cursor.atEnd()) {
-        cursor.take(4);
-        const std::uint32_t id = cursor.number(2);
-        const std::size_t name = cursor.number(1);
-        cursor.take(name | 1);
-        const std::uint32_t size = cursor.number(4);
-        const ByteView data = cursor.take(size);
-        if (size % 2 == 1 && !cursor.atEnd())
-            cursor.take(1);
-        if (id == IccProfile)
-            photograph.iccProfile.assign(data.begin(), data.end());
-        if (id == VersionInfo && data.size() > 4 && data[4] == 0)
-            refuse(path, "was saved without a merged picture", "save it again with maximum compatibility");
-    }
+void takeResources(ByteView list, Photograph& photograph, const fs::path& path) {
+    const ImageResources resources = imageResources(list);
+    if (const ImageResource* profile = resources.find(resource::IccProfile))
+        photograph.iccProfile = copyOf(profile->data);
+    const ImageResource* version = resources.find(resource::VersionInfo);
+    if (version != nullptr && version->data.size() > 4 && version->data[4] == 0)
+        refuse(path, "was saved without a merged picture", "save it again with maximum compatibility");
 }
 
 void unpackRow(Cursor packed, std::uint8_t* row, std::size_t size, const fs::path& path) {
@@ -184,15 +177,19 @@ Photograph readPsd(ByteView file, const fs::path& path) {
     photograph.depth = header.depth == 16 ? 16 : 8;
     photograph.model = modelOf(header);
     photograph.encoding.format = FileFormat::Psd;
-    readResources(Cursor(cursor.block(), path), photograph, path);
-    cursor.block(); // the layers
+    takeResources(cursor.block(), photograph, path);
+    const PsdLayers layers = psdLayers(cursor.block());
+    photograph.extraChannel = hasAlpha(photograph.model) && !layers.transparency;
     const Bytes planes = readPlanes(cursor, header, path);
-    if (header.mode == Indexed)
+    if (header.mode == Indexed) {
         expandPalette(planes, palette, photograph);
-    else if (header.depth == 1)
+        photograph.notes.emplace_back(kPaletteNote);
+    } else if (header.depth == 1) {
         expandBits(planes, header, photograph);
-    else
+        photograph.notes.emplace_back(kBitsNote);
+    } else {
         interleave(planes, header, photograph);
+    }
     return photograph;
 }
 

@@ -342,6 +342,11 @@ void embedIntoPng(const Metadata& metadata, Bytes& encoded) {
     encoded = std::move(file);
 }
 
+bool hasPngProfile(ByteView file) {
+    const std::vector<RawChunk> chunks = chunksOf(file);
+    return std::any_of(chunks.begin(), chunks.end(), [](const RawChunk& one) { return one.name == "iCCP"; });
+}
+
 std::vector<Chunk> pngTexts(const std::vector<Text>& texts) {
     std::vector<Chunk> chunks;
     for (const Text& text : texts) {

@@ -10,6 +10,9 @@ Metadata readPngMetadata(ByteView file);
 /// Puts the metadata into an encoded PNG, in place of what the encoder wrote, whose colour profile stays.
 void embedIntoPng(const Metadata& metadata, Bytes& encoded);
 
+/// Whether there is an ICC profile in it.
+bool hasPngProfile(ByteView file);
+
 /// Texts as PNG chunks.
 std::vector<Chunk> pngTexts(const std::vector<Text>& texts);
 

@@ -27,12 +27,18 @@ Bytes dataOf(const ImageResources& resources, std::uint16_t id) {
 const std::vector<std::uint16_t> kElsewhere = {
     resource::IccProfile, resource::Exif, resource::Exif3, resource::Xmp, 0x0400, 0x0402, 0x042D, 0x0430};
 
-// A single one is the merged picture itself. Below zero the first transparency is that of the merged picture.
-int layerCount(ByteView layers) {
-    if (layers.size() < 6 || number(layers, 0, 4, ByteOrder::Big) == 0)
-        return 0;
-    const auto count = static_cast<std::int16_t>(number(layers, 4, 2, ByteOrder::Big));
-    return std::abs(int{count});
+// Those of 16 bits stand in a named block behind the place of others.
+ByteView deepLayers(ByteView section, std::size_t at) {
+    part(section, at); // the mask of all
+    while (at + 12 <= section.size()) {
+        const std::string_view name = asText(slice(section, at + 4, 4));
+        at += 8;
+        const ByteView data = part(section, at);
+        if (name == "Lr16")
+            return data;
+        at = (at + 3) / 4 * 4;
+    }
+    return {};
 }
 
 } // namespace
@@ -49,12 +55,31 @@ Metadata readPsdMetadata(ByteView file) {
         metadata.xmp = dataOf(resources, resource::Xmp);
         metadata.density = resourceDensity(list);
         metadata.resources = withoutResources(list, kElsewhere);
-        if (layerCount(part(file, at)) > 1)
+        if (psdLayers(part(file, at)).count > 0)
             metadata.unheld.emplace_back("the layers");
     } catch (const DamagedBytes&) {
         metadata.damaged.emplace_back("Photoshop's data");
     }
     return metadata;
+}
+
+// The count is below zero where the first channel beside the colours is transparency.
+PsdLayers psdLayers(ByteView section) {
+    PsdLayers layers;
+    try {
+        std::size_t at = 0;
+        ByteView list = section.empty() ? section : part(section, at);
+        if (list.empty() && !section.empty())
+            list = deepLayers(section, at);
+        if (list.empty())
+            return layers;
+        const auto count = static_cast<std::int16_t>(number(list, 0, 2, ByteOrder::Big));
+        layers.transparency = count < 0;
+        layers.count = std::abs(int{count}) > 1 ? std::abs(int{count}) : 0;
+    } catch (const DamagedBytes&) {
+        // Then none can be told of.
+    }
+    return layers;
 }
 
 } // namespace orvela
