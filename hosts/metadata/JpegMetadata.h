@@ -8,9 +8,6 @@ namespace orvela {
 inline constexpr std::size_t kJpegExifLimit = 65533 - 6;
 inline constexpr std::size_t kJpegXmpLimit = 65533 - 29;
 
-/// Name of the segments that a long XMP packet goes on in.
-inline constexpr char kExtendedXmp[] = "extended XMP";
-
 /// What the segments of a JPEG say.
 Metadata readJpegMetadata(ByteView file);
 

@@ -1,5 +1,6 @@
 #include "metadata/MetadataWriter.h"
 
+#include "metadata/ExtendedXmp.h"
 #include "metadata/ImageResources.h"
 #include "metadata/JpegMetadata.h"
 #include "metadata/MetadataReader.h"
@@ -8,8 +9,6 @@
 #include "metadata/Utf8.h"
 #include "metadata/WebPMetadata.h"
 
-#include <QCryptographicHash>
-
 #include <algorithm>
 #include <array>
 #include <regex>
@@ -17,8 +16,6 @@
 namespace orvela {
 
 namespace {
-
-using namespace std::string_view_literals;
 
 using Names = std::vector<std::string>;
 
@@ -85,7 +82,6 @@ private:
     void moveColors();
     void fitJpeg();
     void fitTiff();
-    void splitXmp();
 
     Metadata& metadata() { return mResult.metadata; }
     void lose(const std::string& name) { mResult.lost.push_back(name); }
@@ -117,8 +113,12 @@ void Preparation::adaptToPicture() {
 
 void Preparation::dropSegments() {
     Names names;
+    const std::optional<Bytes> xmp = joinXmp(mSource.xmp, mSource.segments);
+    if (xmp)
+        metadata().xmp = *xmp;
     for (const Chunk& segment : mSource.segments)
-        if (std::find(names.begin(), names.end(), segment.name) == names.end())
+        if (!(xmp && segment.name == kExtendedXmp) &&
+            std::find(names.begin(), names.end(), segment.name) == names.end())
             names.push_back(segment.name);
     mResult.lost.insert(mResult.lost.end(), names.begin(), names.end());
     metadata().segments.clear();
@@ -208,41 +208,6 @@ void Preparation::moveColors() {
              std::to_string(codes.transfer) + ")");
 }
 
-// The packet goes into extension segments whole; the main one only refers to them.
-void Preparation::splitXmp() {
-    const std::string_view packet = asText(mSource.xmp);
-    const std::size_t begin = std::min(packet.find("<x:xmpmeta"), packet.find("<rdf:RDF"));
-    const std::size_t end = packet.rfind("<?xpacket");
-    if (begin == std::string_view::npos) {
-        lose("the XMP data");
-        metadata().xmp.clear();
-        return;
-    }
-    const std::string_view body =
-        packet.substr(begin, end == std::string_view::npos || end < begin ? end : end - begin);
-    const std::string id =
-        QCryptographicHash::hash(QByteArrayView(body.data(), static_cast<qsizetype>(body.size())),
-                                 QCryptographicHash::Md5)
-            .toHex()
-            .toUpper()
-            .toStdString();
-    const std::string note =
-        "<x:xmpmeta xmlns:x=\"adobe:ns:meta/\"><rdf:RDF "
-        "xmlns:rdf=\"http://www.w3.org/1999/02/22-rdf-syntax-ns#\"><rdf:Description rdf:about=\"\" "
-        "xmlns:xmpNote=\"http://ns.adobe.com/xmp/note/\" xmpNote:HasExtendedXMP=\"" +
-        id + "\"/></rdf:RDF></x:xmpmeta>";
-    metadata().xmp = copyOf(asBytes(note));
-    constexpr std::size_t most = 65000;
-    for (std::size_t at = 0; at < body.size(); at += most) {
-        Bytes data = copyOf(asBytes("http://ns.adobe.com/xmp/extension/\0"sv));
-        append(data, id);
-        append(data, body.size(), 4, ByteOrder::Big);
-        append(data, at, 4, ByteOrder::Big);
-        append(data, body.substr(at, most));
-        metadata().segments.push_back({kExtendedXmp, std::move(data), 0xE1});
-    }
-}
-
 // Some cameras let a long block go on in further segments; few programs know of that.
 void Preparation::fitJpeg() {
     const auto isLong = [this] {
@@ -254,8 +219,15 @@ void Preparation::fitJpeg() {
         lose("the Exif data, of over 64 KiB");
         mExif = ExifBlock({});
     }
-    if (mSource.xmp.size() > kJpegXmpLimit)
-        splitXmp();
+    if (mSource.xmp.size() <= kJpegXmpLimit)
+        return;
+    metadata().xmp.clear();
+    if (std::optional<PartedXmp> parted = partXmp(mSource.xmp)) {
+        metadata().xmp = std::move(parted->main);
+        metadata().segments = std::move(parted->segments);
+    } else {
+        lose("the XMP data");
+    }
 }
 
 void Preparation::fitTiff() {

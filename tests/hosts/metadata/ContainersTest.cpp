@@ -6,6 +6,7 @@
 #include "files/TiffWriter.h"
 #include "hosts/TestFiles.h"
 #include "hosts/TestPhotograph.h"
+#include "metadata/ExtendedXmp.h"
 #include "metadata/ImageResources.h"
 #include "metadata/MetadataReader.h"
 #include "metadata/MetadataWriter.h"
@@ -20,11 +21,13 @@ using namespace orvela;
 
 namespace {
 
+using testing::AllOf;
 using testing::Contains;
 using testing::ElementsAre;
 using testing::EndsWith;
 using testing::HasSubstr;
 using testing::IsEmpty;
+using testing::Not;
 
 // Puts `piece`, given as Python, behind the first `at` bytes of a file.
 std::string insert(const char* file, int at, const std::string& piece) {
@@ -221,6 +224,8 @@ TEST(Containers, SplitLongXmpAndShortenLongExif) {
                "'-XMP-dc:Description<=long' s.png");
     EXPECT_THAT(convert(folder, "s.png", "t.jpg.jpg"), IsEmpty());
     EXPECT_EQ(folder.output("exiftool -b -XMP-dc:Description t.jpg.jpg"), folder.text("long"));
+    EXPECT_THAT(convert(folder, "t.jpg.jpg", "u.png"), IsEmpty());
+    EXPECT_EQ(folder.output("exiftool -b -XMP-dc:Description u.png"), folder.text("long"));
 
     Metadata metadata;
     ExifBlock block({});
@@ -255,6 +260,30 @@ TEST(Containers, SplitLongXmpAndShortenLongExif) {
     EXPECT_THAT(writePhotograph(photograph, folder / "more/t.jpg"), IsEmpty());
     EXPECT_EQ(readPhotograph(folder / "more/t.jpg").metadata->exif, metadata.exif);
     EXPECT_THAT(tooLong.lost, ElementsAre(HasSubstr("64 KiB")));
+}
+
+// The parts in any order, beside what the main packet itself says.
+TEST(Containers, JoinXmpOfSeveralSegments) {
+    const auto packet = [](const std::string& tree) {
+        return "<x:xmpmeta xmlns:x='adobe:ns:meta/'>\n<rdf:RDF "
+               "xmlns:rdf='http://www.w3.org/1999/02/22-rdf-syntax-ns#'><rdf:Description rdf:about='' " +
+               tree + "/></rdf:RDF>\n</x:xmpmeta>";
+    };
+    const std::string other =
+        packet("xmlns:x1='http://example.org/' x1:Long='" + std::string(70000, 'l') + "'");
+    std::vector<Chunk> segments = partXmp(asBytes(other)).value().segments;
+    ASSERT_EQ(segments.size(), 2U);
+    std::swap(segments[0], segments[1]);
+    const std::string id(asText(ByteView(segments[0].data).subspan(35, 32)));
+    const std::string main = packet("xmlns:tiff='http://ns.adobe.com/tiff/1.0/' tiff:Make='M' "
+                                    "xmlns:xmpNote='http://ns.adobe.com/xmp/note/' xmpNote:HasExtendedXMP='" +
+                                    id + "'");
+    const Bytes joined = joinXmp(asBytes(main), segments).value();
+    EXPECT_THAT(std::string(asText(joined)),
+                AllOf(HasSubstr("tiff:Make='M'"), HasSubstr("x1:Long='lll"), Not(HasSubstr(id))));
+    EXPECT_FALSE(joinXmp(asBytes(packet("")), segments));
+    segments.pop_back();
+    EXPECT_FALSE(joinXmp(asBytes(main), segments));
 }
 
 TEST(Containers, ReadAndWriteBigTiff) {
