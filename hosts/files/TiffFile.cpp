@@ -99,7 +99,7 @@ TiffPage TiffFile::page(int index) const {
     for (const TagEntry& entry : directory(index).entries)
         if (entry.value.empty())
             page.damaged.push_back(entry.tag);
-        else
+        else if (entry.tag != TIFFTAG_IMAGESOURCEDATA) // layers, perhaps larger than the picture
             page.fields.push_back(tiffField(entry));
     return page;
 }

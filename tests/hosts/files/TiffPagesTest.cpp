@@ -416,6 +416,11 @@ END
         }
     }
     EXPECT_EQ(folder.count(), causes.size() + 2); // the source and the log
+    // One that is cut while it is read, too.
+    PhotographReader reader(folder / "s.tif");
+    reader.next();
+    fs::resize_file(folder / "s.tif", 100);
+    EXPECT_THROW(reader.next(), PhotographError);
     EXPECT_THAT(writePhotograph(readPhotograph(folder / "beyond.tif", {.firstOnly = true}), folder / "t.png"),
                 ElementsAre(HasSubstr("the other pages")));
 }
