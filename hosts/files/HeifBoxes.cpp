@@ -205,6 +205,19 @@ HeifCoding codingOf(ByteView file) {
     return coding;
 }
 
+// Of a track of the kind that is no film.
+int framesOf(ByteView track) {
+    const ByteView media = boxIn(track, "mdia");
+    Cursor handler(boxIn(media, "hdlr"));
+    handler.take(8);
+    constexpr std::uint32_t picture = 0x70696374; // "pict"
+    if (handler.number(4) != picture)
+        return 0;
+    Cursor sizes(boxIn(boxIn(boxIn(media, "minf"), "stbl"), "stsz"));
+    sizes.take(8);
+    return static_cast<int>(std::min<std::uint64_t>(sizes.number(4), INT32_MAX));
+}
+
 } // namespace
 
 std::optional<HeifCoding> heifCoding(ByteView file) {
@@ -213,6 +226,23 @@ std::optional<HeifCoding> heifCoding(ByteView file) {
     } catch (const std::out_of_range&) {
         return std::nullopt;
     }
+}
+
+HeifPictures heifPictures(ByteView file) {
+    HeifPictures pictures;
+    try {
+        for (Cursor cursor(file); !cursor.isAtEnd();) {
+            const Box box = nextBox(cursor);
+            pictures.still = pictures.still || box.type == "meta";
+            if (box.type == "moov")
+                for (const Box& track : boxesOf(box.content))
+                    if (track.type == "trak")
+                        pictures.frames = std::max(pictures.frames, framesOf(track.content));
+        }
+    } catch (const std::out_of_range&) {
+        // What was found before stays found.
+    }
+    return pictures;
 }
 
 } // namespace orvela

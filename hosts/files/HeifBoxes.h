@@ -15,4 +15,11 @@ struct HeifCoding {
 /// Reads it from the boxes of the file; none where they do not tell.
 std::optional<HeifCoding> heifCoding(ByteView file);
 
+/// Pictures of a HEIF, as far as its boxes can be followed.
+struct HeifPictures {
+    int frames = 0;     ///< of its image sequence; 0 without one
+    bool still = false; ///< it holds pictures beside the sequence
+};
+HeifPictures heifPictures(ByteView file);
+
 } // namespace orvela

@@ -1,8 +1,7 @@
 #include "files/PhotographReader.h"
 
-#include "files/Animation.h"
 #include "files/CameraRaw.h"
-#include "files/EncodingProbe.h"
+#include "files/HeifBoxes.h"
 #include "files/HeifReader.h"
 #include "files/JpegReader.h"
 #include "files/PsdFile.h"
@@ -11,6 +10,8 @@
 #include "files/TiffReader.h"
 #include "files/VipsPhotograph.h"
 #include "metadata/MetadataReader.h"
+#include "metadata/PngMetadata.h"
+#include "metadata/WebPMetadata.h"
 
 #include <algorithm>
 
@@ -46,7 +47,7 @@ VipsImage* load(const Bytes& file, FileFormat format) {
 VipsHandle open(const fs::path& path, const Bytes& file, FileFormat format) {
     startVips();
     vips_error_clear();
-    if (format == FileFormat::Png && !pngIsComplete(file))
+    if (format == FileFormat::Png && !hasPngChunk(file, "IEND"))
         refuse(path, "the file is cut short", kCopyAgain);
     VipsHandle image(load(file, format));
     if (!image)
@@ -60,7 +61,7 @@ Encoding encodingOf(const Bytes& file, FileFormat format) {
     if (format == FileFormat::Png)
         encoding.progressive = file.size() > 28 && file[28] == 1;
     if (format == FileFormat::WebP)
-        encoding.lossless = webpIsLossless(file);
+        encoding.lossless = webpPictures(file).lossless;
     return encoding;
 }
 
@@ -98,7 +99,7 @@ int framesOf(const fs::path& path, const Bytes& file, FileFormat format, bool fi
     if (format == FileFormat::Png)
         frames = pngFrames(file);
     if (format == FileFormat::WebP)
-        frames = webpFrames(file);
+        frames = webpPictures(file).frames;
     if (format == FileFormat::Heif) {
         const HeifPictures pictures = heifPictures(file);
         if (pictures.frames > 0 && !pictures.still)

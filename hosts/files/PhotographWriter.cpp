@@ -112,7 +112,7 @@ void PhotographWriter::addEncoded(const Photograph& photograph, PreparedMetadata
     Bytes encoded = encodePhotograph(photograph, metadata.target, mTarget, mOptions, metadata.metadata);
     embedMetadata(metadata, encoded);
     // The library leaves out one that is damaged, or for other colours than the picture's.
-    if (metadata.target == FileFormat::Png && !photograph.iccProfile.empty() && !hasPngProfile(encoded))
+    if (metadata.target == FileFormat::Png && !photograph.iccProfile.empty() && !hasPngChunk(encoded, "iCCP"))
         metadata.lost.emplace_back("the ICC profile, which does not suit its colours or is damaged");
     mFile = std::make_unique<TargetFile>(mTarget);
     mFile->write(encoded, mOptions.stop);

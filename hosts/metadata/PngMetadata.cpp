@@ -342,9 +342,23 @@ void embedIntoPng(const Metadata& metadata, Bytes& encoded) {
     encoded = std::move(file);
 }
 
-bool hasPngProfile(ByteView file) {
+bool hasPngChunk(ByteView file, std::string_view name) {
     const std::vector<RawChunk> chunks = chunksOf(file);
-    return std::any_of(chunks.begin(), chunks.end(), [](const RawChunk& one) { return one.name == "iCCP"; });
+    return std::any_of(chunks.begin(), chunks.end(), [&](const RawChunk& one) { return one.name == name; });
+}
+
+int pngFrames(ByteView file) {
+    std::uint64_t frames = 0;
+    bool isFrame = false; // the picture for readers that do not know animations
+    for (const RawChunk& chunk : chunksOf(file)) {
+        if (chunk.name == "IDAT")
+            break;
+        if (chunk.name == "acTL" && chunk.data.size() >= 4)
+            frames = number(chunk.data, 0, 4, ByteOrder::Big);
+        isFrame = isFrame || chunk.name == "fcTL";
+    }
+    const int shown = static_cast<int>(std::min<std::uint64_t>(frames, INT32_MAX));
+    return shown == 0 ? 1 : std::max(shown, isFrame ? 1 : 2);
 }
 
 std::vector<Chunk> pngTexts(const std::vector<Text>& texts) {
