@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <array>
 #include <map>
-#include <stdexcept>
 #include <string_view>
 
 namespace orvela {
@@ -12,34 +11,9 @@ namespace {
 
 using Items = std::vector<std::uint32_t>;
 
-/// Takes numbers, most significant byte first, off the front of bytes.
-class Cursor {
-public:
-    explicit Cursor(ByteView bytes) : mBytes(bytes) {}
-
-    bool isAtEnd() const { return mBytes.empty(); }
-
-    /// @throws std::out_of_range behind the end
-    ByteView take(std::uint64_t size) {
-        if (size > mBytes.size())
-            throw std::out_of_range("a box is cut short");
-        const ByteView taken = mBytes.first(static_cast<std::size_t>(size));
-        mBytes = mBytes.subspan(static_cast<std::size_t>(size));
-        return taken;
-    }
-    std::uint64_t number(std::uint64_t size) {
-        std::uint64_t value = 0;
-        for (const std::uint8_t byte : take(size))
-            value = value << 8 | byte;
-        return value;
-    }
-    std::uint32_t id(bool wide) { return static_cast<std::uint32_t>(number(wide ? 4 : 2)); }
-
-    ByteView rest() const { return mBytes; }
-
-private:
-    ByteView mBytes;
-};
+std::uint32_t idIn(Cursor& cursor, bool wide) {
+    return static_cast<std::uint32_t>(cursor.number(wide ? 4 : 2));
+}
 
 struct Box {
     std::string_view type;
@@ -56,8 +30,8 @@ Box nextBox(Cursor& cursor) {
     if (size == 0)
         size = whole; // up to the end
     if (size < head)
-        throw std::out_of_range("a box is smaller than its head");
-    return {{reinterpret_cast<const char*>(type.data()), type.size()}, cursor.take(size - head)};
+        throw DamagedBytes("a box is smaller than its head");
+    return {asText(type), cursor.take(size - head)};
 }
 
 std::vector<Box> boxesOf(ByteView content) {
@@ -88,7 +62,7 @@ struct FullBox {
 
 std::uint32_t primaryItem(ByteView pitm) {
     FullBox box(pitm);
-    return box.content.id(box.version > 0);
+    return idIn(box.content, box.version > 0);
 }
 
 // The items that an item is put together from, in order; none when it is coded itself.
@@ -100,11 +74,11 @@ Items partsOf(ByteView meta, std::uint32_t item) {
         const bool wide = box.version > 0;
         for (const Box& reference : boxesOf(box.content.rest())) {
             Cursor cursor(reference.content);
-            if (reference.type != "dimg" || cursor.id(wide) != item)
+            if (reference.type != "dimg" || idIn(cursor, wide) != item)
                 continue;
-            Items parts(cursor.id(false));
+            Items parts(idIn(cursor, false));
             for (std::uint32_t& part : parts)
-                part = cursor.id(wide);
+                part = idIn(cursor, wide);
             return parts;
         }
     }
@@ -118,8 +92,8 @@ std::map<std::uint32_t, std::uint64_t> itemSizes(ByteView iloc) {
     const std::uint64_t fields = cursor.number(2);
     const auto width = [&](int field) { return fields >> (12 - 4 * field) & 15; };
     std::map<std::uint32_t, std::uint64_t> sizes;
-    for (std::uint32_t count = cursor.id(box.version == 2); count > 0; --count) {
-        const std::uint32_t item = cursor.id(box.version == 2);
+    for (std::uint32_t count = idIn(cursor, box.version == 2); count > 0; --count) {
+        const std::uint32_t item = idIn(cursor, box.version == 2);
         if (box.version > 0)
             cursor.take(2); // where the offsets count from
         cursor.take(2 + width(2));
@@ -136,7 +110,7 @@ Items propertiesOf(ByteView ipma, std::uint32_t item) {
     FullBox box(ipma);
     const bool wide = (box.flags & 1) != 0;
     for (std::uint64_t count = box.content.number(4); count > 0; --count) {
-        const bool found = box.content.id(box.version > 0) == item;
+        const bool found = idIn(box.content, box.version > 0) == item;
         Items properties(box.content.number(1));
         for (std::uint32_t& property : properties)
             property = static_cast<std::uint32_t>(box.content.number(wide ? 2 : 1)) & (wide ? 0x7FFF : 0x7F);
@@ -223,7 +197,7 @@ int framesOf(ByteView track) {
 std::optional<HeifCoding> heifCoding(ByteView file) {
     try {
         return codingOf(file);
-    } catch (const std::out_of_range&) {
+    } catch (const DamagedBytes&) {
         return std::nullopt;
     }
 }
@@ -239,7 +213,7 @@ HeifPictures heifPictures(ByteView file) {
                     if (track.type == "trak")
                         pictures.frames = std::max(pictures.frames, framesOf(track.content));
         }
-    } catch (const std::out_of_range&) {
+    } catch (const DamagedBytes&) {
         // What was found before stays found.
     }
     return pictures;

@@ -14,32 +14,6 @@ namespace fs = std::filesystem;
 
 enum Mode { Bitmap = 0, Gray = 1, Indexed = 2, RGB = 3, CMYK = 4 };
 
-/// Big-endian numbers and byte runs, from the start of a file to its end.
-class Cursor {
-public:
-    Cursor(ByteView bytes, const fs::path& path) : mBytes(bytes), mPath(path) {}
-
-    ByteView take(std::size_t count) {
-        if (count > mBytes.size())
-            refuse(mPath, "the file is cut short", kCopyAgain);
-        const ByteView taken = mBytes.first(count);
-        mBytes = mBytes.subspan(count);
-        return taken;
-    }
-    std::uint32_t number(std::size_t bytes) {
-        std::uint32_t value = 0;
-        for (const std::uint8_t byte : take(bytes))
-            value = value << 8 | byte;
-        return value;
-    }
-    ByteView block() { return take(number(4)); }
-    bool atEnd() const { return mBytes.empty(); }
-
-private:
-    ByteView mBytes;
-    const fs::path& mPath;
-};
-
 struct Header {
     std::size_t channels;
     std::size_t width;
@@ -87,8 +61,8 @@ void takeResources(ByteView list, Photograph& photograph, const fs::path& path) 
 
 void unpackRow(Cursor packed, std::uint8_t* row, std::size_t size, const fs::path& path) {
     std::size_t at = 0;
-    while (at < size && !packed.atEnd()) {
-        const std::uint32_t code = packed.number(1);
+    while (at < size && !packed.isAtEnd()) {
+        const std::uint64_t code = packed.number(1);
         if (code == 128)
             continue;
         const std::size_t count = std::min<std::size_t>(code < 128 ? code + 1 : 257 - code, size - at);
@@ -108,17 +82,17 @@ void unpackRow(Cursor packed, std::uint8_t* row, std::size_t size, const fs::pat
 Bytes readPlanes(Cursor cursor, const Header& header, const fs::path& path) {
     const std::size_t row = header.rowBytes();
     const std::size_t rows = header.height * header.channels;
-    const std::uint32_t compression = cursor.number(2);
+    const std::uint64_t compression = cursor.number(2);
     if (compression > 1)
         refuse(path, "has its merged picture in ZIP compression", "save it as TIFF");
     if (compression == 0) {
         const ByteView plain = cursor.take(row * rows);
         return {plain.begin(), plain.end()};
     }
-    Cursor lengths(cursor.take(2 * rows), path);
+    Cursor lengths(cursor.take(2 * rows));
     Bytes planes(row * rows);
     for (std::size_t y = 0; y < rows; ++y)
-        unpackRow(Cursor(cursor.take(lengths.number(2)), path), planes.data() + y * row, row, path);
+        unpackRow(Cursor(cursor.take(lengths.number(2))), planes.data() + y * row, row, path);
     return planes;
 }
 
@@ -162,10 +136,8 @@ ColorModel modelOf(const Header& header) {
     return header.channels == 2 ? ColorModel::GreyAlpha : ColorModel::Grey;
 }
 
-} // namespace
-
-Photograph readPsd(ByteView file, const fs::path& path) {
-    Cursor cursor(file, path);
+Photograph read(ByteView file, const fs::path& path) {
+    Cursor cursor(file);
     const Header header = readHeader(cursor, path);
     const ByteView palette = cursor.block();
     if (header.mode == Indexed && palette.size() < 768)
@@ -191,6 +163,16 @@ Photograph readPsd(ByteView file, const fs::path& path) {
         interleave(planes, header, photograph);
     }
     return photograph;
+}
+
+} // namespace
+
+Photograph readPsd(ByteView file, const fs::path& path) {
+    try {
+        return read(file, path);
+    } catch (const DamagedBytes&) {
+        refuse(path, "the file is cut short", kCopyAgain);
+    }
 }
 
 } // namespace orvela
