@@ -16,6 +16,7 @@ namespace {
 namespace fs = std::filesystem;
 
 constexpr int kProfileMarker = JPEG_APP0 + 2;
+constexpr int kMostScans = 1000; // programs write some ten; a short file may hold so many that it takes hours
 
 class Decoder {
 public:
@@ -23,6 +24,8 @@ public:
         mJpeg.err = mErrors.manager();
         attempt([&] {
             jpeg_create_decompress(&mJpeg);
+            mProgress.progress_monitor = watch;
+            mJpeg.progress = &mProgress;
             jpeg_mem_src(&mJpeg, file.data(), file.size());
             jpeg_save_markers(&mJpeg, kProfileMarker, 0xFFFF);
             jpeg_read_header(&mJpeg, TRUE);
@@ -37,6 +40,7 @@ public:
     Encoding encoding();
 
 private:
+    static void watch(j_common_ptr jpeg);
     template <typename Work>
     void attempt(const Work& work);
     ColorModel model() const;
@@ -44,8 +48,15 @@ private:
 
     const fs::path& mPath;
     JpegErrors mErrors;
+    jpeg_progress_mgr mProgress{};
     jpeg_decompress_struct mJpeg{};
 };
+
+// The library looks here after every row of blocks of every scan.
+void Decoder::watch(j_common_ptr jpeg) {
+    if (reinterpret_cast<j_decompress_ptr>(jpeg)->input_scan_number > kMostScans)
+        ERREXIT(jpeg, JERR_CANT_SUSPEND);
+}
 
 template <typename Work>
 void Decoder::attempt(const Work& work) {
@@ -56,6 +67,8 @@ void Decoder::attempt(const Work& work) {
     mErrors.throwIfOutOfMemory();
     if (mErrors.code() == JWRN_JPEG_EOF)
         refuse(mPath, "the file is cut short", kCopyAgain);
+    if (mErrors.code() == JERR_CANT_SUSPEND) // see watch()
+        refuse(mPath, "is damaged: it has over " + std::to_string(kMostScans) + " scans", kCopyAgain);
     if (mErrors.code() == JERR_BAD_PRECISION || mErrors.code() == JERR_SOF_UNSUPPORTED)
         refuse(mPath, "is a kind of JPEG that cannot be read (" + mErrors.text() + ")",
                "save it as a JPEG of 8 bits or as a TIFF");

@@ -190,6 +190,8 @@ void Preparation::moveDensity() {
         return;
     if (mSource.density->unit != DensityUnit::None)
         mExif.setDensity(*mSource.density);
+    else if (mSource.density->x.value() != mSource.density->y.value())
+        lose("the shape of its pixels");
     metadata().density.reset();
 }
 

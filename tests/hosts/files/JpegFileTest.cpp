@@ -227,6 +227,26 @@ TEST(JpegFile, RefusesDamage) {
     }
 }
 
+// Each scan takes the time of a whole picture, and few bytes.
+TEST(JpegFile, RefusesToReadForHours) {
+    WriteOptions options;
+    options.progressive = true;
+    const Bytes jpeg = encodeJpeg(plain(ColorModel::Grey), "s.jpg", options);
+    const std::string_view start("\xFF\xDA");
+    const auto last = std::find_end(jpeg.begin(), jpeg.end(), start.begin(), start.end(),
+                                    [](std::uint8_t a, char b) { return a == static_cast<std::uint8_t>(b); });
+    Bytes many(jpeg.begin(), last);
+    for (int i = 0; i < 1100; ++i)
+        many.insert(many.end(), last, jpeg.end() - 2);
+    append(many, "\xFF\xD9");
+    try {
+        readJpeg(many, "s.jpg");
+        ADD_FAILURE() << "read";
+    } catch (const PhotographError& error) {
+        EXPECT_THAT(error.what(), testing::StartsWith("s.jpg: is damaged: it has over 1000 scans; "));
+    }
+}
+
 TEST(JpegFile, StopsBetweenRows) {
     const std::atomic<bool> stop{true};
     WriteOptions options;

@@ -85,6 +85,10 @@ TEST(Containers, KeepTheirOwnDensityWhateverExifSays) {
         folder.run(std::string("rm ") + c.target);
     }
     EXPECT_NEAR(readPhotograph(folder / "e.jpg").xResolution, 300 / 25.4, 1e-9);
+    // Without a unit it is the shape of the pixels, for which not every format has a place.
+    folder.run("exiftool -q -overwrite_original -JFIF:YResolution=2 n.jpg");
+    EXPECT_THAT(convert(folder, "n.jpg", "t.png"), IsEmpty());
+    EXPECT_THAT(convert(folder, "n.jpg", "t.webp"), ElementsAre(EndsWith("hold: the shape of its pixels")));
 }
 
 TEST(Containers, CarryTextsAndColoursOfPng) {
