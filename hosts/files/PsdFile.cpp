@@ -79,7 +79,7 @@ void unpackRow(Cursor packed, std::uint8_t* row, std::size_t size, const fs::pat
 }
 
 // All rows of the first channel, then all of the second and so on, without packing.
-Bytes readPlanes(Cursor cursor, const Header& header, const fs::path& path) {
+Bytes readPlanes(Cursor& cursor, const Header& header, const fs::path& path) {
     const std::size_t row = header.rowBytes();
     const std::size_t rows = header.height * header.channels;
     const std::uint64_t compression = cursor.number(2);
@@ -153,6 +153,8 @@ Photograph read(ByteView file, const fs::path& path) {
     const PsdLayers layers = psdLayers(cursor.block());
     photograph.extraChannel = hasAlpha(photograph.model) && !layers.transparency;
     const Bytes planes = readPlanes(cursor, header, path);
+    if (!cursor.isAtEnd())
+        photograph.unheld.push_back(std::to_string(cursor.rest().size()) + " bytes behind the picture");
     if (header.mode == Indexed) {
         expandPalette(planes, palette, photograph);
         photograph.notes.emplace_back(kPaletteNote);

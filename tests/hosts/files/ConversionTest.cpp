@@ -75,9 +75,11 @@ TEST(Conversion, TakesNoSelectionForTransparency) {
     EXPECT_FALSE(readPhotograph(folder / "s.psd").extraChannel);
     folder.run(psd(16, "bytes(8) + b'8BIMPatt' + struct.pack('>I', 2) + bytes(4) + b'8BIMLr16' + "
                        "struct.pack('>Ih', 2, -3)"));
+    folder.run("printf 'of another program' >>s.psd");
     const Photograph deep = readPhotograph(folder / "s.psd");
     EXPECT_FALSE(deep.extraChannel);
-    EXPECT_THAT(writePhotograph(deep, folder / "deep.tif"), ElementsAre(EndsWith("hold: the layers")));
+    EXPECT_THAT(writePhotograph(deep, folder / "deep.tif"),
+                ElementsAre(EndsWith("hold: the layers; 18 bytes behind the picture")));
 }
 
 TEST(Conversion, IsToldInOneLine) {

@@ -8,6 +8,7 @@
 #include "hosts/TestPhotograph.h"
 
 #include <gmock/gmock.h>
+#include <libheif/heif.h>
 
 #include <cmath>
 #include <csignal>
@@ -164,6 +165,32 @@ TEST(HeifFile, KeepsTheCodeOfItsColours) {
     folder.run("convert s.avif s.png && convert t.heic t2.png");
     EXPECT_LT(std::stod(folder.output("compare -metric MAE s.png t2.png null: 2>&1 | sed 's/ .*//'")) / 257,
               3);
+}
+
+// Colours of 100 under a transparency of a quarter were 25 in the file.
+TEST(HeifFile, TakesAMultipliedTransparencyOutOfColours) {
+    const TestFolder folder;
+    heif_image* image = nullptr;
+    heif_image_create(64, 64, heif_colorspace_RGB, heif_chroma_interleaved_RGBA, &image);
+    heif_image_add_plane(image, heif_channel_interleaved, 64, 64, 8);
+    int stride = 0;
+    std::uint8_t* plane = heif_image_get_plane(image, heif_channel_interleaved, &stride);
+    for (int i = 0; i < 64 * stride; ++i)
+        plane[i] = i % 4 == 3 ? 64 : 25;
+    heif_image_set_premultiplied_alpha(image, 1);
+    heif_context* context = heif_context_alloc();
+    heif_encoder* encoder = nullptr;
+    heif_context_get_encoder_for_format(context, heif_compression_HEVC, &encoder);
+    heif_encoder_set_lossy_quality(encoder, 95);
+    heif_context_encode_image(context, image, encoder, nullptr, nullptr);
+    heif_context_write_to_file(context, (folder / "s.heic").c_str());
+    heif_encoder_release(encoder);
+    heif_context_free(context);
+    heif_image_release(image);
+    const Photograph photograph = readPhotograph(folder / "s.heic");
+    ASSERT_EQ(photograph.model, ColorModel::RgbAlpha);
+    EXPECT_NEAR(photograph.samples[0], 100, 8);
+    EXPECT_NEAR(photograph.samples[3], 64, 2);
 }
 
 // A thumbnail is made of the result; other formats have no place for it. Light levels hold of the old
