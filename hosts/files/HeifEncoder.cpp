@@ -7,6 +7,8 @@
 #include "files/HeifRate.h"
 #include "metadata/ExifBlock.h"
 
+#include <algorithm>
+#include <array>
 #include <cstring>
 
 namespace orvela {
@@ -95,19 +97,19 @@ HeifEncoder encoderFor(heif_context* context, const Settings& settings, int qual
     return encoder;
 }
 
-// A matrix that the codec does with any resolution of colour, in the place of none.
+// Numbers that the library does not know are left out, which reading the file back shows. How RGB becomes
+// brightness and colour is this encoder's choice.
 HeifColors colorsOf(const ColorCodes& codes) {
-    constexpr std::uint16_t unspecified = 2;
-    constexpr std::uint16_t rec601 = 6;
+    constexpr std::array<std::uint16_t, 3> matrices = {1, 6, 9}; // BT.709, BT.601, BT.2020
+    const bool known = std::find(matrices.begin(), matrices.end(), codes.matrix) != matrices.end();
     HeifColors colors(heif_nclx_color_profile_alloc());
     if (!colors)
         throw std::bad_alloc();
-    const bool hasMatrix = codes.matrix != 0 && codes.matrix != unspecified;
-    checkHeif(heif_nclx_color_profile_set_color_primaries(colors.get(), codes.primaries));
-    checkHeif(heif_nclx_color_profile_set_transfer_characteristics(colors.get(), codes.transfer));
+    static_cast<void>(heif_nclx_color_profile_set_color_primaries(colors.get(), codes.primaries));
+    static_cast<void>(heif_nclx_color_profile_set_transfer_characteristics(colors.get(), codes.transfer));
     checkHeif(
-        heif_nclx_color_profile_set_matrix_coefficients(colors.get(), hasMatrix ? codes.matrix : rec601));
-    colors->full_range_flag = codes.fullRange ? 1 : 0;
+        heif_nclx_color_profile_set_matrix_coefficients(colors.get(), known ? codes.matrix : matrices[1]));
+    colors->full_range_flag = 1;
     return colors;
 }
 

@@ -6,7 +6,6 @@
 
 #include <algorithm>
 #include <map>
-#include <regex>
 
 namespace orvela {
 
@@ -19,6 +18,28 @@ constexpr std::size_t kIdSize = 32;
 constexpr std::size_t kMost = 65000; // of a segment
 constexpr int kApp1 = 0xE1;
 constexpr auto kEndOfTree = "</rdf:RDF>"sv;
+
+// The property of the main packet that names the other one: an attribute or an element.
+struct Reference {
+    std::string id;
+    std::size_t begin;
+    std::size_t end;
+};
+
+std::optional<Reference> referenceIn(std::string_view packet) {
+    constexpr auto property = "xmpNote:HasExtendedXMP"sv;
+    const std::size_t name = packet.find(property);
+    if (name == std::string_view::npos)
+        return std::nullopt;
+    const std::size_t id = packet.find_first_not_of(" \t\r\n=>\"'", name + property.size());
+    if (id == std::string_view::npos || packet.size() - id <= kIdSize)
+        return std::nullopt;
+    const bool isElement = name > 0 && packet[name - 1] == '<';
+    const std::size_t last = isElement ? packet.find('>', id) : id + kIdSize;
+    if (last == std::string_view::npos)
+        return std::nullopt;
+    return Reference{std::string(packet.substr(id, kIdSize)), isElement ? name - 1 : name, last + 1};
+}
 
 // What stands between the beginning of the tree and its end; empty when there is no tree.
 std::string_view treeOf(std::string_view packet) {
@@ -53,14 +74,14 @@ std::string otherPacket(const std::string& id, const std::vector<Chunk>& segment
 
 } // namespace
 
-std::optional<PartedXmp> partXmp(ByteView bytes) {
-    const std::string_view packet = asText(bytes);
-    const std::size_t begin = std::min(packet.find("<x:xmpmeta"), packet.find("<rdf:RDF"));
-    const std::size_t end = packet.rfind("<?xpacket");
+std::optional<PartedXmp> partXmp(ByteView packet) {
+    const std::string_view text = asText(packet);
+    const std::size_t begin = std::min(text.find("<x:xmpmeta"), text.find("<rdf:RDF"));
+    const std::size_t end = text.rfind("<?xpacket");
     if (begin == std::string_view::npos)
         return std::nullopt;
     const std::string_view body =
-        packet.substr(begin, end == std::string_view::npos || end < begin ? end : end - begin);
+        text.substr(begin, end == std::string_view::npos || end < begin ? end : end - begin);
     const std::string id =
         QCryptographicHash::hash(QByteArrayView(body.data(), static_cast<qsizetype>(body.size())),
                                  QCryptographicHash::Md5)
@@ -85,21 +106,18 @@ std::optional<PartedXmp> partXmp(ByteView bytes) {
 }
 
 std::optional<Bytes> joinXmp(ByteView main, const std::vector<Chunk>& segments) {
-    static const std::regex reference("xmpNote:HasExtendedXMP(?:\\s*=\\s*[\"']|>)([0-9A-Fa-f]{32})");
-    static const std::regex note("\\s+xmpNote:HasExtendedXMP\\s*=\\s*(\"[^\"]*\"|'[^']*')|"
-                                 "<xmpNote:HasExtendedXMP>[^<]*</xmpNote:HasExtendedXMP>");
-    const std::string packet(asText(main));
-    std::smatch found;
-    if (!std::regex_search(packet, found, reference))
+    std::string packet(asText(main));
+    const std::optional<Reference> reference = referenceIn(packet);
+    if (!reference)
         return std::nullopt;
-    const std::string other = otherPacket(found[1], segments);
-    std::string joined = std::regex_replace(packet, note, "");
-    const std::size_t end = joined.rfind(kEndOfTree);
+    const std::string other = otherPacket(reference->id, segments);
+    packet.erase(reference->begin, reference->end - reference->begin);
+    const std::size_t end = packet.rfind(kEndOfTree);
     if (treeOf(other).empty() || end == std::string::npos)
         return std::nullopt;
-    joined.insert(end, treeOf(other));
-    const ByteView result = asBytes(joined);
-    return isWellFormedXmp(result) ? std::optional(copyOf(result)) : std::nullopt;
+    packet.insert(end, treeOf(other));
+    const ByteView joined = asBytes(packet);
+    return isWellFormedXmp(joined) ? std::optional(copyOf(joined)) : std::nullopt;
 }
 
 } // namespace orvela

@@ -112,6 +112,8 @@ void Preparation::adaptToPicture() {
 }
 
 void Preparation::dropSegments() {
+    if (mSource.segments.empty())
+        return;
     Names names;
     const std::optional<Bytes> xmp = joinXmp(mSource.xmp, mSource.segments);
     if (xmp)

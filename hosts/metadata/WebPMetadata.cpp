@@ -39,6 +39,14 @@ std::vector<RiffChunk> chunksOf(ByteView file, std::size_t at) {
 
 constexpr std::size_t kBehindHead = 12;
 
+// Without what stands behind the end that the head tells.
+ByteView wholeOf(ByteView file) {
+    if (file.size() < kBehindHead)
+        return {};
+    const std::size_t size = 8 + number(file, 4, 4, ByteOrder::Little);
+    return file.first(std::min(file.size(), size + size % 2));
+}
+
 bool isPicture(std::string_view name) {
     constexpr std::array names = {"VP8X"sv, "VP8 "sv, "VP8L"sv, "ALPH"sv, "ANIM"sv, "ANMF"sv, "ICCP"sv};
     return std::find(names.begin(), names.end(), name) != names.end();
@@ -56,7 +64,8 @@ void put(const Mux& mux, const char* name, const Bytes& bytes) {
 Metadata readWebPMetadata(ByteView file) {
     Metadata metadata;
     metadata.format = FileFormat::WebP;
-    for (const RiffChunk& chunk : chunksOf(file, kBehindHead)) {
+    const ByteView whole = wholeOf(file);
+    for (const RiffChunk& chunk : chunksOf(whole, kBehindHead)) {
         if (chunk.name == "EXIF" && metadata.exif.empty())
             metadata.exif = copyOf(chunk.data);
         else if (chunk.name == "XMP " && metadata.xmp.empty())
@@ -64,6 +73,8 @@ Metadata readWebPMetadata(ByteView file) {
         else if (!isPicture(chunk.name))
             metadata.unheld.push_back("the WebP chunk " + std::string(chunk.name));
     }
+    if (whole.size() < file.size())
+        metadata.unheld.push_back(std::to_string(file.size() - whole.size()) + " bytes behind the picture");
     // Some writers leave the head of a JPEG segment before it.
     if (startsWith(metadata.exif, "Exif\0\0"sv))
         metadata.exif.erase(metadata.exif.begin(), metadata.exif.begin() + 6);
@@ -72,7 +83,7 @@ Metadata readWebPMetadata(ByteView file) {
 
 WebPPictures webpPictures(ByteView file) {
     constexpr std::size_t frameHead = 16;
-    const std::vector<RiffChunk> chunks = chunksOf(file, kBehindHead);
+    const std::vector<RiffChunk> chunks = chunksOf(wholeOf(file), kBehindHead);
     const auto isFrame = [](const RiffChunk& chunk) { return chunk.name == "ANMF"; };
     const auto first = std::find_if(chunks.begin(), chunks.end(), isFrame);
     const auto codings = first == chunks.end() ? chunks : chunksOf(first->data, frameHead);

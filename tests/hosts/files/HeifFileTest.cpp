@@ -158,6 +158,12 @@ TEST(HeifFile, KeepsTheCodeOfItsColours) {
     }
     EXPECT_THAT(writePhotograph(readPhotograph(folder / "t.png"), folder / "u.avif"), testing::IsEmpty());
     EXPECT_TRUE(readPhotograph(folder / "u.avif").metadata->colors->looksLike(wanted));
+    // Numbers that nobody knows, between 22 and 255, do not hinder the picture.
+    Photograph odd = readPhotograph(folder / "t.png");
+    Metadata unknown;
+    unknown.colors = ColorCodes{200, 16};
+    odd.metadata = std::make_shared<const Metadata>(unknown);
+    EXPECT_THAT(writePhotograph(odd, folder / "odd.heic"), ElementsAre(HasSubstr("the code of its colours")));
     EXPECT_THAT(writePhotograph(readPhotograph(folder / "s.avif"), folder / "t.jpg"),
                 ElementsAre(HasSubstr("the code of its colours (primaries 9, transfer 16)")));
     EXPECT_THAT(writePhotograph(readPhotograph(folder / "p.avif"), folder / "p.jpg"), testing::IsEmpty());
