@@ -50,6 +50,12 @@ bool hasMakerNote(const Bytes& exif) {
     return found != nullptr && found->find(tiff::MakerNote) != nullptr;
 }
 
+// Of the page that it comes from, if any.
+std::uint64_t storedCompression(const Photograph& photograph, const TiffStorage& storage) {
+    return photograph.tiffPage ? photograph.tiffPage->number(TIFFTAG_COMPRESSION, COMPRESSION_NONE)
+                               : storage.compression;
+}
+
 } // namespace
 
 void checkTarget(const Photograph& photograph, const fs::path& target, const WriteOptions& options) {
@@ -98,10 +104,14 @@ void PhotographWriter::addPage(const Photograph& photograph, PreparedMetadata& p
         } else if (hasMakerNote(metadata.exif)) {
             prepared.lost.emplace_back("what the maker note refers to by its place");
         }
-        if (photograph.copied)
+        if (photograph.copied) {
             mTiff->addCopy(photograph.tiffPage->blocks, copiedFields(*photograph.tiffPage));
-        else
+        } else {
+            if (mOptions.compression.empty() && storage.compression != storedCompression(photograph, storage))
+                prepared.lost.push_back(std::string("its kind of compression (") +
+                                        tiffCompressionName(storage.compression) + " is written)");
             mTiff->addPicture(photograph, storage, pageFields(photograph, metadata, order, prepared.lost));
+        }
     } catch (const TiffError& error) {
         throw PhotographError(mTarget.string() + ": TIFF encoding failed (" + error.what() +
                               "); choose other settings or another format");
