@@ -5,6 +5,7 @@
 #include "files/HeifBoxes.h"
 #include "files/HeifLibrary.h"
 #include "files/HeifRate.h"
+#include "files/Memory.h"
 #include "metadata/ExifBlock.h"
 
 #include <algorithm>
@@ -192,7 +193,7 @@ Bytes encodeHeif(const Photograph& photograph, const fs::path& target, const Wri
         return bytes;
     } catch (const ChildFailure& failure) {
         // The encoder has no words of its own for want of memory.
-        if (isBeyondMemory(kEncoderBytes + photograph.samples.size() / 3 * kEncoderBytesPerPixel))
+        if (kEncoderBytes + photograph.samples.size() / 3 * kEncoderBytesPerPixel > obtainableMemory())
             throw std::bad_alloc();
         throw PhotographError(target.string() + ": HEIF encoding failed (" + failure.what() +
                               "); choose other settings or another format");

@@ -4,6 +4,7 @@
 #include "files/HeifBoxes.h"
 #include "files/HeifLibrary.h"
 #include "files/HeifRate.h"
+#include "files/Memory.h"
 #include "files/Refusal.h"
 
 #include <algorithm>
@@ -121,42 +122,42 @@ void takeCoding(Photograph& photograph, ByteView file) {
         HeifRate{heifSample(photograph), static_cast<double>(coding->bytes) / pixels});
 }
 
-Photograph receive(ChildProcess& child, const fs::path& path, std::uint64_t& pixels) {
+Photograph receive(ChildProcess& child, ByteView file, const fs::path& path, const ReadLimits& limits,
+                   std::uint64_t& pixels) {
     const Head head = child.receive<Head>();
     Photograph photograph;
     photograph.source = path;
     photograph.width = head.width;
     photograph.height = head.height;
-    checkEdges(head.width, head.height, path);
     pixels = static_cast<std::uint64_t>(head.width) * static_cast<std::uint64_t>(head.height);
     if (head.bits < 8 || head.bits > 16)
         refuse(path, "has an unknown number of bits per sample", "save it with 8, 10 or 12 bits");
     photograph.depth = head.bits > 8 ? 16 : 8;
     photograph.model = head.hasAlpha != 0 ? ColorModel::RgbAlpha : ColorModel::Rgb;
+    checkPicture({head.width, head.height, sampleBytes(photograph), file.size()}, path, limits);
     photograph.encoding.format = FileFormat::Heif;
     photograph.encoding.bitDepth = head.bits;
     photograph.iccProfile.resize(head.profileSize);
     child.receive(photograph.iccProfile.data(), head.profileSize);
-    photograph.samples.resize(pixels * static_cast<std::uint64_t>(samplesPerPixel(photograph.model)) *
-                              static_cast<std::uint64_t>(photograph.depth / 8));
+    photograph.samples.resize(pixels * sampleBytes(photograph));
     child.receive(photograph.samples.data(), photograph.samples.size());
     return photograph;
 }
 
 } // namespace
 
-Photograph readHeif(ByteView file, const fs::path& path) {
+Photograph readHeif(ByteView file, const fs::path& path, const ReadLimits& limits) {
     std::uint64_t pixels = 0;
     try {
         ChildProcess child([&](const ChildProcess::Sink& sink) { Decoder(file).send(sink); });
-        Photograph photograph = receive(child, path, pixels);
+        Photograph photograph = receive(child, file, path, limits, pixels);
         takeCoding(photograph, file);
         return photograph;
     } catch (const ChildFailure& failure) {
         // The decoder has no words of its own for want of memory.
-        if (isBeyondMemory(kDecoderBytes + pixels * kDecoderBytesPerPixel))
+        if (kDecoderBytes + pixels * kDecoderBytesPerPixel > obtainableMemory())
             throw std::bad_alloc();
-        refuse(path, std::string("is damaged or cut short (") + failure.what() + ")", kCopyAgain);
+        refuseUnread(path, failure.what());
     }
 }
 

@@ -20,7 +20,7 @@ constexpr int kMostScans = 1000; // programs write some ten; a short file may ho
 
 class Decoder {
 public:
-    Decoder(ByteView file, const fs::path& path) : mPath(path) {
+    Decoder(ByteView file, const fs::path& path) : mFile(file), mPath(path) {
         mJpeg.err = mErrors.manager();
         attempt([&] {
             jpeg_create_decompress(&mJpeg);
@@ -35,7 +35,7 @@ public:
     Decoder(const Decoder&) = delete;
     Decoder& operator=(const Decoder&) = delete;
 
-    void readPicture(Photograph& photograph);
+    void readPicture(Photograph& photograph, const ReadLimits& limits);
     void readProfile(Photograph& photograph);
     Encoding encoding();
 
@@ -44,8 +44,10 @@ private:
     template <typename Work>
     void attempt(const Work& work);
     ColorModel model() const;
+    DeclaredPicture declared() const;
     JpegLayout::Color color() const;
 
+    const ByteView mFile;
     const fs::path& mPath;
     JpegErrors mErrors;
     jpeg_progress_mgr mProgress{};
@@ -72,7 +74,7 @@ void Decoder::attempt(const Work& work) {
     if (mErrors.code() == JERR_BAD_PRECISION || mErrors.code() == JERR_SOF_UNSUPPORTED)
         refuse(mPath, "is a kind of JPEG that cannot be read (" + mErrors.text() + ")",
                "save it as a JPEG of 8 bits or as a TIFF");
-    refuse(mPath, "is damaged or cut short (" + mErrors.text() + ")", kCopyAgain);
+    refuseUnread(mPath, mErrors.text());
 }
 
 ColorModel Decoder::model() const {
@@ -104,11 +106,23 @@ JpegLayout::Color Decoder::color() const {
     }
 }
 
-void Decoder::readPicture(Photograph& photograph) {
+// Each block of 64 pixels takes a bit at least, unless its coding is arithmetic.
+DeclaredPicture Decoder::declared() const {
+    DeclaredPicture picture;
+    picture.width = mJpeg.image_width;
+    picture.height = mJpeg.image_height;
+    picture.sampleBytes = static_cast<std::uint64_t>(samplesPerPixel(model()));
+    picture.fileBytes = mFile.size();
+    if (mJpeg.arith_code == 0)
+        picture.mostPixelsPerByte = 64 * 8;
+    return picture;
+}
+
+void Decoder::readPicture(Photograph& photograph, const ReadLimits& limits) {
+    checkPicture(declared(), mPath, limits);
     photograph.model = model();
     photograph.width = static_cast<int>(mJpeg.image_width);
     photograph.height = static_cast<int>(mJpeg.image_height);
-    checkEdges(photograph.width, photograph.height, mPath);
     const std::size_t row = mJpeg.image_width * static_cast<std::size_t>(samplesPerPixel(photograph.model));
     photograph.samples.resize(row * mJpeg.image_height);
     attempt([&] {
@@ -159,12 +173,12 @@ void Decoder::readProfile(Photograph& photograph) {
 
 } // namespace
 
-Photograph readJpeg(ByteView file, const fs::path& path) {
+Photograph readJpeg(ByteView file, const fs::path& path, const ReadLimits& limits) {
     Photograph photograph;
     photograph.source = path;
     Decoder decoder(file, path);
     decoder.readProfile(photograph);
-    decoder.readPicture(photograph);
+    decoder.readPicture(photograph, limits);
     return photograph;
 }
 

@@ -25,6 +25,12 @@ public:
     using PhotographError::PhotographError;
 };
 
+/// The memory does not suffice: see PhotographError.
+class MemoryError : public PhotographError {
+public:
+    using PhotographError::PhotographError;
+};
+
 /// Reading or writing ended early because it was asked to stop; nothing was left behind.
 class StoppedError : public PhotographError {
 public:

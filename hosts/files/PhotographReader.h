@@ -1,5 +1,6 @@
 #pragma once
 
+#include "files/DeclaredPicture.h"
 #include "files/Photograph.h"
 
 #include <vector>
@@ -11,6 +12,7 @@ class TiffFile;
 
 struct ReadOptions {
     bool firstOnly = false; ///< of an animation or a file of several pages the first picture
+    ReadLimits limits = {}; ///< of each picture
 };
 
 /// Reads a JPEG, PNG, TIFF, WebP, PSD or HEIF file, recognised by its content, page by page: 8 or 16 bits;
@@ -30,9 +32,10 @@ public:
     int pages() const { return mPages; }
 
     /// The next page: at first the first one, at most pages() of them.
-    /// @throws PhotographError when it is cut short or a picture that the filter cannot take: over 32767
-    /// pixels wide or high, more than four channels, floating point samples, Lab and other colour models
-    /// @throws std::bad_alloc when the memory does not suffice
+    /// @throws PhotographError when it is cut short, above the limits, or a picture that the filter cannot
+    ///         take: over 32767 pixels wide or high, more than four channels, floating point samples, Lab and
+    ///         other colour models
+    /// @throws MemoryError, std::bad_alloc when the memory does not suffice
     Photograph next();
 
 private:

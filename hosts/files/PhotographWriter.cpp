@@ -19,18 +19,15 @@ namespace {
 namespace fs = std::filesystem;
 
 FileFormat targetFormat(const Photograph& photograph, const fs::path& target) {
-    const std::optional<FileFormat> format = formatOfExtension(target);
-    if (!format)
-        throw PhotographError(target.string() + ": the extension \"" + target.extension().string() +
-                              "\" names no known format; use .jpg, .png, .tif, .webp or .heic");
-    const std::string obstacle = formatObstacle(*format, photograph);
+    const FileFormat format = writtenFormat(target);
+    const std::string obstacle = formatObstacle(format, photograph);
     if (!obstacle.empty())
         throw PhotographError(target.string() + ": " + obstacle);
-    if (photograph.pages > 1 && *format != FileFormat::Tiff)
-        throw PhotographError(target.string() + ": " + formatName(*format) + " cannot hold the " +
+    if (photograph.pages > 1 && format != FileFormat::Tiff)
+        throw PhotographError(target.string() + ": " + formatName(format) + " cannot hold the " +
                               std::to_string(photograph.pages) + " pages of " + photograph.source.string() +
                               "; choose a TIFF target, or --first-frame for the first page");
-    return *format;
+    return format;
 }
 
 PreparedMetadata metadataFor(const Photograph& photograph, FileFormat target) {
@@ -57,6 +54,16 @@ std::uint64_t storedCompression(const Photograph& photograph, const TiffStorage&
 }
 
 } // namespace
+
+FileFormat writtenFormat(const fs::path& target) {
+    const std::optional<FileFormat> format = formatOfExtension(target);
+    if (!format)
+        throw PhotographError(target.string() + ": the extension \"" + target.extension().string() +
+                              "\" names no known format; use .jpg, .png, .tif, .webp or .heic");
+    if (*format == FileFormat::Psd)
+        throw PhotographError(target.string() + ": " + formatObstacle(*format, {}));
+    return *format;
+}
 
 void checkTarget(const Photograph& photograph, const fs::path& target, const WriteOptions& options) {
     targetFormat(photograph, target);
@@ -99,7 +106,7 @@ void PhotographWriter::addPage(const Photograph& photograph, PreparedMetadata& p
     try {
         const TiffStorage storage = tiffStorage(photograph, mOptions);
         if (!hasBegun()) {
-            mFile = std::make_unique<TargetFile>(mTarget);
+            mFile = std::make_unique<TargetFile>(mTarget, mSource);
             mTiff = std::make_unique<TiffWriter>(*mFile, order, metadata.exif, mOptions.stop);
         } else if (hasMakerNote(metadata.exif)) {
             prepared.lost.emplace_back("what the maker note refers to by its place");
@@ -124,7 +131,7 @@ void PhotographWriter::addEncoded(const Photograph& photograph, PreparedMetadata
     // The library leaves out one that is damaged, or for other colours than the picture's.
     if (metadata.target == FileFormat::Png && !photograph.iccProfile.empty() && !hasPngChunk(encoded, "iCCP"))
         metadata.lost.emplace_back("the ICC profile, which does not suit its colours or is damaged");
-    mFile = std::make_unique<TargetFile>(mTarget);
+    mFile = std::make_unique<TargetFile>(mTarget, mSource);
     mFile->write(encoded, mOptions.stop);
 }
 
@@ -152,8 +159,10 @@ std::string PhotographWriter::prefix(const Note& note) const {
 std::vector<std::string> PhotographWriter::commit() {
     if (mTiff)
         mTiff->finish();
-    mFile->commit(mOptions.overwrite);
     std::vector<std::string> warnings;
+    if (mOptions.keepTime && !mFile->takeTimes(mSource))
+        warnings.push_back(mTarget.string() + ": the time stamps of the photograph could not be kept");
+    mFile->commit(mOptions.overwrite);
     for (const Note& note : mNotes)
         warnings.push_back(prefix(note) + note.text);
     return warnings;

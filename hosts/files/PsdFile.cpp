@@ -35,7 +35,6 @@ Header readHeader(Cursor& cursor, const fs::path& path) {
     header.width = cursor.number(4);
     header.depth = static_cast<int>(cursor.number(2));
     header.mode = static_cast<int>(cursor.number(2));
-    checkEdges(static_cast<std::int64_t>(header.width), static_cast<std::int64_t>(header.height), path);
     if (header.depth == 32)
         refuse(path, "has 32-bit float samples", "convert it to 8 or 16 bits per channel");
     if (header.mode > CMYK)
@@ -136,9 +135,17 @@ ColorModel modelOf(const Header& header) {
     return header.channels == 2 ? ColorModel::GreyAlpha : ColorModel::Grey;
 }
 
-Photograph read(ByteView file, const fs::path& path) {
+// Two bytes of a packed row become at most 128.
+DeclaredPicture declared(const Header& header, ByteView file) {
+    const std::size_t samples = header.mode == Indexed ? 3 : header.channels;
+    return {static_cast<std::int64_t>(header.width), static_cast<std::int64_t>(header.height),
+            samples * (header.depth == 16 ? 2 : 1), file.size(), 64.0 * 8 / header.depth};
+}
+
+Photograph read(ByteView file, const fs::path& path, const ReadLimits& limits) {
     Cursor cursor(file);
     const Header header = readHeader(cursor, path);
+    checkPicture(declared(header, file), path, limits);
     const ByteView palette = cursor.block();
     if (header.mode == Indexed && palette.size() < 768)
         refuse(path, "has a damaged palette", kCopyAgain);
@@ -169,9 +176,9 @@ Photograph read(ByteView file, const fs::path& path) {
 
 } // namespace
 
-Photograph readPsd(ByteView file, const fs::path& path) {
+Photograph readPsd(ByteView file, const fs::path& path, const ReadLimits& limits) {
     try {
-        return read(file, path);
+        return read(file, path, limits);
     } catch (const DamagedBytes&) {
         refuse(path, "the file is cut short", kCopyAgain);
     }

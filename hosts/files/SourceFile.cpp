@@ -17,6 +17,7 @@ namespace {
 
 namespace fs = std::filesystem;
 
+// Without O_NONBLOCK a pipe would be waited for.
 int openFile(const fs::path& path) {
     const int handle = ::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);
     if (handle >= 0)
@@ -32,11 +33,9 @@ std::uint64_t sizeOf(int handle, const fs::path& path) {
     struct stat status {};
     ::fstat(handle, &status);
     if (S_ISDIR(status.st_mode))
-        refuse(path, "is a folder", "name the photographs in it");
+        refuse(path, "is a folder", "name the files in it");
     if (!S_ISREG(status.st_mode))
-        refuse(path, "is not a regular file", "save the photograph to a file first");
-    if (status.st_size == 0)
-        refuse(path, "the file is empty", kCopyAgain);
+        refuse(path, "is not a regular file", "save what it gives to a file first");
     return static_cast<std::uint64_t>(status.st_size);
 }
 

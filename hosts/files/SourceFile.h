@@ -4,10 +4,10 @@
 
 namespace orvela {
 
-/// A photograph's file, open for reading.
+/// A file that is open for reading.
 class SourceFile {
 public:
-    /// @throws PhotographError when the file is missing, empty, no regular file or may not be read
+    /// @throws PhotographError when the file is missing, no regular file or may not be read
     explicit SourceFile(std::filesystem::path path);
     ~SourceFile();
     SourceFile(const SourceFile&) = delete;

@@ -153,7 +153,7 @@ Bytes TiffFile::readRgb(int index) const {
         }
         return rgb;
     } catch (const TiffError& error) {
-        refusePage(index, std::string("cannot be decoded (") + error.what() + ")");
+        refuseUnread(pageName(index), error.what());
     }
 }
 

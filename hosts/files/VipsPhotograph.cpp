@@ -62,17 +62,12 @@ int storeRows(VipsRegion* region, VipsRect* area, void* target) {
 
 } // namespace
 
-void refuseUnread(const fs::path& path) {
-    refuse(path, "is damaged or cut short (" + takeVipsError() + ")", kCopyAgain);
-}
-
 Photograph describeImage(const fs::path& path, VipsImage* image) {
     Photograph photograph;
     photograph.width = vips_image_get_width(image);
     photograph.height = vips_image_get_height(image);
     photograph.model = modelOf(path, image);
     photograph.depth = depthOf(path, image);
-    checkEdges(photograph.width, photograph.height, path);
     takeProfile(photograph, image);
     return photograph;
 }
@@ -80,7 +75,7 @@ Photograph describeImage(const fs::path& path, VipsImage* image) {
 void takeSamples(Photograph& photograph, const fs::path& path, VipsImage* image) {
     photograph.samples.resize(VIPS_IMAGE_SIZEOF_IMAGE(image));
     if (vips_sink_disc(image, storeRows, photograph.samples.data()) != 0)
-        refuseUnread(path);
+        refuseUnread(path, takeVipsError());
 }
 
 } // namespace orvela

@@ -161,8 +161,6 @@ class Judge:
             again = subprocess.run([self.options.program, "enhance", "-d", "out", "--quiet", "--force", name],
                                    cwd=folder, stderr=subprocess.DEVNULL, check=False)
             left = sorted(os.listdir(f"{folder}/out")) if os.path.isdir(f"{folder}/out") else []
-            if number == signal.SIGKILL:  # nothing can clean up after that
-                left = [each for each in left if not each.endswith(".part")]
             if again.returncode != 0 or left != [name]:
                 self.fail(f"signal {number}: the next run ended with {again.returncode} and left {left}")
 
