@@ -1,7 +1,7 @@
 #include "files/PhotographReader.h"
 
-#include "files/Animation.h"
-#include "files/EncodingProbe.h"
+#include "files/CameraRaw.h"
+#include "files/HeifBoxes.h"
 #include "files/HeifReader.h"
 #include "files/JpegReader.h"
 #include "files/PsdFile.h"
@@ -10,6 +10,8 @@
 #include "files/TiffReader.h"
 #include "files/VipsPhotograph.h"
 #include "metadata/MetadataReader.h"
+#include "metadata/PngMetadata.h"
+#include "metadata/WebPMetadata.h"
 
 #include <webp/decode.h>
 
@@ -56,7 +58,7 @@ void checkWebp(const fs::path& path, const Bytes& file, const ReadLimits& limits
 VipsHandle open(const fs::path& path, const Bytes& file, FileFormat format, const ReadLimits& limits) {
     startVips();
     vips_error_clear();
-    if (format == FileFormat::Png && !pngIsComplete(file))
+    if (format == FileFormat::Png && !hasPngChunk(file, "IEND"))
         refuse(path, "the file is cut short", kCopyAgain);
     if (format == FileFormat::WebP)
         checkWebp(path, file, limits);
@@ -72,8 +74,17 @@ Encoding encodingOf(const Bytes& file, FileFormat format) {
     if (format == FileFormat::Png)
         encoding.progressive = file.size() > 28 && file[28] == 1;
     if (format == FileFormat::WebP)
-        encoding.lossless = webpIsLossless(file);
+        encoding.lossless = webpPictures(file).lossless;
     return encoding;
+}
+
+// Depth and kind of colour stand in the first chunk.
+void noteExpansion(Photograph& photograph, const Bytes& png) {
+    constexpr std::uint8_t palette = 3;
+    if (png.size() > 25 && png[25] == palette)
+        photograph.notes.emplace_back(kPaletteNote);
+    else if (png.size() > 25 && png[24] < 8)
+        photograph.notes.emplace_back(kBitsNote);
 }
 
 // Deflate makes at most 1032 bytes of one; the 25th byte tells the bits of a sample.
@@ -90,6 +101,8 @@ Photograph decodeFile(const Bytes& file, FileFormat format, const fs::path& path
                   mostPixelsPerByte(file, format)},
                  path, limits);
     photograph.encoding = encodingOf(file, format);
+    if (format == FileFormat::Png)
+        noteExpansion(photograph, file);
     takeSamples(photograph, path, image.get());
     return photograph;
 }
@@ -99,13 +112,17 @@ void refuseAnimation(const fs::path& path, const char* kind, int frames) {
            "--first-frame enhances the first");
 }
 
+void refuseCameraRaw(const fs::path& path) {
+    refuse(path, "is a camera's raw file", "develop it first, and enhance the TIFF or JPEG that you get");
+}
+
 // How many pictures the file shows one after the other.
 int framesOf(const fs::path& path, const Bytes& file, FileFormat format, bool firstOnly) {
     int frames = 1;
     if (format == FileFormat::Png)
         frames = pngFrames(file);
     if (format == FileFormat::WebP)
-        frames = webpFrames(file);
+        frames = webpPictures(file).frames;
     if (format == FileFormat::Heif) {
         const HeifPictures pictures = heifPictures(file);
         if (pictures.frames > 0 && !pictures.still)
@@ -146,8 +163,10 @@ PhotographReader::PhotographReader(const fs::path& path, const ReadOptions& opti
     : mOptions(options), mFile(std::make_unique<SourceFile>(path)) {
     if (mFile->size() == 0)
         refuse(path, "the file is empty", kCopyAgain);
-    const std::optional<FileFormat> format =
-        formatOfContent(mFile->read(0, std::min<std::uint64_t>(mFile->size(), 16)));
+    const Bytes head = mFile->read(0, std::min<std::uint64_t>(mFile->size(), 16));
+    if (isCameraRaw(head))
+        refuseCameraRaw(path);
+    const std::optional<FileFormat> format = formatOfContent(head);
     if (!format)
         refuse(path, "is not a picture of a known kind",
                "JPEG, PNG, TIFF, WebP, PSD and HEIF files can be read");
@@ -155,6 +174,8 @@ PhotographReader::PhotographReader(const fs::path& path, const ReadOptions& opti
     if (mFormat != FileFormat::Tiff)
         return;
     mTiff = std::make_unique<TiffFile>(*mFile, options.firstOnly ? 1 : TiffFile::kAll);
+    if (mTiff->isCameraRaw())
+        refuseCameraRaw(path);
     mPages = mTiff->pages();
 }
 

@@ -22,8 +22,8 @@ struct ReadOptions {
 /// page; of a PSD the merged picture is read, of a HEIF the primary one.
 class PhotographReader {
 public:
-    /// @throws PhotographError when the file is missing, a folder, empty, unreadable, no picture, an
-    ///         animation (unless asked for its first picture), or a TIFF with a damaged chain of pages
+    /// @throws PhotographError when the file is missing, a folder, empty, unreadable, no picture, a camera's
+    /// raw file, an animation (unless asked for its first picture), or a TIFF with a damaged chain of pages
     explicit PhotographReader(const std::filesystem::path& path, const ReadOptions& options = {});
     ~PhotographReader();
     PhotographReader(const PhotographReader&) = delete;

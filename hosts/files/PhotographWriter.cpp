@@ -8,6 +8,7 @@
 #include "files/TiffFields.h"
 #include "files/TiffWriter.h"
 #include "metadata/MetadataWriter.h"
+#include "metadata/PngMetadata.h"
 
 #include <algorithm>
 
@@ -30,9 +31,9 @@ FileFormat targetFormat(const Photograph& photograph, const fs::path& target) {
 }
 
 PreparedMetadata metadataFor(const Photograph& photograph, FileFormat target) {
-    PreparedMetadata metadata =
-        prepareMetadata(photograph.metadata ? *photograph.metadata : Metadata(), target,
-                        {photograph.width, photograph.height, thumbnailsOf(photograph)});
+    PreparedMetadata metadata = prepareMetadata(
+        photograph.metadata ? *photograph.metadata : Metadata(), target,
+        {photograph.width, photograph.height, thumbnailsOf(photograph), !photograph.iccProfile.empty()});
     metadata.lost.insert(metadata.lost.end(), photograph.unheld.begin(), photograph.unheld.end());
     return metadata;
 }
@@ -44,6 +45,12 @@ bool hasMakerNote(const Bytes& exif) {
     const ExifDirectories directories = exifDirectories(view, view.first());
     const TagDirectory* found = directories.find(tiff::ExifIfd);
     return found != nullptr && found->find(tiff::MakerNote) != nullptr;
+}
+
+// Of the page that it comes from, if any.
+std::uint64_t storedCompression(const Photograph& photograph, const TiffStorage& storage) {
+    return photograph.tiffPage ? photograph.tiffPage->number(TIFFTAG_COMPRESSION, COMPRESSION_NONE)
+                               : storage.compression;
 }
 
 } // namespace
@@ -104,10 +111,14 @@ void PhotographWriter::addPage(const Photograph& photograph, PreparedMetadata& p
         } else if (hasMakerNote(metadata.exif)) {
             prepared.lost.emplace_back("what the maker note refers to by its place");
         }
-        if (photograph.copied)
+        if (photograph.copied) {
             mTiff->addCopy(photograph.tiffPage->blocks, copiedFields(*photograph.tiffPage));
-        else
+        } else {
+            if (mOptions.compression.empty() && storage.compression != storedCompression(photograph, storage))
+                prepared.lost.push_back(std::string("its kind of compression (") +
+                                        tiffCompressionName(storage.compression) + " is written)");
             mTiff->addPicture(photograph, storage, pageFields(photograph, metadata, order, prepared.lost));
+        }
     } catch (const TiffError& error) {
         throw PhotographError(mTarget.string() + ": TIFF encoding failed (" + error.what() +
                               "); choose other settings or another format");
@@ -117,6 +128,9 @@ void PhotographWriter::addPage(const Photograph& photograph, PreparedMetadata& p
 void PhotographWriter::addEncoded(const Photograph& photograph, PreparedMetadata& metadata) {
     Bytes encoded = encodePhotograph(photograph, metadata.target, mTarget, mOptions, metadata.metadata);
     embedMetadata(metadata, encoded);
+    // The library leaves out one that is damaged, or for other colours than the picture's.
+    if (metadata.target == FileFormat::Png && !photograph.iccProfile.empty() && !hasPngChunk(encoded, "iCCP"))
+        metadata.lost.emplace_back("the ICC profile, which does not suit its colours or is damaged");
     mFile = std::make_unique<TargetFile>(mTarget, mSource);
     mFile->write(encoded, mOptions.stop);
 }

@@ -39,6 +39,10 @@ std::uint64_t sizeOf(int handle, const fs::path& path) {
     return static_cast<std::uint64_t>(status.st_size);
 }
 
+[[noreturn]] void refuseShorter(const fs::path& path) {
+    refuse(path, "the file became shorter while it was read", "try again when it is complete");
+}
+
 } // namespace
 
 SourceFile::SourceFile(fs::path path) : mPath(std::move(path)), mHandle(openFile(mPath)) {
@@ -66,7 +70,7 @@ Bytes SourceFile::read(std::uint64_t at, std::uint64_t size) const {
         if (got < 0)
             refuse(mPath, std::string("cannot be read (") + std::strerror(errno) + ")", "check the disk");
         if (got == 0)
-            refuse(mPath, "the file became shorter while it was read", "try again when it is complete");
+            refuseShorter(mPath);
         done += static_cast<std::size_t>(got);
     }
     return bytes;
@@ -79,6 +83,10 @@ ByteView SourceFile::view() {
             throw std::bad_alloc();
         mView = view;
     }
+    // What the file does not hold any more must not be looked at: the system would end the program.
+    struct stat status {};
+    if (::fstat(mHandle, &status) != 0 || static_cast<std::uint64_t>(status.st_size) < mSize)
+        refuseShorter(mPath);
     return {static_cast<const std::uint8_t*>(mView), mSize};
 }
 

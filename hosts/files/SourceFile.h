@@ -23,9 +23,9 @@ public:
     /// @throws PhotographError when the disk fails or the file became shorter
     Bytes read(std::uint64_t at, std::uint64_t size) const;
 
-    /// The whole file in the address space, as long as this object lives. Memory is taken by what is looked
-    /// at only, and can be taken back.
-    /// @throws std::bad_alloc
+    /// The whole file in the address space, to be looked at at once. Memory is taken by what is looked at
+    /// only, and can be taken back.
+    /// @throws PhotographError when the file became shorter; std::bad_alloc
     ByteView view();
 
 private:

@@ -108,10 +108,13 @@ Photograph decodeWithVips(const SourceFile& file, const TiffPage& page, const fs
         refuseUnread(name, takeVipsError());
     Photograph photograph = describeImage(name, image.get());
     takeSamples(photograph, name, image.get());
+    photograph.extraChannel =
+        hasAlpha(photograph.model) &&
+        page.number(TIFFTAG_EXTRASAMPLES, EXTRASAMPLE_UNSPECIFIED) == EXTRASAMPLE_UNSPECIFIED;
     if (page.number(TIFFTAG_PHOTOMETRIC, PHOTOMETRIC_MINISBLACK) == PHOTOMETRIC_PALETTE)
-        photograph.notes.emplace_back("its palette was resolved");
+        photograph.notes.emplace_back(kPaletteNote);
     else if (page.number(TIFFTAG_BITSPERSAMPLE, 1) < 8)
-        photograph.notes.emplace_back("its samples were expanded to 8 bits");
+        photograph.notes.emplace_back(kBitsNote);
     return photograph;
 }
 

@@ -62,20 +62,6 @@ int storeRows(VipsRegion* region, VipsRect* area, void* target) {
 
 } // namespace
 
-std::string textField(VipsImage* image, const char* name) {
-    const char* text = nullptr;
-    if (vips_image_get_typeof(image, name) == 0 || vips_image_get_string(image, name, &text) != 0)
-        return {};
-    return text;
-}
-
-int numberField(VipsImage* image, const char* name) {
-    int value = 0;
-    if (vips_image_get_typeof(image, name) != 0)
-        vips_image_get_int(image, name, &value);
-    return value;
-}
-
 Photograph describeImage(const fs::path& path, VipsImage* image) {
     Photograph photograph;
     photograph.width = vips_image_get_width(image);

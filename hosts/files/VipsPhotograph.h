@@ -7,10 +7,6 @@
 
 namespace orvela {
 
-/// A field of the image; empty or 0 when it is missing.
-std::string textField(VipsImage* image, const char* name);
-int numberField(VipsImage* image, const char* name);
-
 /// Size, colour model, depth and profile of the image.
 /// @param path  for messages
 /// @throws PhotographError when the filter cannot take such a picture
