@@ -5,6 +5,7 @@
 #include "metadata/PsdMetadata.h"
 
 #include <algorithm>
+#include <limits>
 
 namespace orvela {
 
@@ -125,6 +126,28 @@ void expandBits(const Bytes& plane, const Header& header, Photograph& photograph
         }
 }
 
+// The colours of a merged picture are mixed with white as far as it is transparent. Some programs do not mix
+// them, which shows where one is darker than its share of white.
+template <typename Sample>
+void takeWhiteOut(Photograph& photograph) {
+    constexpr std::int64_t full = std::numeric_limits<Sample>::max();
+    const auto channels = static_cast<std::size_t>(samplesPerPixel(photograph.model));
+    auto* samples = reinterpret_cast<Sample*>(photograph.samples.data());
+    const std::size_t count = photograph.samples.size() / sizeof(Sample);
+    const auto alphaOf = [&](std::size_t i) {
+        return std::int64_t{samples[i - i % channels + channels - 1]};
+    };
+    for (std::size_t i = 0; i < count; ++i)
+        if (samples[i] + alphaOf(i) < full - 1 && i % channels < channels - 1)
+            return;
+    for (std::size_t i = 0; i < count; ++i) {
+        const std::int64_t alpha = alphaOf(i);
+        const std::int64_t colour = std::max<std::int64_t>(samples[i] + alpha - full, 0);
+        if (alpha > 0 && i % channels < channels - 1)
+            samples[i] = static_cast<Sample>((colour * full + alpha / 2) / alpha);
+    }
+}
+
 ColorModel modelOf(const Header& header) {
     if (header.mode == CMYK)
         return ColorModel::Cmyk;
@@ -171,6 +194,9 @@ Photograph read(ByteView file, const fs::path& path, const ReadLimits& limits) {
     } else {
         interleave(planes, header, photograph);
     }
+    if (hasAlpha(photograph.model) && layers.transparency)
+        photograph.depth == 16 ? takeWhiteOut<std::uint16_t>(photograph)
+                               : takeWhiteOut<std::uint8_t>(photograph);
     return photograph;
 }
 

@@ -82,6 +82,37 @@ TEST(Conversion, TakesNoSelectionForTransparency) {
                 ElementsAre(EndsWith("hold: the layers; 18 bytes behind the picture")));
 }
 
+// The reds of four pixels in a PSD whose other colours are white.
+std::vector<int> redsOfPsd(const TestFolder& folder, int depth, const std::string& reds,
+                           const std::string& alphas) {
+    folder.run(
+        "python3 -c \"import struct\nplanes = [" + reds + "] + [255] * 8 + [" + alphas +
+        "]\nlayers = struct.pack('>IhI', 2, -1, 0)\nopen('s.psd', 'wb').write(b'8BPS' + "
+        "struct.pack('>H6xHIIHH', 1, 4, 1, 4, " +
+        std::to_string(depth) +
+        ", 3) + bytes(8) + struct.pack('>I', len(layers)) + layers + bytes(2) + bytes(x for p in planes "
+        "for x in [p] * " +
+        std::to_string(depth / 8) + "))\"");
+    const Photograph photograph = readPhotograph(folder / "s.psd");
+    std::vector<int> found; // both bytes of 16 bits are the same
+    for (std::size_t at = 0; at < photograph.samples.size(); at += photograph.samples.size() / 4)
+        found.push_back(photograph.samples[at]);
+    return found;
+}
+
+// A fifth of the colour 50 over white is 50 / 5 + 255 * 4 / 5 = 214. Opaque colours are as they stand, and
+// invisible ones stay, too. A colour of 100 over a fifth of transparency, with at least 204 of white, was not
+// mixed.
+TEST(Conversion, TakesWhiteOutOfTransparentColoursOfPsd) {
+    const TestFolder folder;
+    for (const int depth : {8, 16}) {
+        EXPECT_THAT(redsOfPsd(folder, depth, "214, 204, 7, 255", "51, 51, 255, 0"),
+                    ElementsAre(50, 0, 7, 255));
+        EXPECT_THAT(redsOfPsd(folder, depth, "214, 100, 7, 255", "51, 51, 255, 0"),
+                    ElementsAre(214, 100, 7, 255));
+    }
+}
+
 TEST(Conversion, IsToldInOneLine) {
     const TestFolder folder;
     folder.run("vips bandjoin \"$S/coffee.png $S/coffee.png[]\" j.v && vips extract_band j.v k.v 0 --n 4 && "
