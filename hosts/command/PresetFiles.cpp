@@ -15,6 +15,7 @@ namespace {
 namespace fs = std::filesystem;
 
 constexpr std::uintmax_t kMostBytes = 4'000'000;
+constexpr std::uintmax_t kMostStoreBytes = 100'000'000; // some 25 000 presets
 
 } // namespace
 
@@ -48,9 +49,9 @@ void write(const PresetFile& preset, const std::string& path, bool overwrite) {
 void checkStore() {
     const fs::path store = settingsPath().toStdString();
     std::error_code none;
-    const bool isLarge = fs::is_regular_file(store, none) && fs::file_size(store, none) > kMostBytes;
+    const bool isLarge = fs::is_regular_file(store, none) && fs::file_size(store, none) > kMostStoreBytes;
     if (isLarge || fs::is_other(store, none))
-        throw PresetError(store.string() + ": is not a settings file of at most 4 MB; move it away");
+        throw PresetError(store.string() + ": is not a settings file of at most 100 MB; move it away");
 }
 
 std::optional<CSliderParams> stored(EGUIMode mode, const QString& name) {
