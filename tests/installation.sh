@@ -5,20 +5,29 @@ cmake=$1 source=$2 build=$3
 scratch=$(mktemp -d)
 export HOME=$scratch XDG_CONFIG_HOME=$scratch/config
 
-# The build folder keeps the record of an installation that its owner made.
-keep() { for file in install_manifest.txt install_folders.txt; do [ ! -e "$1/$file" ] || mv "$1/$file" "$2"; done; }
-keep "$build" "$scratch"
-finish() { rm -f "$build"/install_{manifest,folders}.txt && keep "$scratch" "$build" && rm -r "$scratch"; }
-trap finish EXIT
+trap 'rm -r "$scratch"' EXIT
 
 fail() { echo "FAILED: $*" >&2 && exit 1; }
 expect() { [ "$2" = "$3" ] || fail "$1: \"$2\" instead of \"$3\""; }
 
+for shell in bash zsh fish; do command -v $shell >/dev/null || fail "$shell is missing; packages.txt lists what tests need"; done
+
+# The build folder keeps the record of its owner's installation: what is done here is recorded in a copy of its scripts.
+records=$scratch/records
+(cd "$build" && find . -name cmake_install.cmake -exec cp --parents -t "$(mkdir -p "$records" && echo "$records")" {} +)
+find "$records" -type f -exec sed -i -E "s#\"$build/(.*cmake_install.cmake|\\$\{CMAKE_INSTALL_MANIFEST\})\"#\"$records/\1\"#" {} +
+owned() { stat -c '%n %Y %i' "$build"/install_*.txt 2>/dev/null || :; }
+before=$(owned)
+install_to() { "$cmake" --install "$records" --prefix "$1" >"$scratch/log"; }
+uninstalling=$(ninja -C "$build" -t commands uninstall | tail -n 1)
+[[ $uninstalling == "cd $build && "* ]] || fail "uninstalling goes by \"$uninstalling\""
+uninstall() { sh -c "cd '$records' && ${uninstalling#*&& }" >"$scratch/log" 2>&1; }
+
 prefix=$scratch/prefix
 mkdir -p "$prefix/share/man" && echo mine >"$prefix/share/mine"
 find "$prefix" | sort >"$scratch/before"
-"$cmake" --install "$build" --prefix "$prefix" >"$scratch/log"
-"$cmake" --install "$build" --prefix "$prefix" >"$scratch/log" # once more: as it was
+install_to "$prefix"
+install_to "$prefix" # once more: as it was
 export PATH=$prefix/bin:$PATH
 share=$prefix/share
 
@@ -88,15 +97,28 @@ cd /
 
 # Removing leaves what was there, also what somebody else put into a folder of it meanwhile.
 echo mine >"$share/orvela/samples/mine"
-"$cmake" --build "$build" --target uninstall >"$scratch/log"
+uninstall || fail "$(cat "$scratch/log")"
 expect "what is left" "$(find "$share/orvela" -type f)" "$share/orvela/samples/mine"
 rm -r "$share/orvela"
 find "$prefix" | sort | diff "$scratch/before" - || fail "the prefix before (<) and after (>)"
-"$cmake" --build "$build" --target uninstall >"$scratch/log" 2>&1 && fail "nothing was there to remove"
+uninstall && fail "nothing was there to remove"
 grep -q "Nothing was installed" "$scratch/log" || fail "$(cat "$scratch/log")"
 
-# A package is made below DESTDIR, whatever the prefix.
-DESTDIR=$scratch/package "$cmake" --install "$build" --prefix /usr >"$scratch/log"
-test -x "$scratch/package/usr/bin/orvela" || fail "DESTDIR does not count"
-DESTDIR=$scratch/package "$cmake" --build "$build" --target uninstall >"$scratch/log"
-test ! -e "$scratch/package" || fail "$(find "$scratch/package")"
+# Brackets in a path and what looks like a refusal of CMake are names like others.
+for odd in "$scratch/[odd" "$scratch/[a-c]" "$scratch/a-NOTFOUND"; do
+    install_to "$odd"
+    echo mine >"$odd/share/orvela/samples/mine-NOTFOUND"
+    uninstall || fail "$(cat "$scratch/log")"
+    expect "what is left" "$(find "$odd" -type f)" "$odd/share/orvela/samples/mine-NOTFOUND"
+done
+
+# A package is made below DESTDIR, whatever the prefix; removing it needs no DESTDIR and leaves the prefix itself alone.
+mkdir -p "$scratch/system/bin" && echo mine >"$scratch/system/bin/orvela"
+for package in "$scratch/package" package; do
+    (cd "$scratch" && DESTDIR=$package install_to "$scratch/system")
+    test -x "$scratch/package$scratch/system/bin/orvela" || fail "DESTDIR does not count"
+    uninstall || fail "$(cat "$scratch/log")"
+    test ! -e "$scratch/package" || fail "$(find "$scratch/package")"
+    expect "the system's file" "$(cat "$scratch/system/bin/orvela")" "mine"
+done
+expect "the owner's record" "$(owned)" "$before"
