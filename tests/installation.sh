@@ -86,13 +86,55 @@ for values in "$(taken --chroma enhance none.png)" "$(taken --compression enhanc
         tr '\n' ' ' <"$script" | sed 's/\\n/ /g' | grep -q "[^a-z]$values[^a-z]" || fail "$script lacks \"$values\""
     done
 done
-if command -v zsh >/dev/null; then zsh -n "$share/zsh/site-functions/_orvela"; fi
-if command -v fish >/dev/null; then
-    complete() { fish -c 'source $argv[1]; complete -C $argv[2]' "$share/fish/vendor_completions.d/orvela.fish" "$1" | cut -f1 | xargs; }
-    expect "modes in fish" "$(complete 'orvela enhance --mode Portrait')" "Portrait PortraitPro"
-    expect "final touch in fish" "$(complete 'orvela enhance --final-touch AbsContrast=3,AbsB')" "AbsContrast=3,AbsBrightness="
-    expect "options in fish" "$(complete 'orvela enhance --qua')" "--quality"
-fi
+
+# Real shells complete a typed line. complete_in_SHELL LINE: the words it has then, or what is offered.
+zsh -n "$share/zsh/site-functions/_orvela"
+mkdir "$scratch/typing" && cd "$scratch/typing"
+typed() { printf '%s\t\001printf "%%s|" \005 >out' "$1"; } # completes, goes to the start of the line and to its end
+complete_in_bash() {
+    printf '. "%s"\n%s\nexit\n' "$share/bash-completion/completions/orvela" "$(typed "orvela $1")" |
+        TERM=xterm bash --norc -i >"$scratch/log" 2>&1
+    cut -d'|' -f2- out
+}
+complete_in_zsh() {
+    zsh -f -c 'zmodload zsh/zpty && zpty shell zsh -f -i
+        zpty -w shell "fpath=($1 \$fpath); autoload -Uz compinit; compinit -u -D; bindkey -e; PS1=READY; echo LOADED"
+        zpty -r shell output $'\''*\nLOADED*READY*'\''
+        zpty -w -n shell "$2"$'\''\rexit\r'\''
+        zpty -r shell output "*NEVER*" || :' zsh "$share/zsh/site-functions" "$(typed "orvela $1")" >"$scratch/log" 2>&1
+    cut -d'|' -f2- out
+}
+complete_in_fish() { fish -c 'source $argv[1]; complete -C $argv[2]' "$share/fish/vendor_completions.d/orvela.fish" "orvela $1" | cut -f1 | paste -sd'|'; }
+
+orvela enhance --mode Saturation --value 5 --save-preset "$scratch/look.json"
+for name in 'My Look' '$(touch PWNED)'; do orvela presets import "$scratch/look.json" "$name"; done
+orvela presets import --mode Adjustments "$scratch/look.json" Mine
+for shell in bash zsh; do
+    complete=complete_in_$shell
+    expect "blank in $shell" "$($complete 'presets remove My')" "presets|remove|My Look|"
+    expect "blank in a quoted word in $shell" "$($complete 'enhance --preset "My L')" "enhance|--preset|My Look|"
+    expect "shell code in $shell" "$($complete 'presets export \$')" 'presets|export|$(touch PWNED)|'
+    expect "quoted shell code in $shell" "$($complete 'presets export "\$')" 'presets|export|$(touch PWNED)|'
+    expect "mode behind = in $shell" "$($complete 'enhance --mode=PortraitP')" "enhance|--mode=PortraitPro|"
+    expect "preset of a mode in $shell" "$($complete 'presets remove --mode Adjustments M')" "presets|remove|--mode|Adjustments|Mine|"
+    expect "preset of a mode for enhance in $shell" "$($complete 'enhance --mode=Adjustments --preset=M')" \
+        "enhance|--mode=Adjustments|--preset=Mine|"
+    expect "preset for a mode without in $shell" "$($complete 'enhance --mode Macro --preset M')" "enhance|--mode|Macro|--preset|My Look|"
+    expect "final touch has presets in $shell" "$($complete 'presets list --mode FinalT')" "presets|list|--mode|FinalTouch|"
+    expect "final touch is no mode in $shell" "$($complete 'enhance --mode FinalT')" "enhance|--mode|FinalT|"
+    rm out
+done
+expect "modes in fish" "$(complete_in_fish 'enhance --mode Portrait')" "Portrait|PortraitPro"
+expect "mode behind = in fish" "$(complete_in_fish 'enhance --mode=PortraitP')" "--mode=PortraitPro"
+expect "final touch in fish" "$(complete_in_fish 'enhance --final-touch AbsContrast=3,AbsB')" "AbsContrast=3,AbsBrightness="
+expect "options in fish" "$(complete_in_fish 'enhance --qua')" "--quality"
+expect "presets in fish" "$(complete_in_fish 'presets remove ')" '$(touch PWNED)|My Look'
+expect "preset of a mode in fish" "$(complete_in_fish 'presets remove --mode Adjustments ')" "Mine"
+expect "preset of a mode for enhance in fish" "$(complete_in_fish 'enhance --mode=Adjustments --preset=')" "--preset=Mine"
+expect "preset for a mode without in fish" "$(complete_in_fish 'enhance --mode Macro --preset ')" '$(touch PWNED)|My Look'
+expect "final touch has presets in fish" "$(complete_in_fish 'presets list --mode FinalT')" "FinalTouch"
+expect "final touch is no mode in fish" "$(complete_in_fish 'enhance --mode FinalT')" ""
+expect "what completing ran" "$(ls)" ""
 cd /
 
 # Removing leaves what was there, also what somebody else put into a folder of it meanwhile.
