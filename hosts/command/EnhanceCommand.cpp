@@ -209,9 +209,16 @@ void refuseOverlap(const EnhanceOptions& options, const std::vector<Job>& jobs) 
         throw UsageError(*options.log + ": is a photograph, a result or a preset; name another file");
 }
 
+// A pipe is opened once somebody reads it, for which a signal does not wait; a file would be left
+// half-written.
+void leaving(const std::string& file, StopSignals& signals, const std::function<void()>& write) {
+    std::optional<StopAction> leave;
+    if (isStream(file))
+        leave.emplace(signals, [&signals] { signals.leave(); });
+    write();
+}
+
 void savePreset(const EnhanceOptions& options, const RunSettings& settings) {
-    if (!options.savePreset)
-        return;
     static_cast<void>(PresetFiles::toWriteInto(*options.savePreset, options.writing.overwrite));
     PresetFiles::write(settings.preset, *options.savePreset, options.writing.overwrite);
 }
@@ -273,11 +280,11 @@ ExitStatus enhancePhotographs(const EnhanceOptions& options, StopSignals& signal
     std::signal(SIGPIPE, SIG_IGN); // nobody reads the log any more: no reason to leave the photographs
     std::optional<LogFile> log;
     try {
-        // A pipe is opened once somebody reads it, for which a signal does not wait.
-        const StopAction leave(signals, [&signals] { signals.leave(); });
-        savePreset(options, settings);
+        if (options.savePreset)
+            leaving(*options.savePreset, signals, [&] { savePreset(options, settings); });
         if (options.log)
-            log.emplace(*options.log, options.writing.overwrite, signals.stopRequested());
+            leaving(*options.log, signals,
+                    [&] { log.emplace(*options.log, options.writing.overwrite, signals.stopRequested()); });
     } catch (const std::runtime_error& error) { // of a preset or of a target
         return targetTrouble(error.what());
     }
