@@ -2,8 +2,8 @@
 #include "GUI/Controls/CColorPickerPopup.h"
 #include "GUI/Controls/COrvelaSliderBlockImpl.h"
 #include "GUI/Controls/COrvelaStatusIndicator.h"
-#include "GUI/Controls/CSignaledGraphicsView.h"
-#include "GUI/Controls/PreviewScene.h"
+#include "GUI/Preview/CSignaledGraphicsView.h"
+#include "GUI/Preview/PreviewScene.h"
 #include "Shots.h"
 #include "Utility/CARGBPlane.h"
 

@@ -1,4 +1,4 @@
-#include "GUI/Controls/PreviewScene.h"
+#include "GUI/Preview/PreviewScene.h"
 
 #include "support/TestPlanes.h"
 

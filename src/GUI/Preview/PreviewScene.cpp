@@ -1,6 +1,6 @@
-#include "GUI/Controls/PreviewScene.h"
+#include "GUI/Preview/PreviewScene.h"
 
-#include "GUI/Controls/CGridCell.h"
+#include "GUI/Preview/CGridCell.h"
 
 #include <QGraphicsRectItem>
 #include <QGraphicsScene>

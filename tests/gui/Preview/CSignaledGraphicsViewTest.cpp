@@ -1,4 +1,4 @@
-#include "GUI/Controls/CSignaledGraphicsView.h"
+#include "GUI/Preview/CSignaledGraphicsView.h"
 
 #include <QGraphicsScene>
 #include <QScrollBar>
