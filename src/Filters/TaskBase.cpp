@@ -46,6 +46,10 @@ TaskBase::TaskBase(const RunContext& context, CUserParams* params, CARGBPlane* i
     : mContext(context), mParams(params), mInPlane(inPlane),
       mVertEnd(inPlane ? static_cast<std::uint32_t>(inPlane->height()) : 0) {}
 
+std::int32_t TaskBase::picturePixels() const {
+    return mContext.excerpt ? mContext.excerpt->picturePixels : mInPlane->pixelCount();
+}
+
 bool TaskBase::Apply() {
     guarded([this] { return runPhases() ? TaskOutcome::Applied : TaskOutcome::Skipped; });
     if (mOutcome != TaskOutcome::Applied && mPassBegun)
