@@ -7,6 +7,8 @@ class CARGBPlaneProxy;
 
 namespace orvela {
 
+class MeasurementTape;
+
 /// What a run over a part or a reduced copy of a picture stands for.
 struct Excerpt {
     std::int32_t picturePixels = 0; ///< of the whole picture
@@ -23,6 +25,8 @@ struct RunContext {
     bool dumpsPictures = false;
     /// None for a run over a whole picture.
     std::optional<Excerpt> excerpt;
+    /// Recorded by a run over a whole picture, played by one over an excerpt; null for neither.
+    MeasurementTape* tape = nullptr;
 };
 
 } // namespace orvela

@@ -128,6 +128,8 @@ protected:
     /// Works through the bands of the indices from mVertStart, (mVertEnd - mVertStart) / mVertStep of them;
     /// the row of index i is i * mVertStep. A range that ends before it starts is empty.
     bool DoApplyParallel();
+    /// Does a measurement that leaves histograms in the parameters, or takes what it found from the tape.
+    void measured(const std::function<void()>& measure);
     /// Number of pixels of the whole picture, which thresholds grow with.
     std::int32_t picturePixels() const;
     /// The index after the last one of the pass.
