@@ -36,6 +36,7 @@ void CThreadedCore::setParams(const CUserParamsPhotoshop& params) {
 void CThreadedCore::run() {
     const LogDepth ownDepth;
     mContext.dumpsPictures =
+        !mContext.excerpt &&
         openSettings().value(PresetTree::guiKey(QStringLiteral("dumpImageAfterFile"))).toInt() != 0;
     mTotalSteps = 0;
     mCurrentStep = 0;

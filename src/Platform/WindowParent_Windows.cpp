@@ -1,12 +1,12 @@
 #include "Platform/WindowParent.h"
 
-#include <QWidget>
+#include <QWindow>
 
 #include <windows.h>
 
 namespace orvela {
 
-void setHostParent(QWidget& window, void* hostWindow) {
+void setHostParent(QWindow& window, void* hostWindow) {
     ::SetParent(reinterpret_cast<HWND>(window.winId()), static_cast<HWND>(hostWindow));
 }
 

@@ -22,7 +22,7 @@ void PreviewPicture::show(const CARGBPlane& picture) {
     hangCurtain();
 }
 
-void PreviewPicture::showPart(std::unique_ptr<CARGBPlane> part, const QRect& area) {
+void PreviewPicture::showPart(std::shared_ptr<const CARGBPlane> part, const QRect& area) {
     dropPart();
     if (part->pixelCount() == 0)
         return;

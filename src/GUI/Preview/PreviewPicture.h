@@ -28,7 +28,7 @@ public:
     /// Shows a part over the picture until the next one is shown.
     /// @param part  the area's pixels, reduced or not
     /// @param area  in pixels of the picture
-    void showPart(std::unique_ptr<CARGBPlane> part, const QRect& area);
+    void showPart(std::shared_ptr<const CARGBPlane> part, const QRect& area);
 
     /// What is compared with; null for nothing.
     void setBefore(std::shared_ptr<const CARGBPlane> before);
@@ -44,7 +44,7 @@ private:
 
     QGraphicsScene mScene;
     std::shared_ptr<const CARGBPlane> mPlane;
-    std::unique_ptr<CARGBPlane> mPart;
+    std::shared_ptr<const CARGBPlane> mPart;
     QGraphicsItem* mPartItem = nullptr;
     std::shared_ptr<const CARGBPlane> mBefore;
     CompareCurtain* mCurtain = nullptr; ///< owned by the scene

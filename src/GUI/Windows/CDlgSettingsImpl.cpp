@@ -2,6 +2,7 @@
 
 #include "Core/CThreadedCore.h"
 #include "GUI/Controls/COrvelaSliderBlockImpl.h"
+#include "GUI/Controls/CThinHorizontalSlider.h"
 #include "GUI/Panes/CWgtPane3SlidersImpl.h"
 #include "GUI/Panes/CWgtPaneAdvancedImpl.h"
 #include "GUI/Panes/CWgtPaneFinalTouchImpl.h"
@@ -9,6 +10,7 @@
 #include "GUI/Presets/CBatchMode.h"
 #include "GUI/Presets/CPresetStore.h"
 #include "GUI/Preview/CSignaledGraphicsView.h"
+#include "GUI/Preview/DraftRunner.h"
 #include "GUI/Windows/FlatButtons.h"
 #include "GUI/Windows/Previews.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
@@ -174,6 +176,12 @@ void CDlgSettingsImpl::makePreviews() {
                 [this, view](int notches, QPoint at) { mPreviews->zoomAround(view, notches, at); });
     }
     connect(mPreviews.get(), &Previews::zoomChanged, lblZoomLevel, &QLabel::setText);
+    mDrafts = std::make_unique<DraftRunner>();
+    connect(mDrafts.get(), &DraftRunner::done, this,
+            [this](const std::shared_ptr<CARGBPlane>& draft, const QRect& area) {
+                if (!mRunning)
+                    mPreviews->showDraft(draft, area);
+            });
 }
 
 void CDlgSettingsImpl::changeMode(EGUIMode mode) {
@@ -212,6 +220,8 @@ void CDlgSettingsImpl::makePane(EGUIMode mode) {
     mPane = newPane(this, mode);
     connect(mPane, &IWgtPane::changeMode, this, &CDlgSettingsImpl::changeMode);
     centralLayout->addWidget(mPane);
+    for (const CThinHorizontalSlider* slider : mPane->findChildren<CThinHorizontalSlider*>())
+        connect(slider, &CThinHorizontalSlider::valueChanged, this, &CDlgSettingsImpl::sliderMoves);
     enableProfiling(mPane->showsPresets());
     chkBxAutoRefresh->setChecked(mPane->autoRefresh());
     btnRefresh->setVisible(!mUpToDate);
@@ -223,6 +233,7 @@ void CDlgSettingsImpl::makeCore() {
     if (mCore)
         mCore->deleteLater();
     mCore = nullptr;
+    mWholeTape.reset(); // of another picture
     prepareInput();
     mCore = mPane->createCore(mInPlane, mOutPlane, this);
     connect(mCore, &CThreadedCore::started, this, &CDlgSettingsImpl::onMy_thrdCore_started);
@@ -238,6 +249,8 @@ void CDlgSettingsImpl::prepareInput() {
     if (!mPreviews)
         return;
     showing([this] {
+        if (mPane->takesProcessedImage())
+            mOriginalCopy = mPreviews->originalCopy(); // of the pane before
         mPreviews->showOriginal(*mInPlane);
         mPreviews->showProcessed(*mInPlane);
     });

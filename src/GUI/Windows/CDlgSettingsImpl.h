@@ -16,8 +16,10 @@ class CThreadedCore;
 class IWgtPane;
 
 namespace orvela {
+class DraftRunner;
+class MeasurementTape;
 class Previews;
-}
+} // namespace orvela
 
 /// The window in which a mode runs: the sliders of the mode, previews of the original and the processed
 /// picture, presets, progress. Automatic modes, custom presets and batch replays run in it too, as progress
@@ -108,6 +110,8 @@ private:
 
     // CDlgSettingsRuns.cpp
     void settingsChanged();
+    void sliderMoves();
+    void requestDraft();
     void startTimer();
     void runCore();
     void runEnded();
@@ -124,6 +128,10 @@ private:
     IWgtPane* mPane = nullptr;
     CThreadedCore* mCore = nullptr;
     std::unique_ptr<orvela::Previews> mPreviews; ///< none without dialogue
+    std::unique_ptr<orvela::DraftRunner> mDrafts;
+    std::shared_ptr<const CARGBPlane> mOriginalCopy;     ///< for drafts
+    std::shared_ptr<orvela::MeasurementTape> mTape;      ///< of the run under way
+    std::shared_ptr<orvela::MeasurementTape> mWholeTape; ///< of the last whole run
     QTimer mRefreshTimer;
     std::function<void(const QString&)> mOpenPage;
 

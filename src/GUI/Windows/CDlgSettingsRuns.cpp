@@ -2,6 +2,7 @@
 #include "Core/CThreadedCore.h"
 #include "GUI/Panes/IWgtPane.h"
 #include "GUI/Presets/CPresetStore.h"
+#include "GUI/Preview/DraftRunner.h"
 #include "GUI/Windows/CDlgSettingsImpl.h"
 #include "GUI/Windows/Previews.h"
 #include "Utility/CGenericEx.h"
@@ -27,6 +28,31 @@ void CDlgSettingsImpl::onMy_colorPicker_colorChanged(QColor) {
 void CDlgSettingsImpl::settingsChanged() {
     mUpToDate = false;
     startTimer();
+    requestDraft();
+}
+
+// The refresh waits for the end of the movement.
+void CDlgSettingsImpl::sliderMoves() {
+    if (mRefreshTimer.isActive())
+        mRefreshTimer.start();
+    requestDraft();
+}
+
+void CDlgSettingsImpl::requestDraft() {
+    if (!mPreviews || mRunning || !isVisible())
+        return;
+    DraftRunner::Request request;
+    request.picture = mPreviews->originalCopy();
+    request.host = mPane->takesProcessedImage() ? mOriginalCopy : request.picture;
+    const Previews::Seen part = mPreviews->draftPart();
+    request.area = part.area;
+    request.reduction = part.reduction;
+    request.params = CUserParamsPhotoshop(mMode);
+    mPane->applyGUIParams(request.params);
+    request.finalTouch = mMode == Mode_FinalTouch;
+    request.tape = mWholeTape;
+    if (request.picture && request.host && !request.area.isEmpty())
+        mDrafts->request(std::move(request));
 }
 
 void CDlgSettingsImpl::startTimer() {
@@ -65,6 +91,10 @@ void CDlgSettingsImpl::runCore() {
     mCore->setParams(params);
     if (mRunInNonInteractiveMode)
         applyNonIteractiveMode();
+    if (mDrafts)
+        mDrafts->cancel();
+    mTape = std::make_shared<MeasurementTape>();
+    mCore->setTape(mPreviews ? mTape.get() : nullptr);
     const QScopedValueRollback<bool> running(mRunning, true);
     Q_EMIT mCore->started();
     mCore->run();
@@ -118,6 +148,8 @@ void CDlgSettingsImpl::onMy_thrdCore_finished() {
     mPane->setEnabled(true);
     // A stopped run ends like any other, but its picture is not the one that was asked for.
     mUpToDate = !mRefreshWanted && !mStoppedByUser;
+    if (mUpToDate && mCore->lastProcessingDone())
+        mWholeTape = mTape;
     if (!mCore->lastProcessingDone()) {
         mApplyOnFinish = false; // nothing is there to apply
         return;

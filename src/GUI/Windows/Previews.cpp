@@ -22,6 +22,8 @@ namespace orvela {
 namespace {
 
 constexpr qint64 kStepMilliseconds = 40; // the eye does not follow more than 25 pictures a second
+constexpr double kDraftPixels = 2e6;     // are processed before the eye misses them
+constexpr int kDraftMargin = 8;          // pixels that filters look at around one
 constexpr QSize kSmallest(160, 120);
 
 // The windows in the order in which their places are stored.
@@ -94,7 +96,22 @@ void Previews::showStep(const CThreadedCore& core) {
     mSinceStep.start();
 }
 
-void Previews::showDraft(std::unique_ptr<CARGBPlane> part, const QRect& area) {
+Previews::Seen Previews::draftPart() const {
+    Seen part = seen();
+    const QRect whole = mProcessed.scene().sceneRect().toRect();
+    const auto pixels = [&] {
+        return static_cast<double>(part.area.width()) * part.area.height() /
+               (part.reduction * part.reduction);
+    };
+    part.reduction = 1;
+    while (pixels() > kDraftPixels)
+        ++part.reduction;
+    const int margin = kDraftMargin * part.reduction;
+    part.area = part.area.adjusted(-margin, -margin, margin, margin) & whole;
+    return part;
+}
+
+void Previews::showDraft(std::shared_ptr<const CARGBPlane> part, const QRect& area) {
     mProcessed.showPart(std::move(part), area);
     mBar->setDraft(true);
 }

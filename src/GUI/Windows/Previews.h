@@ -49,8 +49,15 @@ public:
     };
     Seen seen() const;
 
+    /// What a draft is made of: the part that is seen with what lies around it, as fine as can be processed
+    /// at once.
+    Seen draftPart() const;
+
     /// Shows a draft of a part until the next picture or step is shown.
-    void showDraft(std::unique_ptr<CARGBPlane> part, const QRect& area);
+    void showDraft(std::shared_ptr<const CARGBPlane> part, const QRect& area);
+
+    /// The copy of the original that is shown.
+    std::shared_ptr<const CARGBPlane> originalCopy() const { return mOriginal.plane(); }
 
     /// Shows the windows: two when split.
     void setSplit(bool split);
