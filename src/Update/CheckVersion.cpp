@@ -4,16 +4,13 @@
 #include "Settings/PresetTree.h"
 #include "Settings/SettingsStore.h"
 #include "Update/RunningVersion.h"
+#include "Update/UpdateMessage.h"
 #include "Update/UpdateServer.h"
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
 
 #include <QCheckBox>
 #include <QDateTime>
-#include <QDialog>
-#include <QPushButton>
-#include <QTextEdit>
-#include <QVBoxLayout>
 
 #include <algorithm>
 #include <array>
@@ -65,15 +62,6 @@ void copy(QByteArrayView text, std::span<char> buffer) {
     buffer[length] = 0;
 }
 
-QHBoxLayout* rowOf(QWidget* widget, bool centred) {
-    auto* row = new QHBoxLayout;
-    if (centred)
-        row->addStretch();
-    row->addWidget(widget);
-    row->addStretch();
-    return row;
-}
-
 } // namespace
 
 void CheckVersion::checkVersion() {
@@ -115,24 +103,9 @@ CheckVersion::Outcome CheckVersion::compare() {
 }
 
 void CheckVersion::showUpdateMessage(const QString& text) {
-    QDialog dialog;
-    auto* message = new QTextEdit;
-    message->setReadOnly(true);
-    message->setPlainText(text); // what came from the server is no markup
-    message->setStyleSheet(QStringLiteral("border:0px;"));
-    message->setFixedHeight(50);
-    message->setMinimumWidth(400); // two lines of it
-    auto* again = new QCheckBox(tr("Do not show this message again"));
-    auto* ok = new QPushButton(tr("Ok"));
-    ok->setDefault(true);
-    auto* layout = new QVBoxLayout(&dialog);
-    layout->addWidget(message);
-    layout->addLayout(rowOf(again, false));
-    layout->addLayout(rowOf(ok, true));
-    connect(ok, &QPushButton::clicked, &dialog, &QDialog::accept);
-    connect(again, &QCheckBox::clicked, this, &CheckVersion::onDoNotShowNewVersion);
-    ok->setFocus();
-    dialog.exec();
+    UpdateMessage message(text);
+    connect(message.doNotShow(), &QCheckBox::clicked, this, &CheckVersion::onDoNotShowNewVersion);
+    message.exec();
 }
 
 unsigned CheckVersion::postToServer(const QByteArray& path, const QByteArray& body, std::span<char> reply) {

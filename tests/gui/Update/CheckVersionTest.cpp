@@ -2,6 +2,7 @@
 
 #include "Settings/SettingsStore.h"
 #include "Update/UpdateServer.h"
+#include "support/EnvironmentVariable.h"
 #include "support/HttpServer.h"
 #include "support/LogCapture.h"
 #include "support/ModalDialog.h"
