@@ -29,8 +29,9 @@ struct Reply {
 /// Nothing is read beyond so many bytes of a reply.
 constexpr int kMostBytes = 4096;
 
-/// Posts the form through the proxy that the system prefers and waits for the reply, without serving the user
-/// in the meantime. Redirections are not followed, and a transfer that takes too long is given up.
+/// Posts the form and waits for the reply, without serving the user in the meantime. It goes through the
+/// proxy that is set up for the system, on Linux by the variable http_proxy. Redirections are not followed,
+/// and a transfer that takes too long is given up.
 Reply post(const Form& form);
 
 } // namespace WebPost

@@ -2,7 +2,7 @@
 
 #include <QEventLoop>
 #include <QNetworkAccessManager>
-#include <QNetworkProxyFactory>
+#include <QNetworkProxy>
 #include <QNetworkReply>
 #include <QTimer>
 
@@ -14,11 +14,15 @@ namespace WebPost {
 
 namespace {
 
-class SystemProxies final : public QNetworkProxyFactory {
-    QList<QNetworkProxy> queryProxy(const QNetworkProxyQuery& query) override {
-        return systemProxyForQuery(query);
-    }
-};
+// The proxy that the environment names. That of the desktop is not asked for: looking it up may itself ask
+// the net, and cannot be given up.
+QNetworkProxy proxyOfEnvironment() {
+    const QUrl url = QUrl::fromUserInput(qEnvironmentVariable("http_proxy"));
+    if (url.host().isEmpty())
+        return QNetworkProxy::NoProxy;
+    return {QNetworkProxy::HttpProxy, url.host(), static_cast<quint16>(url.port(8080)), url.userName(),
+            url.password()};
+}
 
 QNetworkRequest requestOf(const Form& form) {
     QUrl url;
@@ -55,7 +59,7 @@ void await(const QNetworkReply& reply, std::chrono::milliseconds limit) {
 
 Reply post(const Form& form) {
     QNetworkAccessManager manager;
-    manager.setProxyFactory(new SystemProxies); // which it owns
+    manager.setProxy(proxyOfEnvironment());
     const std::unique_ptr<QNetworkReply> reply(manager.post(requestOf(form), form.body));
     reply->setReadBufferSize(kMostBytes);
     await(*reply, form.limit);

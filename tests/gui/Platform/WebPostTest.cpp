@@ -1,5 +1,6 @@
 #include "Platform/WebPost.h"
 
+#include "support/EnvironmentVariable.h"
 #include "support/HttpServer.h"
 
 #include <QTest>
@@ -12,13 +13,18 @@ using namespace orvela;
 
 namespace {
 
+/// Without a proxy in between.
+class WebPostTest : public testing::Test {
+    EnvironmentVariable mProxy{"http_proxy", ""};
+};
+
 WebPost::Form formFor(const HttpServer& server) {
     return {"127.0.0.1", server.serverPort(), "folder/script.php", "p=1&w=v", "Agent"};
 }
 
 } // namespace
 
-TEST(WebPost, SendsTheFormAsItIsAndReturnsTheReply) {
+TEST_F(WebPostTest, SendsTheFormAsItIsAndReturnsTheReply) {
     HttpServer server("an answer");
     WebPost::Form form = formFor(server);
     const WebPost::Reply reply = WebPost::post(form);
@@ -36,7 +42,7 @@ TEST(WebPost, SendsTheFormAsItIsAndReturnsTheReply) {
                                     QByteArray::number(form.port) + "\nUser-Agent: Agent");
 }
 
-TEST(WebPost, ReturnsWhatAServerSaysWithAnyStatusAndFollowsNobodyElsewhere) {
+TEST_F(WebPostTest, ReturnsWhatAServerSaysWithAnyStatusAndFollowsNobodyElsewhere) {
     HttpServer elsewhere("from elsewhere");
     HttpServer server;
     server.reply = "HTTP/1.1 307 Temporary Redirect\r\nLocation: http://" + elsewhere.address() +
@@ -50,7 +56,7 @@ TEST(WebPost, ReturnsWhatAServerSaysWithAnyStatusAndFollowsNobodyElsewhere) {
     EXPECT_EQ(server.requests.size(), 3);
 }
 
-TEST(WebPost, GivesUpWhereNothingComesOrTooSlowly) {
+TEST_F(WebPostTest, GivesUpWhereNothingComesOrTooSlowly) {
     for (const auto manner : {HttpServer::WithNothing, HttpServer::LittleByLittle, HttpServer::ByHangingUp}) {
         HttpServer server(QByteArray(100000, 'x'), manner);
         WebPost::Form form = formFor(server);
@@ -66,7 +72,7 @@ TEST(WebPost, GivesUpWhereNothingComesOrTooSlowly) {
     EXPECT_EQ(WebPost::post(form).error, "Unable to send data to server.");
 }
 
-TEST(WebPost, ReadsNoFurtherThanItsLimit) {
+TEST_F(WebPostTest, ReadsNoFurtherThanItsLimit) {
     HttpServer server({}, HttpServer::WithoutEnd);
     WebPost::Form form = formFor(server);
     form.limit = std::chrono::minutes(1);

@@ -59,6 +59,7 @@ protected:
 
     HttpServer mServer;
     EnvironmentVariable mName{"ORVELA_UPDATE_SERVER", mServer.address()};
+    EnvironmentVariable mProxy{"http_proxy", ""};
     QStringList mKeysInDialog;
 };
 
@@ -194,7 +195,6 @@ TEST_F(CheckVersionTest, TellsAlsoWhereTheSettingsCannotBeWritten) {
 
 TEST_F(CheckVersionTest, GoesThroughTheProxyButNeverToAReservedName) {
     const EnvironmentVariable proxy("http_proxy", "http://" + mServer.address());
-    const EnvironmentVariable exceptions("no_proxy", "");
     for (const char* name : {"kestrand.example", "Kestrand.Example.:8080", "example", "two words", "a:b:c"}) {
         const EnvironmentVariable server("ORVELA_UPDATE_SERVER", name);
         EXPECT_FALSE(updateServer().exists()) << name;
@@ -203,6 +203,7 @@ TEST_F(CheckVersionTest, GoesThroughTheProxyButNeverToAReservedName) {
     }
     EXPECT_TRUE(mServer.requests.isEmpty());
     const EnvironmentVariable server("ORVELA_UPDATE_SERVER", "updates.test");
+    const EnvironmentVariable sameProxy("http_proxy", mServer.address()); // a scheme goes without saying
     mServer.reply = HttpServer::ok("Kestrand_Server_Said 2.5");
     EXPECT_EQ(check().messages, QStringList(kMinor.arg("2.5")));
     ASSERT_EQ(mServer.requests.size(), 1);
