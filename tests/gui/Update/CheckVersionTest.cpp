@@ -118,9 +118,23 @@ TEST_F(CheckVersionTest, IsSilentWhereTheAnswerIsNone) {
         EXPECT_EQ(CheckVersion().postToServer("qmx/checkprodversion.php", "p=1&w=v", buffer), 0U);
         EXPECT_EQ(QByteArray(buffer.data()), error);
     }
-    mServer.close();
-    openSettings().clear();
-    EXPECT_TRUE(check().timed);
+}
+
+TEST_F(CheckVersionTest, IsSilentWhereNothingComesOrTooSlowly) {
+    const auto asks = [this](const QByteArray& address) {
+        openSettings().clear();
+        const EnvironmentVariable name("ORVELA_UPDATE_SERVER", address);
+        const Checked checked = check();
+        return checked.messages.isEmpty() && !checked.update.isValid() && checked.timed;
+    };
+    HttpServer hangingUp({}, HttpServer::ByHangingUp);
+    EXPECT_TRUE(asks(hangingUp.address()));
+    HttpServer slow("Kestrand_Server_Said 2.5" + QByteArray(1 << 20, ' '), HttpServer::LittleByLittle);
+    EXPECT_TRUE(asks(slow.address()));
+    EXPECT_FALSE(hangingUp.requests.isEmpty() || slow.requests.isEmpty());
+    const QByteArray closed = hangingUp.address();
+    hangingUp.close();
+    EXPECT_TRUE(asks(closed));
 }
 
 TEST_F(CheckVersionTest, TakesAnAnswerThatFillsTheBufferAndEndsItAtAZero) {

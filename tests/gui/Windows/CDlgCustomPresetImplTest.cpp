@@ -88,7 +88,10 @@ TEST_F(CDlgCustomPresetImplTest, HelpOpensItsPageAndLeavesTheChoice) {
 }
 
 TEST_F(CDlgCustomPresetImplTest, WithoutAnyPresetItFailsAndWithNoneOfAdvancedItSaysSo) {
-    const auto work = [](CDlgCustomPresetImpl& chooser) { click(chooser.btnOK); };
+    const auto work = [](CDlgCustomPresetImpl& chooser) {
+        click(chooser.btnOK);
+        EXPECT_EQ(chooser.result(), QDialog::Rejected);
+    };
     try {
         choose(work);
         FAIL() << "There was nothing to choose from.";

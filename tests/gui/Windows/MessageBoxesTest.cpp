@@ -70,9 +70,9 @@ TEST_F(MessageBoxes, GoAwayWithTheirWindow) {
     EXPECT_EQ(DebugBoxes::warningBox(window, "Note:", "text", QMessageBox::Yes | QMessageBox::No),
               DebugBoxes::Ok);
     auto* closed = new QDialog;
-    closed->show();
-    closed->activateWindow();
-    closed->close();
+    closed->setWindowFlag(Qt::Tool);
+    QTimer::singleShot(50, closed, &QDialog::close);
+    closed->exec();
     closed->deleteLater();
     QString said;
     answerBox(QMessageBox::No, said);
