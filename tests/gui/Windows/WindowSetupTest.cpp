@@ -7,7 +7,6 @@
 #include <QDir>
 #include <QGuiApplication>
 #include <QScreen>
-#include <QToolButton>
 
 #include <gtest/gtest.h>
 
@@ -48,13 +47,4 @@ TEST(WindowSetup, LogsAStoreThatCannotBeWritten) {
     storePosition(QDialog());
     ASSERT_TRUE(QDir().rmdir(path));
     EXPECT_TRUE(log.has("The settings could not be written to " + path.toStdString() + "."));
-}
-
-TEST(WindowSetup, FlatButtonsHaveNoReliefInAnyState) {
-    QToolButton button;
-    flatten({&button});
-    for (auto group : {QPalette::Active, QPalette::Inactive, QPalette::Disabled})
-        for (auto role :
-             {QPalette::Light, QPalette::Midlight, QPalette::Dark, QPalette::Mid, QPalette::Shadow})
-            EXPECT_EQ(button.palette().brush(group, role), QPalette().brush(QPalette::Window));
 }
