@@ -1,19 +1,5 @@
 #include "GUI/Windows/CDlgSinglePreviewImpl.h"
 
-#include <QCloseEvent>
-
-CDlgSinglePreviewImpl::CDlgSinglePreviewImpl(QWidget* parent) : QDialog(parent) {
+CDlgSinglePreviewImpl::CDlgSinglePreviewImpl(QWidget* parent) : PreviewWindow(parent) {
     setupUi(this);
-}
-
-void CDlgSinglePreviewImpl::addView(QWidget* view) {
-    hboxLayout->addWidget(view);
-}
-
-void CDlgSinglePreviewImpl::addBelow(QWidget* widget) {
-    vboxLayout->addWidget(widget);
-}
-
-void CDlgSinglePreviewImpl::closeEvent(QCloseEvent* event) {
-    event->ignore();
 }
