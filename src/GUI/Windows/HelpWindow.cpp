@@ -23,6 +23,7 @@
 #include <QToolBar>
 #include <QTreeWidget>
 #include <QVBoxLayout>
+#include <QWindow>
 
 #include <algorithm>
 
@@ -43,13 +44,15 @@ QString placeKey() {
 
 HelpWindow::HelpWindow(QWidget* owner)
     : QWidget(owner, Qt::Window), mPage(new HelpBrowser(this)), mContents(new QTreeWidget(this)),
-      mSearch(new QLineEdit(this)), mMissing(new QLabel(this)) {
+      mSearch(new QLineEdit(this)), mMissing(new QLabel(this)), mFollow(new QTimer(this)) {
     setObjectName(QStringLiteral("HelpWindow"));
     setWindowTitle(tr("Orvela Manual"));
     setAttribute(Qt::WA_ShowWithoutActivating); // when it goes over to another window
     layOut();
     fillContents();
     addShortcuts();
+    mFollow->setSingleShot(true);
+    connect(mFollow, &QTimer::timeout, this, &HelpWindow::followModalWindow);
     connect(mPage, &HelpBrowser::sourceChanged, this, &HelpWindow::markEntry);
     connect(mContents, &QTreeWidget::currentItemChanged, this, &HelpWindow::showEntry);
     connect(mSearch, &QLineEdit::textEdited, this,
@@ -162,6 +165,8 @@ void HelpWindow::belongTo(QWidget* owner) {
     setParent(owner, windowFlags());
     owner->installEventFilter(this);
     setGeometry(place);
+    if (windowHandle()) // or the window manager would choose a place again, having chosen the first one
+        windowHandle()->setGeometry(place);
     setVisible(shown);
 }
 
@@ -183,7 +188,7 @@ void HelpWindow::leaveOwner() {
 
 bool HelpWindow::event(QEvent* event) {
     if (event->type() == QEvent::WindowBlocked) // the modal window is not on the screen yet
-        QTimer::singleShot(0, this, &HelpWindow::followModalWindow);
+        mFollow->start(0);
     return QWidget::event(event);
 }
 

@@ -4,6 +4,7 @@
 
 class QLabel;
 class QLineEdit;
+class QTimer;
 class QToolBar;
 class QTreeWidget;
 class QTreeWidgetItem;
@@ -47,6 +48,7 @@ private:
     QTreeWidget* mContents;
     QLineEdit* mSearch;
     QLabel* mMissing; ///< says that the page does not have what is searched for
+    QTimer* mFollow;  ///< runs out once a modal window stands
 };
 
 /// Opens a topic of the manual, such as "welcome.htm", for the window `owner`: the compiled manual in the
