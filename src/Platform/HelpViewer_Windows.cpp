@@ -29,7 +29,8 @@ ViewerCall loadViewer() {
         module = LoadLibraryA(kViewerFile);
     if (!module)
         return nullptr;
-    return reinterpret_cast<ViewerCall>(GetProcAddress(module, MAKEINTRESOURCEA(kViewerOrdinal)));
+    auto* const function = reinterpret_cast<void*>(GetProcAddress(module, MAKEINTRESOURCEA(kViewerOrdinal)));
+    return reinterpret_cast<ViewerCall>(function);
 }
 
 } // namespace

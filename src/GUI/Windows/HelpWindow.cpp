@@ -33,7 +33,7 @@ namespace {
 
 constexpr int kAddress = Qt::UserRole; // of the entries of the table of contents
 constexpr QSize kSize(960, 700);
-constexpr int kContentsWidth = 230;
+constexpr int kContentsWidth = 250;
 constexpr int kRowSpace = 7;
 
 QString placeKey() {
