@@ -11,8 +11,9 @@
 #include "GUI/Presets/CPresetStore.h"
 #include "GUI/Preview/CSignaledGraphicsView.h"
 #include "GUI/Preview/DraftRunner.h"
-#include "GUI/Windows/FlatButtons.h"
+#include "GUI/Windows/CDlgCustomPresetImpl.h"
 #include "GUI/Windows/Previews.h"
+#include "GUI/Windows/WindowSetup.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
 #include "Settings/PresetTree.h"
 #include "Settings/SettingsEdit.h"
@@ -27,7 +28,6 @@ using namespace orvela;
 namespace {
 
 constexpr int kRefreshMilliseconds = 1000;
-const QString kPosition = QStringLiteral("CDlgSettingsImpl/pos");
 const QString kSplit = QStringLiteral("CDlgSettingsImpl/previewsSplitted");
 const QString kSelected = QStringLiteral("CDlgSettingsImpl/selectedPreset");
 
@@ -70,7 +70,8 @@ CDlgSettingsImpl::CDlgSettingsImpl(EGUIMode mode, CARGBPlane* inPlane, CARGBPlan
                                    Qt::WindowFlags flags)
     : QDialog(parent, flags), mMode(mode), mInPlane(inPlane), mOutPlane(outPlane) {
     setupUi(this);
-    flattenButtons(*this);
+    for (QToolButton* button : findChildren<QToolButton*>())
+        flatten({button});
     lblZoomLevel->setMinimumWidth(lblZoomLevel->fontMetrics().horizontalAdvance(QStringLiteral("66.7% ")));
     btnGluePreviews->hide();
     btnStopProcessing->hide();
@@ -81,7 +82,7 @@ CDlgSettingsImpl::CDlgSettingsImpl(EGUIMode mode, CARGBPlane* inPlane, CARGBPlan
     connect(lstBxPreset, &QComboBox::currentIndexChanged, this,
             [this](int index) { on_lstBxPreset_currentIndexChanged(lstBxPreset->itemText(index)); });
     addShortcuts();
-    storing([this] { CPresetStore::ensureFactoryPresets(this); });
+    CPresetStore::ensureFactoryPresets(this);
     // A native window is to be there before anything else happens.
     show();
     hide();
@@ -122,7 +123,7 @@ void CDlgSettingsImpl::run() {
 }
 
 void CDlgSettingsImpl::runPreset(EGUIMode mode) {
-    const QString name = mode == Mode_Custom ? QString() /* TODO chooser */
+    const QString name = mode == Mode_Custom ? CDlgCustomPresetImpl::choose(this, mOpenPage)
                                              : CPresetStore::factoryPresetName(mode);
     if (name.isEmpty())
         return;
@@ -151,7 +152,7 @@ void CDlgSettingsImpl::runWithoutDialogue() {
     btnOK->setEnabled(false);
     mApplyOnFinish = true;
     on_btnRefresh_clicked();
-    storing([this] { CBatchMode::instance().setBatchMode(mMode); });
+    CBatchMode::instance().setBatchMode(mMode);
 }
 
 void CDlgSettingsImpl::runInteractive(EGUIMode mode) {
@@ -159,7 +160,7 @@ void CDlgSettingsImpl::runInteractive(EGUIMode mode) {
     changeMode(mode);
     if (!mFailure)
         exec();
-    storing([this] { CBatchMode::instance().setBatchMode(mMode); });
+    CBatchMode::instance().setBatchMode(mMode);
 }
 
 void CDlgSettingsImpl::makePreviews() {
@@ -326,9 +327,7 @@ void CDlgSettingsImpl::restoreWindowsStates() {
     if (!isVisible() || std::exchange(mStatesRestored, true))
         return; // closed meanwhile, or where the user put it
     const QSettings settings = openSettings();
-    const QVariant place = settings.value(PresetTree::guiKey(kPosition));
-    if (place.canConvert<QPoint>() && Previews::isOnScreen(place.toPoint()))
-        move(place.toPoint());
+    restorePosition(*this);
     if (!mPreviews)
         return;
     mPreviews->restoreFrom(settings);
@@ -340,12 +339,12 @@ void CDlgSettingsImpl::restoreWindowsStates() {
 void CDlgSettingsImpl::onMy_this_finished(int) {
     mRefreshTimer.stop();
     SettingsEdit edit;
-    edit.set(PresetTree::guiKey(kPosition), pos());
+    addPosition(edit, *this);
     edit.set(PresetTree::guiKey(kSelected), lstBxPreset->currentText());
     if (mPreviews) {
         edit.set(PresetTree::guiKey(kSplit), mPreviews->isSplit());
         mPreviews->saveTo(edit);
         mPreviews->hide();
     }
-    storing([&edit] { edit.commit(); });
+    storeLayout(edit);
 }

@@ -119,7 +119,6 @@ private:
     void tellFailures();
     void guarded(const std::function<void()>& action);
     void showing(const std::function<void()>& action);
-    void storing(const std::function<void()>& action);
     const CARGBPlane& original() const;
 
     EGUIMode mMode;

@@ -60,7 +60,7 @@ void CDlgSettingsImpl::on_lstBxPreset_currentIndexChanged(const QString& name) {
 
 bool CDlgSettingsImpl::savePresetAs(const QString& name, bool asks, bool& isNew) {
     bool saved = false;
-    storing([&] { CPresetStore::savePreset(mPane, mMode, name, saved, isNew, asks); });
+    CPresetStore::savePreset(mPane, mMode, name, saved, isNew, asks);
     return saved;
 }
 
@@ -90,10 +90,8 @@ void CDlgSettingsImpl::on_btnDeletePreset_clicked() {
                               tr("Are you sure you want to delete the selected preset?"),
                               QMessageBox::Yes | QMessageBox::No) != QMessageBox::Yes)
         return;
-    storing([&] {
-        CPresetStore::removePreset(mMode, name);
+    if (CPresetStore::removePreset(mMode, name))
         lstBxPreset->removeItem(lstBxPreset->currentIndex());
-    });
 }
 
 void CDlgSettingsImpl::on_btnRevertPreset_clicked() {

@@ -245,12 +245,3 @@ void CDlgSettingsImpl::showing(const std::function<void()>& action) {
         Log::log(LogLevel::Warning, "The preview cannot be shown: %s", error.what());
     }
 }
-
-// A store that cannot be written costs the user the stored thing, and nothing else.
-void CDlgSettingsImpl::storing(const std::function<void()>& action) {
-    try {
-        action();
-    } catch (const CGenericEx& error) {
-        DebugBoxes::warningBox(this, tr("Warning"), error.message());
-    }
-}

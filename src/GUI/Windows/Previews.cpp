@@ -6,6 +6,7 @@
 #include "GUI/Preview/PreviewBar.h"
 #include "GUI/Windows/CDlgDualPreviewImpl.h"
 #include "GUI/Windows/CDlgSinglePreviewImpl.h"
+#include "GUI/Windows/WindowSetup.h"
 #include "Settings/PresetTree.h"
 #include "Settings/SettingsEdit.h"
 
@@ -48,8 +49,8 @@ Previews::Previews(QWidget* owner)
     mOrig->setWindowTitle(tr("Original Picture (Preview)"));
     mProc->setWindowTitle(tr("Processed Picture (Preview)"));
     for (QWidget* view : {mOriginalView, mProcessedView})
-        mJoined->addView(view);
-    mJoined->addBelow(mBar);
+        mJoined->horizontalLayout->addWidget(view);
+    mJoined->verticalLayout->addWidget(mBar);
     connect(mBar, &PreviewBar::fitRequested, this, [this] { zoomTo(ZoomTable::kFit); });
     connect(mBar, &PreviewBar::pixelsRequested, this, &Previews::zoomToPixels);
     connect(mBar, &PreviewBar::comparingChanged, this, &Previews::setComparing);
@@ -131,13 +132,13 @@ Previews::Seen Previews::seen() const {
 void Previews::setSplit(bool split) {
     mSplit = split;
     if (split) {
-        mOrig->addView(mOriginalView);
-        mProc->addView(mProcessedView);
-        mProc->addBelow(mBar);
+        mOrig->horizontalLayout->addWidget(mOriginalView);
+        mProc->horizontalLayout->addWidget(mProcessedView);
+        mProc->verticalLayout->addWidget(mBar);
     } else {
-        mJoined->addView(mOriginalView);
-        mJoined->addView(mProcessedView);
-        mJoined->addBelow(mBar);
+        mJoined->horizontalLayout->addWidget(mOriginalView);
+        mJoined->horizontalLayout->addWidget(mProcessedView);
+        mJoined->verticalLayout->addWidget(mBar);
     }
     mJoined->setVisible(!split);
     mOrig->setVisible(split);
@@ -215,10 +216,6 @@ bool Previews::eventFilter(QObject* watched, QEvent* event) {
     return QObject::eventFilter(watched, event);
 }
 
-bool Previews::isOnScreen(const QPoint& place) {
-    return QGuiApplication::screenAt(place + QPoint(40, 10)) != nullptr;
-}
-
 void Previews::saveTo(SettingsEdit& edit) const {
     for (const StoredWindow& stored : {StoredWindow{"PreviewWindows", mJoined},
                                        {"PreviewWindows/Orig", mOrig},
@@ -237,7 +234,7 @@ void Previews::restoreFrom(const QSettings& settings) {
         const QVariant place = settings.value(keyOf(stored, "/pos"));
         if (size.toSize().isValid())
             stored.window->resize(size.toSize());
-        if (place.canConvert<QPoint>() && isOnScreen(place.toPoint()))
+        if (place.canConvert<QPoint>() && isReachable(place.toPoint(), stored.window->width()))
             stored.window->move(place.toPoint());
     }
 }

@@ -84,9 +84,6 @@ public:
     void setComparing(bool comparing);
     bool isComparing() const { return mProcessed.isComparing(); }
 
-    /// Whether a window at that place can be reached; screens come and go.
-    static bool isOnScreen(const QPoint& place);
-
     /// Puts places and sizes of the windows into `edit`.
     void saveTo(SettingsEdit& edit) const;
     /// Moves the windows to stored places, or beside their owner.

@@ -20,7 +20,8 @@ QString positionKey(const QWidget& window) {
     return PresetTree::guiKey(QString::fromLatin1(window.metaObject()->className()) + QStringLiteral("/pos"));
 }
 
-// Whether enough of the title of a window so wide would show to take hold of it.
+} // namespace
+
 bool isReachable(const QPoint& position, int width) {
     constexpr int kHold = 24; // pixels
     const QRect title(position, QSize(width, kHold));
@@ -30,8 +31,6 @@ bool isReachable(const QPoint& position, int width) {
         return shown.width() >= kHold && shown.height() >= kHold / 2;
     });
 }
-
-} // namespace
 
 void flatten(std::initializer_list<QWidget*> buttons) {
     for (QWidget* button : buttons) {
@@ -56,7 +55,15 @@ void restorePosition(QWidget& window) {
 
 void storePosition(const QWidget& window) {
     SettingsEdit edit;
+    addPosition(edit, window);
+    storeLayout(edit);
+}
+
+void addPosition(SettingsEdit& edit, const QWidget& window) {
     edit.set(positionKey(window), window.pos());
+}
+
+void storeLayout(const SettingsEdit& edit) {
     try {
         edit.commit();
     } catch (const CGenericEx& failure) {
