@@ -8,6 +8,11 @@
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
 
+#include <QBoxLayout>
+#include <QEvent>
+
+#include <algorithm>
+
 using namespace orvela;
 
 namespace {
@@ -44,6 +49,24 @@ void IWgtPane::resetSliders() {
         each->setEnabled(false);
         each->setValue(kMiddle);
     }
+}
+
+bool IWgtPane::event(QEvent* event) {
+    if (event->type() == QEvent::Polish || event->type() == QEvent::FontChange)
+        alignColumns();
+    return QWidget::event(event);
+}
+
+// Labels of one width let all sliders begin in one column, and the pickers below them.
+void IWgtPane::alignColumns() {
+    const auto blocks = findChildren<COrvelaSliderBlockImpl*>();
+    int width = 0;
+    for (const COrvelaSliderBlockImpl* each : blocks)
+        width = std::max(width, each->labelWidth());
+    for (COrvelaSliderBlockImpl* each : blocks)
+        each->setLabelWidth(width);
+    for (const auto& [row, slider] : mPickerRows)
+        row->setContentsMargins(slider->sliderLeft() - CColorPicker::kSwatchLeft, 0, 0, 0);
 }
 
 COrvelaSliderBlockImpl* IWgtPane::block(const PaneSlider& slider) const {
@@ -83,7 +106,19 @@ void IWgtPane::setUpSliders(std::span<const PaneSlider> sliders, const CSliderPa
                     each.slider.value ? settings.*each.slider.value : each.initial);
 }
 
-void IWgtPane::setUpColorPicker(CColorPicker* picker, COrvelaSliderBlockImpl* slider) {
+void IWgtPane::setUpColorPicker(CColorPicker* picker, const PaneColor& color,
+                                COrvelaSliderBlockImpl* slider) {
+    const QString help = tr(color.color.help);
+    picker->setToolTip(help);
+    picker->setWhatsThis(help);
+    picker->setAccessibleDescription(help);
+    picker->setAccessibleName(slider->lblName->text());
+    auto* column = qobject_cast<QBoxLayout*>(slider->parentWidget()->layout());
+    column->removeWidget(picker);
+    auto* row = new QHBoxLayout;
+    row->addWidget(picker, 0, Qt::AlignLeft);
+    column->insertLayout(column->indexOf(slider) + 1, row);
+    mPickerRows.append({row, slider});
     connect(picker, SIGNAL(colorChanged(QColor)), mOwner, SLOT(onMy_colorPicker_colorChanged(QColor)));
     connect(slider, &COrvelaSliderBlockImpl::stateChanged, picker, &CColorPicker::setVisible);
     picker->setVisible(slider->isEnabled());
@@ -102,7 +137,7 @@ void IWgtPane::writeSliders(std::span<const PaneSlider> sliders, CSliderParams& 
             continue;
         const COrvelaSliderBlockImpl* control = block(each);
         if (each.slider.value)
-            settings.*each.slider.value = static_cast<float>(control->value());
+            settings.*each.slider.value = static_cast<float>(control->exactValue());
         settings.*each.slider.enabled = control->isEnabled();
     }
 }

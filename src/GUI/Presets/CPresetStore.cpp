@@ -56,7 +56,7 @@ QList<Control*> namedControls(const QWidget* parent) {
 PresetContent contentOf(const QWidget* parent) {
     PresetContent content;
     for (const auto* block : namedControls<COrvelaSliderBlockImpl>(parent))
-        content.sliders.append({block->objectName(), block->value(), block->isEnabled()});
+        content.sliders.append({block->objectName(), block->exactValue(), block->isEnabled()});
     for (const auto* picker : namedControls<CColorPicker>(parent)) {
         const QColor color = picker->color();
         content.colors.append({picker->objectName(), color.red(), color.green(), color.blue()});

@@ -9,6 +9,7 @@
 #include "support/BoxAnswer.h"
 #include "support/BoxRecorder.h"
 #include "support/LogCapture.h"
+#include "support/SettingsMap.h"
 
 #include <QCheckBox>
 #include <QDir>
@@ -150,13 +151,12 @@ TEST_F(CPresetStoreTest, FactoryPresetsAreTheModesAsTheirPaneWouldSaveThem) {
         CPresetStore::savePreset(shown.pane, Mode_Advanced, name, saved, isNew, false);
         CUserParams params;
         shown.pane->applyGUIParams(params);
-        for (const auto& [object, slider, initial, zones, mirror] : PaneTable::sliders(Mode_Advanced)) {
-            const auto text = [&slider = slider](const CSliderParams& settings) {
-                return (slider.value ? slider.scale->text(settings.*slider.value) : QString()) +
-                       (settings.*slider.enabled ? " on" : " off");
-            };
-            EXPECT_EQ(text(params.mSliderParams), text(factory.mSliderParams)) << object;
-        }
+        EXPECT_EQ(settingsOf(params.mSliderParams), settingsOf(factory.mSliderParams))
+            << "as the command has it";
+        shown.pane->setSliders("Automatic");
+        CPresetStore::loadPreset(shown.pane, Mode_Advanced, name);
+        shown.pane->applyGUIParams(params);
+        EXPECT_EQ(settingsOf(params.mSliderParams), settingsOf(factory.mSliderParams)) << "from the store";
     }
     EXPECT_EQ(lines(), written);
     EXPECT_EQ(boxes([] {
