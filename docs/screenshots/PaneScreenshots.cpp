@@ -39,6 +39,7 @@ std::unique_ptr<QWidget> advanced(bool extended, int tab) {
     pane->sldrTemperature->setEnabled(true);
     pane->sldrTemperature->setValue(1000);
     pane->colrPickAutoColor->setColor(QColor(240, 160, 60));
+    pane->wgtSettings->layout()->activate();
     const int hidden = pane->wgtSettings->sizeHint().height() - pane->scrSettings->sizeHint().height();
     frame->resize(frame->sizeHint() + QSize(0, hidden)); // the screen of the offscreen platform is low
     return std::move(frame);

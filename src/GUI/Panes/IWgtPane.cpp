@@ -9,6 +9,7 @@
 #include "Utility/Logger.h"
 
 #include <QBoxLayout>
+#include <QCoreApplication>
 #include <QEvent>
 
 #include <algorithm>
@@ -18,6 +19,10 @@ using namespace orvela;
 namespace {
 
 constexpr double kMiddle = 500;
+
+QString shown(const char* textOfTable) {
+    return QCoreApplication::translate("SliderTable", textOfTable);
+}
 
 // The control of the pane's form with that object name.
 template <class Control>
@@ -87,9 +92,9 @@ void IWgtPane::setUpSlider(COrvelaSliderBlockImpl* block, const QString& label) 
 void IWgtPane::setUpSlider(const PaneSlider& slider, bool on, double position) {
     const auto& [value, enabled, label, scale, stage, zones, help] = slider.slider;
     COrvelaSliderBlockImpl* control = block(slider);
-    setUpSlider(control, tr(label));
-    control->setToolTip(tr(label));
-    control->setHelp(tr(help));
+    setUpSlider(control, shown(label));
+    control->setToolTip(shown(label));
+    control->setHelp(shown(help));
     control->setZoneStops(TrackZones::set(slider.zones()));
     control->setEnabled(on);
     control->setScale(*scale);
@@ -108,7 +113,7 @@ void IWgtPane::setUpSliders(std::span<const PaneSlider> sliders, const CSliderPa
 
 void IWgtPane::setUpColorPicker(CColorPicker* picker, const PaneColor& color,
                                 COrvelaSliderBlockImpl* slider) {
-    const QString help = tr(color.color.help);
+    const QString help = shown(color.color.help);
     picker->setToolTip(help);
     picker->setWhatsThis(help);
     picker->setAccessibleDescription(help);
