@@ -8,7 +8,7 @@
 
 namespace {
 
-constexpr int kRestOfWindow = 300; // pixels: title, presets, buttons, progress
+constexpr int kRestOfWindow = 250; // pixels: title, presets, buttons, progress
 constexpr int kLeastHeight = 160;
 
 } // namespace

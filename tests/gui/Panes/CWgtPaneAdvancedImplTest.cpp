@@ -9,6 +9,8 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
+
 using namespace orvela;
 
 TEST(CWgtPaneAdvancedImpl, FoldsTheRarelyUsedGroupsAway) {
@@ -46,14 +48,22 @@ TEST(CWgtPaneAdvancedImpl, FoldsTheRarelyUsedGroupsAway) {
 TEST(CWgtPaneAdvancedImpl, LeavesTheScreenRoomForTheRestOfItsWindow) {
     Shown<CWgtPaneAdvancedImpl> shown(Mode_Advanced);
     shown.owner.layout()->setSizeConstraint(QLayout::SetFixedSize);
-    QCoreApplication::processEvents();
+    const int room = std::max(160, shown.owner.screen()->availableGeometry().height() - 250);
+    const auto settles = [&] {
+        return QTest::qWaitFor([&] {
+            const int content = shown.pane->wgtSettings->sizeHint().height();
+            return shown.pane->scrSettings->height() == std::min(content, room) &&
+                   shown.owner.height() == shown.owner.sizeHint().height();
+        });
+    };
+    EXPECT_TRUE(settles());
     const int folded = shown.owner.height();
     shown.pane->on_btnExtendSettings_clicked();
-    QCoreApplication::processEvents();
-    EXPECT_GT(shown.owner.height(), folded);
-    EXPECT_LE(shown.owner.height(), shown.owner.screen()->availableGeometry().height() - 180);
+    EXPECT_TRUE(settles());
+    EXPECT_GE(shown.owner.height(), folded);
+    EXPECT_LE(shown.owner.height(), room + 100);
     shown.pane->on_btnCollapseSettings_clicked();
-    QCoreApplication::processEvents();
+    EXPECT_TRUE(settles());
     EXPECT_EQ(shown.owner.height(), folded);
 }
 
