@@ -63,6 +63,12 @@ Widget colorPickers() {
     return frame;
 }
 
+Widget colorField() {
+    auto field = std::make_unique<CColorPickerPopup>();
+    field->open({}, QColor(200, 128, 0), {});
+    return field;
+}
+
 Widget statusIndicators() {
     auto frame = std::make_unique<QWidget>();
     auto* layout = new QVBoxLayout(frame.get());
@@ -137,7 +143,7 @@ std::vector<Shot> controlShots(CARGBPlane& plane) {
     std::vector<Shot> shots;
     shots.emplace_back("slider-blocks", sliderBlocks());
     shots.emplace_back("color-pickers", colorPickers());
-    shots.emplace_back("color-field", std::make_unique<CColorPickerPopup>());
+    shots.emplace_back("color-field", colorField());
     shots.emplace_back("status-indicators", statusIndicators());
     shots.emplace_back("preview", preview(plane));
     shots.emplace_back("icons", icons());
