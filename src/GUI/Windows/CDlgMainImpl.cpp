@@ -70,8 +70,9 @@ CDlgMainImpl::CDlgMainImpl(void* hostWindow, CARGBPlane* inPlane, CARGBPlane* ou
     setWindowTitle(tr("Orvela %1").arg(kRunningVersion, 0, 'g'));
     flatten({btnCollapse, btnExpand});
     if (qEnvironmentVariableIsSet("ORVELA_STYLESHEET"))
-        setStyleSheet(QStringLiteral("color: white;background: qlineargradient(x1: 0, y1: 0, x2: 0, y2: 1, stop: 0 "
-                                     "#333333, stop: 1.0 #AAAAAA)"));
+        setStyleSheet(
+            QStringLiteral("color: white;background: qlineargradient(x1: 0, y1: 0, x2: 0, y2: 1, stop: 0 "
+                           "#333333, stop: 1.0 #AAAAAA)"));
     mWantedBatchState = CBatchMode::instance().isBatchModeEnabled();
     showUpdateLink();
 }
@@ -93,8 +94,9 @@ void CDlgMainImpl::showUpdateLink() {
     const QSettings settings = openSettings();
     const QString key = QStringLiteral("UpdateAvailable");
     updateAvailableLabel->setVisible(settings.contains(key));
-    updateAvailableLabel->setText(tr("<a href=\"http://%1/update%2.html\">Update Available</>")
-                                      .arg(updateServer().host.toHtmlEscaped(), settings.value(key).toString().toHtmlEscaped()));
+    updateAvailableLabel->setText(
+        tr("<a href=\"http://%1/update%2.html\">Update Available</>")
+            .arg(updateServer().host.toHtmlEscaped(), settings.value(key).toString().toHtmlEscaped()));
 }
 
 bool CDlgMainImpl::run() {
@@ -194,16 +196,16 @@ void CDlgMainImpl::refreshBatchButton() {
     if (mWantedBatchState)
         QMessageBox::information(
             this, tr("Batch Mode Enabled"),
-            tr("Batch mode is now enabled! Next time when you start Orvela, Orvela will process the image with "
+            tr("Batch mode is now enabled! Next time when you start Orvela, Orvela will process the image "
+               "with "
                "the last operation you performed with orvela.\n\nTo disable batch mode, hold <b>SHIFT</b> "
                "pressed when selecting Orvela from Plug-ins menu."),
             QMessageBox::Ok);
     if (isExpanded())
         btnToggleBatchMode->setText(mWantedBatchState ? tr("Batch Mode is on") : tr("Batch Mode is off"));
     btnToggleBatchMode->setProperty(kBatchProperty, mWantedBatchState);
-    btnToggleBatchMode->setIcon(QIcon(mWantedBatchState
-                                          ? QStringLiteral(":/Main UI/Batch01_On_24x24.png")
-                                          : QStringLiteral(":/Main UI/Batch01_Off_24x24.png")));
+    btnToggleBatchMode->setIcon(QIcon(mWantedBatchState ? QStringLiteral(":/Main UI/Batch01_On_24x24.png")
+                                                        : QStringLiteral(":/Main UI/Batch01_Off_24x24.png")));
 }
 
 void CDlgMainImpl::on_btnIndivFilters_clicked() {
