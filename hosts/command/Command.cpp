@@ -3,14 +3,22 @@
 #include "Settings/PresetFile.h"
 #include "Utility/CGenericEx.h"
 #include "command/EnhanceCommand.h"
+#include "command/Messages.h"
 #include "command/ModesCommand.h"
+#include "command/ParseRefusal.h"
+#include "command/PresetFiles.h"
 #include "command/PresetsCommand.h"
 
 #include <QCoreApplication>
 
+#include <fcntl.h>
+#include <unistd.h>
+
 #include <CLI/CLI.hpp>
 #include <algorithm>
+#include <csignal>
 #include <iostream>
+#include <system_error>
 
 namespace orvela {
 
@@ -32,7 +40,13 @@ void addModes(CLI::App& program, Action& action) {
     CLI::App* command = program.add_subcommand("modes", "List the modes and their sliders");
     const auto asJson = std::make_shared<bool>(false);
     command->add_flag("--json", *asJson, "as JSON");
-    command->callback([&action, asJson] { action = [asJson] { return listModes(*asJson); }; });
+    const auto kind = std::make_shared<std::string>();
+    command->add_option("--names", *kind, "names only, one a line: modes, settings or final-touch")
+        ->option_text("KIND")
+        ->check(CLI::IsMember(nameKinds()));
+    command->callback([&action, asJson, kind] {
+        action = [asJson, kind] { return kind->empty() ? listModes(*asJson) : listNames(*kind); };
+    });
 }
 
 void addPresets(CLI::App& program, Action& action) {
@@ -41,13 +55,22 @@ void addPresets(CLI::App& program, Action& action) {
     options->declare(*command, [&action, options](Action chosen) { action = std::move(chosen); });
 }
 
+// No option and no argument means anything when it is empty; a script's variable often is.
+void refuseEmptyValues(CLI::App& app) {
+    for (CLI::Option* option : app.get_options())
+        option->check([](const std::string& text) { return text.empty() ? "is empty" : std::string(); });
+    for (CLI::App* command : app.get_subcommands({}))
+        refuseEmptyValues(*command);
+}
+
 ExitStatus refuse(ExitStatus status, const std::string& text) {
-    std::cerr << "orvela: " << text << std::endl;
+    Messages::tell(text);
     return status;
 }
 
 ExitStatus perform(const Action& action) {
     try {
+        PresetFiles::checkStore();
         return action();
     } catch (const UsageError& error) {
         return refuse(ExitStatus::WrongUsage, error.what());
@@ -56,8 +79,19 @@ ExitStatus perform(const Action& action) {
     }
 }
 
+// A file that is opened under the number of a closed output would take what the program tells.
+void occupyClosedOutputs() {
+    int handle = -1;
+    do
+        handle = ::open("/dev/null", O_RDONLY | O_CLOEXEC);
+    while (handle >= 0 && handle <= STDERR_FILENO);
+    ::close(handle);
+}
+
 int runProgram(int argc, char** argv) {
+    occupyClosedOutputs();
     StopSignals signals;
+    std::signal(SIGXFSZ, SIG_IGN); // a file above the limit fails like a full disk
     QCoreApplication application(argc, argv);
 
     CLI::App program("Enhances photographs.", "orvela");
@@ -67,13 +101,15 @@ int runProgram(int argc, char** argv) {
     addEnhance(program, action, signals);
     addModes(program, action);
     addPresets(program, action);
+    refuseEmptyValues(program);
     try {
         program.parse(argc, argv);
     } catch (const CLI::ParseError& error) {
-        const bool answered = program.exit(error) == 0; // --help and --version come this way, too
-        return static_cast<int>(answered ? ExitStatus::Done : ExitStatus::WrongUsage);
+        if (error.get_exit_code() != 0)
+            return static_cast<int>(refuse(ExitStatus::WrongUsage, parseRefusal(program, error)));
+        program.exit(error); // --help and --version come this way, too
     }
-    ExitStatus status = perform(action);
+    ExitStatus status = action ? perform(action) : ExitStatus::Done;
     if (!std::cout.flush())
         status = std::max(status, refuse(ExitStatus::TargetTrouble, "the output cannot be written"));
     return signals.received() ? kSignalBase + signals.received() : static_cast<int>(status);
@@ -81,7 +117,9 @@ int runProgram(int argc, char** argv) {
 
 // For whatever nothing deeper had a message for.
 ExitStatus fail(const std::exception& failure) {
-    if (isOutOfMemory(failure))
+    const auto* system = dynamic_cast<const std::system_error*>(&failure);
+    const bool noThread = system && system->code() == std::errc::resource_unavailable_try_again;
+    if (noThread || isOutOfMemory(failure))
         return refuse(ExitStatus::OutOfMemory, "not enough memory; close other programs");
     return refuse(ExitStatus::PhotographFailed, innermostMessage(failure).toStdString());
 }

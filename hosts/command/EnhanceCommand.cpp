@@ -1,17 +1,22 @@
 #include "command/EnhanceCommand.h"
 
 #include "Utility/CGenericEx.h"
-#include "Utility/Logger.h"
 #include "Utility/RowScheduler.h"
 #include "command/Enhancement.h"
-#include "command/PresetTargets.h"
+#include "command/LogFile.h"
+#include "command/Messages.h"
+#include "command/PresetFiles.h"
 #include "command/ProgressLine.h"
 #include "command/Sources.h"
+#include "files/Memory.h"
 #include "files/PhotographReader.h"
 #include "files/PhotographWriter.h"
 #include "files/TargetFile.h"
 
+#include <malloc.h>
+
 #include <algorithm>
+#include <csignal>
 #include <iostream>
 
 namespace orvela {
@@ -20,7 +25,16 @@ namespace fs = std::filesystem;
 
 namespace {
 
-constexpr char kMemoryAdvice[] = "; close other programs or use a smaller photograph";
+// What enhancing takes of memory for each pixel: the samples as they came and as they become, one channel of
+// them on its way, and planes of three colours for what goes in, what comes out, and the host's picture.
+constexpr std::uint64_t kSampleCopies = 2;
+constexpr std::uint64_t kChannelBytes = 2;
+constexpr std::uint64_t kPlanes = 3;
+constexpr std::uint64_t kPlaneBytes = 3;
+
+int threadsOf(const EnhanceOptions& options) {
+    return options.threads > 0 ? options.threads : RowScheduler::defaultThreads();
+}
 
 // The work on all photographs of one command.
 class Batch {
@@ -28,7 +42,8 @@ public:
     Batch(const EnhanceOptions& options, const RunSettings& settings, std::vector<Job> jobs,
           StopSignals& signals)
         : mOptions(options), mSettings(settings), mJobs(std::move(jobs)), mSignals(signals),
-          mScheduler(options.threads), mProgress(static_cast<int>(mJobs.size()), !options.quiet) {}
+          mScheduler(options.threads), mMapped(mappedByThreads(threadsOf(options))),
+          mProgress(static_cast<int>(mJobs.size()), !options.quiet) {}
 
     ExitStatus run() {
         ExitStatus worst = ExitStatus::Done;
@@ -41,6 +56,7 @@ private:
     ExitStatus runGuarded(const Job& job);
     void runJob(const Job& job);
     void makeFolder();
+    ReadOptions reading() const;
     bool runPage(const Job& job, PhotographReader& reader, PhotographWriter& writer);
     Photograph read(PhotographReader& reader);
     std::optional<TraceOptions> traceOf(const Job& job, const Photograph& photograph) const;
@@ -52,6 +68,7 @@ private:
     const std::vector<Job> mJobs;
     StopSignals& mSignals;
     RowScheduler mScheduler;
+    const std::uint64_t mMapped; ///< bytes, see ReadLimits
     ProgressLine mProgress;
     std::size_t mIndex = 0;
     std::string mName; ///< of the photograph, and of its page, before what is told about it
@@ -64,7 +81,7 @@ ExitStatus Batch::failed(ExitStatus status, const std::string& text) {
 
 void Batch::note(const std::string& text) {
     mProgress.clear();
-    std::cerr << "orvela: " << text << std::endl;
+    Messages::tell(text);
 }
 
 ExitStatus Batch::runGuarded(const Job& job) {
@@ -77,15 +94,17 @@ ExitStatus Batch::runGuarded(const Job& job) {
         return ExitStatus::Done;
     } catch (const TargetError& error) {
         return failed(ExitStatus::TargetTrouble, error.what());
+    } catch (const MemoryError& error) {
+        return failed(ExitStatus::OutOfMemory, error.what());
     } catch (const PhotographError& error) {
         return failed(ExitStatus::PhotographFailed, error.what());
     } catch (const EngineFailure& error) {
         return error.isOutOfMemory()
-                   ? failed(ExitStatus::OutOfMemory, mName + error.what() + kMemoryAdvice)
+                   ? failed(ExitStatus::OutOfMemory, mName + error.what() + "; " + kMemoryAdvice)
                    : failed(ExitStatus::PhotographFailed, mName + error.what() + "; nothing was written");
     } catch (const std::exception& error) {
         if (isOutOfMemory(error))
-            return failed(ExitStatus::OutOfMemory, mName + "not enough memory" + kMemoryAdvice);
+            return failed(ExitStatus::OutOfMemory, mName + "not enough memory; " + kMemoryAdvice);
         return failed(ExitStatus::PhotographFailed, mName + innermostMessage(error).toStdString());
     } catch (...) {
         return failed(ExitStatus::PhotographFailed, mName + "failed for an unknown reason; report this");
@@ -97,8 +116,8 @@ void Batch::runJob(const Job& job) {
     WriteOptions writing = mOptions.writing;
     writing.stop = &mSignals.stopRequested();
     checkTargetPath(job.target, job.source, writing.overwrite);
-    mProgress.begin(QString::fromLocal8Bit(job.source.filename().c_str()));
-    PhotographReader reader(job.source, mOptions.reading);
+    mProgress.begin(QString::fromStdString(Messages::shown(job.source.filename().string())));
+    PhotographReader reader(job.source, reading());
     PhotographWriter writer(job.target, writing);
     for (int page = 0; page < reader.pages(); ++page) {
         mProgress.page(page, reader.pages());
@@ -111,13 +130,14 @@ void Batch::runJob(const Job& job) {
         note(warning);
     mProgress.clear();
     if (!mOptions.quiet)
-        std::cout << job.source.string() << " -> " << job.target.string() << std::endl;
+        std::cout << Messages::shown(job.source.string()) << " -> " << Messages::shown(job.target.string())
+                  << std::endl;
 }
 
 // Enhances the next page; false when a signal ended it.
 bool Batch::runPage(const Job& job, PhotographReader& reader, PhotographWriter& writer) {
-    // From the second page on there is a temporary file that has to be removed.
-    mSignals.stay(writer.hasBegun());
+    // The temporary file of the first pages has to be removed, the log to be finished.
+    mSignals.stay(writer.hasBegun() || mOptions.log);
     Photograph photograph = read(reader);
     checkTarget(photograph, job.target, mOptions.writing);
     if (!photograph.copied) {
@@ -138,6 +158,16 @@ void Batch::makeFolder() {
     std::error_code error;
     if (mOptions.targets.folder)
         fs::create_directories(*mOptions.targets.folder, error);
+}
+
+ReadOptions Batch::reading() const {
+    // The final touch keeps one more plane, the trace the last picture and the one to compare it with.
+    const std::uint64_t planes = kPlanes + (mSettings.runsFinalTouch ? 1 : 0) + (mOptions.trace ? 2 : 0);
+    ReadOptions reading = mOptions.reading;
+    reading.limits.sampleCopies = kSampleCopies;
+    reading.limits.workBytes = kChannelBytes + planes * kPlaneBytes;
+    reading.limits.mappedBytes = mMapped;
+    return reading;
 }
 
 // Reading cannot be stopped half-way, but leaves nothing behind either: a signal ends the program at once.
@@ -176,35 +206,54 @@ void refuseOverlap(const EnhanceOptions& options, const std::vector<Job>& jobs) 
 void savePreset(const EnhanceOptions& options, const RunSettings& settings) {
     if (!options.savePreset)
         return;
-    const QString path = QString::fromLocal8Bit(options.savePreset->c_str());
-    static_cast<void>(presetToWriteInto(path, options.writing.overwrite));
-    settings.preset.write(path);
+    static_cast<void>(PresetFiles::toWriteInto(*options.savePreset, options.writing.overwrite));
+    PresetFiles::write(settings.preset, *options.savePreset, options.writing.overwrite);
 }
 
-void openLog(const EnhanceOptions& options) {
-    if (!options.log)
-        return;
-    checkTargetPath(*options.log, {}, options.writing.overwrite);
-    auto logger = std::make_unique<CLoggerFile>(QByteArray::fromStdString(*options.log));
-    if (!logger->isOpen())
-        throw TargetError(*options.log + ": the log cannot be written; check the folder");
-    Log::setThreshold(LogLevel::Debug);
-    Log::install(std::move(logger));
+// A pipe is opened once somebody reads it, for which a signal does not wait.
+void openLog(std::optional<LogFile>& log, const EnhanceOptions& options, StopSignals& signals) {
+    const StopAction leave(signals, [&signals] { signals.leave(); });
+    if (options.log)
+        log.emplace(*options.log, options.writing.overwrite);
 }
 
 ExitStatus report(const Sources& sources) {
     for (const std::string& failure : sources.failures)
-        std::cerr << "orvela: " << failure << std::endl;
+        Messages::tell(failure);
     for (const std::string& argument : sources.unmatched)
-        std::cerr << "orvela: " << argument << ": no photograph matches" << std::endl;
+        Messages::tell(argument + ": no photograph matches");
     if (!sources.failures.empty())
         return ExitStatus::PhotographFailed;
     return sources.unmatched.empty() ? ExitStatus::Done : ExitStatus::NothingMatched;
 }
 
+// A library whose threads cannot be started waits for them for ever, or ends the program.
+bool hasRoomToBegin(const EnhanceOptions& options) {
+    const std::uint64_t granted = grantedAddresses();
+    if (granted == kUnlimited)
+        return true;
+    ::mallopt(M_ARENA_MAX, 1); // each thread would reserve 64 MB for itself
+    const std::uint64_t needed = kLibraryBytes + kBesideBytes + mappedByThreads(threadsOf(options));
+    if (needed > granted)
+        Messages::tell("not enough memory: the limits of the process leave " + amountOf(granted) + ", " +
+                       amountOf(needed) +
+                       " are needed to begin; raise them (ulimit -v, ulimit -d) or use fewer --threads");
+    return needed <= granted;
+}
+
 ExitStatus targetTrouble(const std::string& text) {
-    std::cerr << "orvela: " << text << std::endl;
+    Messages::tell(text);
     return ExitStatus::TargetTrouble;
+}
+
+ExitStatus finish(std::optional<LogFile>& log) {
+    try {
+        if (log)
+            log->finish();
+        return ExitStatus::Done;
+    } catch (const std::exception& error) {
+        return targetTrouble(error.what());
+    }
 }
 
 } // namespace
@@ -213,20 +262,26 @@ ExitStatus enhancePhotographs(const EnhanceOptions& options, StopSignals& signal
     if (options.photographs.empty() && !options.savePreset)
         throw UsageError("name the photographs to enhance");
     const RunSettings settings = settle(options.settings);
+    if (!options.photographs.empty() && !settings.idle.empty())
+        throw UsageError(settings.idle);
     const Sources sources = findSources(options.photographs);
     const std::vector<Job> jobs = planTargets(sources.photographs, options.targets);
     refuseOverlap(options, jobs);
     for (const std::string& note : settings.notes)
-        std::cerr << "orvela: " << note << std::endl;
+        Messages::tell(note);
+    if (!jobs.empty() && !hasRoomToBegin(options))
+        return ExitStatus::OutOfMemory;
+    std::signal(SIGPIPE, SIG_IGN); // nobody reads the log any more: no reason to leave the photographs
+    std::optional<LogFile> log;
     try {
         savePreset(options, settings);
-        openLog(options);
+        openLog(log, options, signals);
     } catch (const std::runtime_error& error) { // of a preset or of a target
         return targetTrouble(error.what());
     }
     const ExitStatus found = report(sources);
-    const ExitStatus worst = Batch(options, settings, jobs, signals).run();
-    Log::install(nullptr);
+    const ExitStatus done = Batch(options, settings, jobs, signals).run();
+    const ExitStatus worst = std::max(done, finish(log));
     // A photograph that failed says more than an argument that matched nothing.
     return worst == ExitStatus::Done ? found : worst;
 }

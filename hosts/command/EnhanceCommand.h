@@ -35,7 +35,7 @@ struct EnhanceOptions {
 };
 
 /// Enhances the photographs one after the other; a failed one does not keep the others from being done.
-/// @throws UsageError and PresetError before any work has started
+/// @throws UsageError and PresetError before any work has started, also when nothing would change
 ExitStatus enhancePhotographs(const EnhanceOptions& options, StopSignals& signals);
 
 } // namespace orvela

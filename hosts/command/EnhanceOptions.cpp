@@ -1,5 +1,5 @@
 #include "command/EnhanceCommand.h"
-#include "command/ModeNames.h"
+#include "command/NearestNames.h"
 
 #include <CLI/CLI.hpp>
 
@@ -9,6 +9,15 @@ namespace {
 
 constexpr char kSettings[] = "Settings";
 
+// The library's own takes what is no number, and names the largest one there is when it refuses.
+const CLI::Validator kPositive(
+    [](const std::string& text) {
+        double number = 0;
+        const bool fits = CLI::detail::lexical_cast(text, number) && number > 0;
+        return fits ? std::string() : '"' + text + "\" is not a number above 0";
+    },
+    std::string());
+
 void declareTargets(CLI::App& app, EnhanceOptions& options) {
     app.add_option("-o,--output", options.targets.file, "file for the result of one photograph")
         ->option_text("FILE");
@@ -17,6 +26,8 @@ void declareTargets(CLI::App& app, EnhanceOptions& options) {
         ->option_text("FOLDER");
     app.add_flag("--force", options.writing.overwrite,
                  "overwrite results, presets and logs of earlier runs (never a photograph that is read)");
+    app.add_flag("--keep-time", options.writing.keepTime,
+                 "give results the time stamps of their photographs");
 }
 
 void declareEncoding(CLI::App& app, WriteOptions& writing) {
@@ -46,7 +57,7 @@ void declareSettings(CLI::App& app, SettingOptions& settings) {
         ->group(kSettings);
     for (const std::string& label : labelsOfThreeSliders())
         app.add_option_function<std::string>(
-               "--" + ModeNames::plain(label),
+               "--" + NearestNames::plain(label),
                [&settings, label](const std::string& text) { settings.labelled[label] = text; },
                "shown number of that slider of Adjustments or Smart Levels")
             ->option_text("NUMBER")
@@ -64,8 +75,9 @@ void declareSettings(CLI::App& app, SettingOptions& settings) {
         ->option_text("NAME=NUMBER,...")
         ->group(kSettings);
     app.add_option("--preset", settings.preset,
-                   "read settings from a file; without --mode nothing else is on")
-        ->option_text("FILE")
+                   "read settings from a file, or a stored preset of the mode (Advanced); without --mode "
+                   "nothing else is on")
+        ->option_text("FILE|NAME")
         ->group(kSettings);
 }
 
@@ -84,6 +96,10 @@ void EnhanceOptions::declare(CLI::App& app) {
     app.add_option("--threads", threads, "number of threads (one per processor)")
         ->option_text("N")
         ->check(CLI::Range(1, 1024));
+    app.add_option("--max-megapixels", reading.limits.megapixels,
+                   "refuse photographs with more million pixels")
+        ->option_text("N")
+        ->check(kPositive);
     app.add_flag("--quiet", quiet, "no progress and no results, only errors");
     app.add_option("--log", log, "write the engine's log to a file")->option_text("FILE");
     app.add_option("--trace", trace, "write what each step did to an empty folder: pictures and statistics")

@@ -60,13 +60,12 @@ void checkOutcome(const CThreadedCore& core) {
 void Run::connect(CThreadedCore& core) {
     QObject::connect(&core, &CThreadedCore::percentDone, &core,
                      [this](int value) { mProgress.percent(value); });
-    QObject::connect(&core, &CThreadedCore::stepDone, &core,
-                     [this, &core](int step, int total, const QString& name) {
-                         // More steps are announced than the total that comes with them.
-                         const auto steps = static_cast<int>(PipelineTable::mainSteps().size());
-                         mProgress.step(step, total > 1 ? std::max(total, steps) : total, name);
-                         core.stepHandled();
-                     });
+    QObject::connect(&core, &CThreadedCore::stepDone, &core, [this, &core](int step, int total) {
+        // More steps are announced than the total that comes with them.
+        const auto steps = static_cast<int>(PipelineTable::mainSteps().size());
+        mProgress.step(step, total > 1 ? std::max(total, steps) : total, QString::fromUtf8(core.stepTitle()));
+        core.stepHandled();
+    });
     if (!mTrace)
         return;
     core.setObserver([this, &core](const TaskReport& report) {

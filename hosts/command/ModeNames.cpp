@@ -2,33 +2,13 @@
 
 #include "Settings/PresetConversion.h"
 #include "Settings/SettingFields.h"
+#include "command/NearestNames.h"
 
 #include <algorithm>
 #include <cctype>
 #include <cstring>
-#include <numeric>
 
 namespace orvela {
-
-namespace {
-
-// Fewest insertions, deletions and replacements that turn one text into the other.
-std::size_t editDistance(std::string_view from, std::string_view to) {
-    std::vector<std::size_t> row(to.size() + 1);
-    std::iota(row.begin(), row.end(), std::size_t{0});
-    for (std::size_t i = 1; i <= from.size(); ++i) {
-        std::size_t diagonal = row[0];
-        row[0] = i;
-        for (std::size_t j = 1; j <= to.size(); ++j) {
-            const std::size_t replaced = diagonal + (from[i - 1] == to[j - 1] ? 0 : 1);
-            diagonal = row[j];
-            row[j] = std::min({row[j] + 1, row[j - 1] + 1, replaced});
-        }
-    }
-    return row.back();
-}
-
-} // namespace
 
 namespace ModeNames {
 
@@ -57,18 +37,11 @@ std::string identifierOf(const ModeDescription& mode) {
     return identifier;
 }
 
-std::string plain(std::string_view name) {
-    std::string text;
-    for (const unsigned char c : name)
-        if (std::isalnum(c))
-            text += static_cast<char>(std::tolower(c));
-    return text;
-}
-
 const ModeDescription* find(std::string_view name, const std::vector<const ModeDescription*>& modes) {
-    const std::string wanted = plain(name);
+    const std::string wanted = NearestNames::plain(name);
     for (const ModeDescription* mode : modes)
-        if (wanted == plain(mode->displayName) || wanted == plain(identifierOf(*mode)))
+        if (wanted == NearestNames::plain(mode->displayName) ||
+            wanted == NearestNames::plain(identifierOf(*mode)))
             return mode;
     return nullptr;
 }
@@ -78,7 +51,7 @@ std::vector<NamedSlider> slidersOf(EGUIMode mode) {
     if (const PaneSlider* single = PaneTable::single(mode))
         sliders.push_back({"--value", single->slider});
     for (const PaneSlider& each : PaneTable::threeSliders(mode))
-        sliders.push_back({"--" + plain(each.slider.label), each.slider});
+        sliders.push_back({"--" + NearestNames::plain(each.slider.label), each.slider});
     return sliders;
 }
 
@@ -103,20 +76,10 @@ std::vector<NamedSlider> finalTouchSliders() {
     return sliders;
 }
 
-std::vector<std::string> nearest(std::string_view name) {
-    const std::string wanted = plain(name);
-    std::vector<std::pair<std::size_t, std::string>> ranked;
-    for (const ModeDescription* mode : selectable()) {
-        const std::string identifier = identifierOf(*mode);
-        ranked.emplace_back(editDistance(wanted, plain(identifier)), identifier);
-    }
-    std::stable_sort(ranked.begin(), ranked.end(),
-                     [](const auto& a, const auto& b) { return a.first < b.first; });
+std::vector<std::string> identifiers() {
     std::vector<std::string> names;
-    // Beyond the nearest only names that are about as near, or the answer is noise.
-    for (const auto& [distance, identifier] : ranked)
-        if (names.size() < 3 && distance <= ranked.front().first + 1)
-            names.push_back(identifier);
+    for (const ModeDescription* mode : selectable())
+        names.push_back(identifierOf(*mode));
     return names;
 }
 

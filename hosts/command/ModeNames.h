@@ -33,8 +33,8 @@ std::vector<const ModeDescription*> withPresets();
 const ModeDescription* find(std::string_view name,
                             const std::vector<const ModeDescription*>& modes = selectable());
 
-/// Up to three identifiers, the nearest to `name` first.
-std::vector<std::string> nearest(std::string_view name);
+/// The identifiers of the modes that can be chosen.
+std::vector<std::string> identifiers();
 
 /// The sliders that the mode itself has, by their options: "--value" of a single one, or "--" and the label.
 std::vector<NamedSlider> slidersOf(EGUIMode mode);
@@ -46,11 +46,17 @@ std::span<const PaneColor> colorsOf(EGUIMode mode);
 /// where it has no position.
 std::vector<NamedSlider> settings();
 
+/// What the rows of a list are called.
+template <typename List>
+std::vector<std::string> namesOf(const List& named) {
+    std::vector<std::string> names;
+    for (const auto& each : named)
+        names.emplace_back(each.name);
+    return names;
+}
+
 /// The sliders of the final touch, such as "AbsContrast".
 std::vector<NamedSlider> finalTouchSliders();
-
-/// `name` in lower case without anything but letters and digits.
-std::string plain(std::string_view name);
 
 } // namespace ModeNames
 

@@ -107,4 +107,18 @@ ExitStatus listModes(bool asJson) {
     return ExitStatus::Done;
 }
 
+std::vector<std::string> nameKinds() {
+    return {"modes", "settings", "final-touch"};
+}
+
+ExitStatus listNames(const std::string& kind) {
+    const std::vector<std::string> names = kind == "settings" ? ModeNames::namesOf(ModeNames::settings())
+                                           : kind == "final-touch"
+                                               ? ModeNames::namesOf(ModeNames::finalTouchSliders())
+                                               : ModeNames::identifiers();
+    for (const std::string& name : names)
+        std::cout << name << '\n';
+    return ExitStatus::Done;
+}
+
 } // namespace orvela

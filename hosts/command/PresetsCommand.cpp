@@ -4,9 +4,11 @@
 #include "Settings/PresetConversion.h"
 #include "Settings/PresetFile.h"
 #include "Utility/CGenericEx.h"
+#include "command/Messages.h"
 #include "command/ModeNames.h"
-#include "command/PresetTargets.h"
-#include "command/TextValues.h"
+#include "command/NearestNames.h"
+#include "command/PresetFiles.h"
+#include "files/Photograph.h"
 
 #include <QFileInfo>
 
@@ -18,7 +20,7 @@ namespace orvela {
 namespace {
 
 ExitStatus report(ExitStatus status, const QString& text) {
-    std::cerr << "orvela: " << text.toStdString() << std::endl;
+    Messages::tell(text.toStdString());
     return status;
 }
 
@@ -30,8 +32,9 @@ EGUIMode modeOf(const std::string& name) {
     std::vector<std::string> known;
     for (const ModeDescription* mode : modes)
         known.push_back(ModeNames::identifierOf(*mode));
-    throw UsageError("--mode: \"" + name + "\" has no presets of its own; the modes that have are " +
-                     TextValues::joined(known, ", "));
+    throw UsageError(
+        "--mode: \"" + name + "\" has no presets of its own" +
+        NearestNames::advice(name, known, "Advanced, FinalTouch and the modes with sliders have"));
 }
 
 QString nameOf(const PresetsOptions& options) {
@@ -43,8 +46,11 @@ QString nameOf(const PresetsOptions& options) {
 }
 
 ExitStatus reportMissing(EGUIMode mode, const QString& name) {
+    const std::string advice = NearestNames::advice(name.toStdString(), PresetFiles::names(mode),
+                                                    "`orvela presets list` lists those stored");
     return report(ExitStatus::NothingMatched,
-                  QStringLiteral("%1 has no preset \"%2\"").arg(getModeAsString(mode), name));
+                  QStringLiteral("%1 has no preset \"%2\"%3")
+                      .arg(getModeAsString(mode), name, QString::fromStdString(advice)));
 }
 
 ExitStatus commit(const SettingsEdit& edit) {
@@ -54,14 +60,6 @@ ExitStatus commit(const SettingsEdit& edit) {
     } catch (const CGenericEx& error) {
         return report(ExitStatus::TargetTrouble, error.message());
     }
-}
-
-// A factory preset need not be in the store.
-std::optional<PresetContent> contentOf(EGUIMode mode, const QString& name) {
-    std::optional<PresetContent> stored = PresetTree::read(mode, name);
-    if (!stored && FactoryPresets::isFactoryPreset(mode, name))
-        stored = FactoryPresets::contentOf(name);
-    return stored;
 }
 
 // What is on and has no control in the mode's pane does not come with the stored preset.
@@ -105,22 +103,21 @@ void PresetsOptions::declare(CLI::App& app, const std::function<void(std::functi
 
 ExitStatus listPresets(const PresetsOptions& options) {
     for (const QString& name : PresetTree::offeredNames(modeOf(options.mode)))
-        std::cout << name.toStdString() << '\n';
+        std::cout << Messages::shown(name.toStdString()) << '\n';
     return ExitStatus::Done;
 }
 
 ExitStatus exportPreset(const PresetsOptions& options) {
     const EGUIMode mode = modeOf(options.mode);
     const QString name = nameOf(options);
-    const QString path = QString::fromStdString(options.file);
-    const std::optional<PresetContent> stored = contentOf(mode, name);
+    const std::optional<CSliderParams> stored = PresetFiles::stored(mode, name);
     if (!stored)
         return reportMissing(mode, name);
     try {
-        PresetFile preset = presetToWriteInto(path, options.overwrite);
-        preset.take(PresetConversion::paramsOf(mode, *stored));
-        preset.write(path);
-    } catch (const PresetError& error) {
+        PresetFile preset = PresetFiles::toWriteInto(options.file, options.overwrite);
+        preset.take(*stored);
+        PresetFiles::write(preset, options.file, options.overwrite);
+    } catch (const std::runtime_error& error) { // of a preset or of a target
         return report(ExitStatus::TargetTrouble, QString::fromStdString(error.what()));
     }
     return ExitStatus::Done;
@@ -129,7 +126,7 @@ ExitStatus exportPreset(const PresetsOptions& options) {
 ExitStatus importPreset(const PresetsOptions& options) {
     const EGUIMode mode = modeOf(options.mode);
     const QString name = nameOf(options);
-    const PresetFile preset = PresetFile::read(QString::fromStdString(options.file));
+    const PresetFile preset = PresetFiles::read(options.file);
     const bool exists = PresetTree::names(mode).contains(name) || FactoryPresets::isFactoryPreset(mode, name);
     if (exists && !options.overwrite)
         return report(

@@ -1,12 +1,16 @@
 #include "command/SettingOptions.h"
 
 #include "Settings/PaneTable.h"
+#include "Settings/PresetConversion.h"
 #include "Settings/SettingFields.h"
 #include "command/ExitStatus.h"
 #include "command/ModeNames.h"
+#include "command/NearestNames.h"
+#include "command/PresetFiles.h"
 #include "command/TextValues.h"
 
 #include <algorithm>
+#include <filesystem>
 
 namespace orvela {
 
@@ -14,13 +18,15 @@ namespace {
 
 using TextValues::joined;
 
+constexpr char kList[] = "`orvela modes` lists all";
+
 const ModeDescription& modeFor(const SettingOptions& options) {
     if (!options.mode)
         return *ModeTable::find(options.preset ? Mode_Advanced : Mode_Automatic);
     if (const ModeDescription* mode = ModeNames::find(*options.mode))
         return *mode;
-    throw UsageError("unknown mode \"" + *options.mode + "\"; did you mean " +
-                     joined(ModeNames::nearest(*options.mode), " or ") + "? `orvela modes` lists all");
+    throw UsageError("unknown mode \"" + *options.mode + "\"" +
+                     NearestNames::advice(*options.mode, ModeNames::identifiers(), kList));
 }
 
 // Switches the slider on at the shown number.
@@ -40,13 +46,6 @@ void applyValue(CSliderParams& sliders, const ModeDescription& mode, const std::
     setShown(sliders, single->slider, std::string("--value (") + single->slider.label + ")", text);
 }
 
-std::vector<std::string> namesOf(const std::vector<NamedSlider>& sliders) {
-    std::vector<std::string> names;
-    for (const NamedSlider& each : sliders)
-        names.push_back(each.name);
-    return names;
-}
-
 const SliderDescription* sliderNamed(const std::vector<NamedSlider>& sliders, const std::string& name) {
     const auto found = std::find_if(sliders.begin(), sliders.end(),
                                     [&name](const NamedSlider& each) { return each.name == name; });
@@ -55,13 +54,13 @@ const SliderDescription* sliderNamed(const std::vector<NamedSlider>& sliders, co
 
 void applyLabelled(CSliderParams& sliders, const ModeDescription& mode, const std::string& label,
                    const std::string& text) {
-    const std::string option = "--" + ModeNames::plain(label);
+    const std::string option = "--" + NearestNames::plain(label);
     const std::vector<NamedSlider> known = ModeNames::slidersOf(mode.mode);
     const SliderDescription* slider = sliderNamed(known, option);
     if (!slider)
-        throw UsageError(
-            option + " is no slider of " + mode.displayName +
-            (known.empty() ? " (see `orvela modes`)" : ", which has " + joined(namesOf(known), ", ")));
+        throw UsageError(option + " is no slider of " + mode.displayName +
+                         (known.empty() ? " (see `orvela modes`)"
+                                        : ", which has " + joined(ModeNames::namesOf(known), ", ")));
     setShown(sliders, *slider, option, text);
 }
 
@@ -80,8 +79,8 @@ void applyField(CSliderParams& sliders, const std::string& text) {
     const auto [name, given] = TextValues::assignment("--set", text);
     const SliderField* field = SettingFields::find(name);
     if (!field)
-        throw UsageError("--set " + text + ": there is no setting \"" + name +
-                         "\"; `orvela modes` lists them");
+        throw UsageError("--set " + text + ": there is no setting \"" + name + "\"" +
+                         NearestNames::advice(name, ModeNames::namesOf(sliderFields()), kList));
     if (field->flag) {
         sliders.*field->flag = TextValues::onOrOff("--set " + name, given);
         return;
@@ -110,8 +109,8 @@ void applyFinalTouch(CSliderParams& sliders, const std::string& text) {
         const auto [name, given] = TextValues::assignment("--final-touch", part);
         const SliderDescription* slider = sliderNamed(known, name);
         if (!slider)
-            throw UsageError("--final-touch: there is no slider \"" + name + "\"; there are " +
-                             joined(namesOf(known), ", "));
+            throw UsageError("--final-touch: there is no slider \"" + name + "\"" +
+                             NearestNames::advice(name, ModeNames::namesOf(known), kList));
         setShown(sliders, *slider, "--final-touch " + name, given);
     }
 }
@@ -122,18 +121,48 @@ void checkColorIsUsed(const SettingOptions& options, const CSliderParams& slider
                          "--final-touch AbsColorFilter=VALUE");
 }
 
-void checkSomethingIsSet(const SettingOptions& options, const ModeDescription& mode) {
-    if (!PaneTable::threeSliders(mode.mode).empty() && options.labelled.empty() && options.fields.empty() &&
-        !options.preset && !options.finalTouch)
-        throw UsageError(std::string(mode.displayName) + " needs at least one of " +
-                         joined(namesOf(ModeNames::slidersOf(mode.mode)), ", "));
+// Why the run would change nothing, and what to do; empty when it would change something.
+std::string idleText(const SettingOptions& options, const ModeDescription& mode, const RunSettings& run) {
+    const std::vector<std::string> sliders = ModeNames::namesOf(ModeNames::slidersOf(mode.mode));
+    const bool given = options.value || !options.labelled.empty() || !options.fields.empty() ||
+                       options.preset || options.finalTouch;
+    if (!sliders.empty() && !given)
+        return std::string(mode.displayName) +
+               " without a number for its slider would change nothing; give " +
+               (sliders.size() > 1 ? "at least one of " : "") + joined(sliders, ", ");
+    if (run.runsFinalTouch || SettingFields::anyOn(run.params.mSliderParams, SettingStage::Main))
+        return {};
+    return "nothing is switched on, so nothing would change; use --set NAME=POSITION,on or another --mode";
 }
 
-void applyPreset(RunSettings& run, CSliderParams& sliders, const std::string& path) {
-    run.preset = PresetFile::read(QString::fromLocal8Bit(path.c_str()));
+// A file goes before a stored preset of that name: what stands there is in sight.
+PresetFile presetNamed(const std::string& given, EGUIMode mode, std::vector<std::string>& notes) {
+    const QString name = QString::fromStdString(given);
+    const std::optional<CSliderParams> stored = PresetFiles::stored(mode, name);
+    std::error_code none;
+    const bool isThere = std::filesystem::exists(given, none);
+    if (isThere && !(stored && std::filesystem::is_directory(given, none))) {
+        if (stored)
+            notes.push_back(given + ": the file is read, not the stored preset of that name");
+        return PresetFiles::read(given);
+    }
+    if (!stored)
+        throw UsageError(given + ": there is neither such a file nor such a preset of " +
+                         getModeAsString(mode).toStdString() +
+                         NearestNames::advice(given, PresetFiles::names(mode), "check the name"));
+    PresetFile preset;
+    preset.take(*stored);
+    return preset;
+}
+
+void applyPreset(RunSettings& run, CSliderParams& sliders, const ModeDescription& mode,
+                 const std::string& given) {
+    const bool hasPresets = PresetConversion::hasControls(mode.mode);
+    run.preset = presetNamed(given, hasPresets ? mode.mode : Mode_Advanced, run.notes);
     run.preset.applyTo(sliders);
-    for (const QString& name : run.preset.unknownNames())
-        run.notes.push_back(path + ": unknown setting " + name.toStdString() + " is kept but has no effect");
+    if (const QStringList unknown = run.preset.unknownNames(); !unknown.isEmpty())
+        run.notes.push_back(given + ": unknown and without effect, but kept: " +
+                            unknown.join(QStringLiteral(", ")).toStdString());
 }
 
 } // namespace
@@ -149,13 +178,12 @@ std::vector<std::string> labelsOfThreeSliders() {
 
 RunSettings settle(const SettingOptions& options) {
     const ModeDescription& mode = modeFor(options);
-    checkSomethingIsSet(options, mode);
     RunSettings run;
     run.params = CUserParamsPhotoshop(mode.mode);
     CSliderParams sliders = run.params.mSliderParams;
     startFinalTouch(sliders);
     if (options.preset)
-        applyPreset(run, sliders, *options.preset);
+        applyPreset(run, sliders, mode, *options.preset);
     if (options.value)
         applyValue(sliders, mode, *options.value);
     for (const auto& [label, text] : options.labelled)
@@ -172,6 +200,7 @@ RunSettings settle(const SettingOptions& options) {
     run.params.mSliderParams = SettingFields::ofStage(sliders, SettingStage::Main);
     run.runsFinalTouch = SettingFields::anyOn(sliders, SettingStage::FinalTouch);
     run.finalTouchParams.mSliderParams = SettingFields::ofStage(sliders, SettingStage::FinalTouch);
+    run.idle = idleText(options, mode, run);
     return run;
 }
 

@@ -18,7 +18,7 @@ struct SettingOptions {
     std::map<std::string, std::string> labelled = {}; ///< of a mode with three sliders, by label
     std::optional<std::string> color = {};            ///< R,G,B of the colour filter, 0 to 255
     std::vector<std::string> fields = {};             ///< NAME=POSITION[,on|off] or NAME=on|off
-    std::optional<std::string> preset = {};           ///< file to read
+    std::optional<std::string> preset = {};           ///< file to read, or stored preset
     std::optional<std::string> finalTouch = {};       ///< NAME=VALUE,...
 };
 
@@ -29,6 +29,7 @@ struct RunSettings {
     CUserParamsPhotoshop finalTouchParams; ///< for that stage
     PresetFile preset;                     ///< all of it as a preset, with what else the read file held
     std::vector<std::string> notes;        ///< for the user
+    std::string idle; ///< why nothing would change and what to do; empty when something would
 };
 
 /// The labels of the sliders of the modes with three sliders, each once.

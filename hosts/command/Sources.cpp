@@ -14,12 +14,17 @@ namespace fs = std::filesystem;
 
 namespace {
 
+bool isHidden(const fs::path& file) {
+    return file.filename().string().starts_with('.');
+}
+
 // @throws fs::filesystem_error when not all of the folder can be read
 std::vector<fs::path> photographsIn(const fs::path& folder) {
     std::vector<fs::path> found;
     std::error_code none; // a file that cannot be looked at fails when it is read
     for (const fs::directory_entry& entry : fs::directory_iterator(folder))
-        if (formatOfExtension(entry.path()) && !isEarlierResult(entry.path()) && !entry.is_directory(none))
+        if (formatOfExtension(entry.path()) && !isHidden(entry.path()) && !isEarlierResult(entry.path()) &&
+            !entry.is_directory(none))
             found.push_back(entry.path());
     std::sort(found.begin(), found.end());
     return found;

@@ -13,8 +13,8 @@ struct Sources {
     std::vector<std::string> failures;              ///< of folders that could not be read, with what to do
 };
 
-/// An argument is a file (existing or not), a folder (the photographs in it, by name; results of earlier
-/// runs left out) or a shell pattern that no file matches literally.
+/// An argument is a file (existing or not), a folder (the photographs in it, by name; hidden
+/// files and results of earlier runs left out) or a shell pattern that no file matches literally.
 Sources findSources(const std::vector<std::string>& arguments);
 
 } // namespace orvela

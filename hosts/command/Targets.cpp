@@ -2,6 +2,7 @@
 
 #include "command/ExitStatus.h"
 #include "files/FileFormat.h"
+#include "files/PhotographWriter.h"
 
 #include <sys/stat.h>
 
@@ -39,6 +40,18 @@ fs::path targetOf(const fs::path& source, const TargetOptions& options) {
     return *options.folder / (name += beside.extension());
 }
 
+// What no photograph could be written into.
+void checkTargetName(const fs::path& target) {
+    std::error_code none;
+    if (fs::is_directory(target, none))
+        throw UsageError(target.string() + ": is a folder; use -d FOLDER, or name a file in it");
+    try {
+        static_cast<void>(writtenFormat(target));
+    } catch (const PhotographError& error) {
+        throw UsageError(error.what());
+    }
+}
+
 // Device and number of an existing file.
 std::optional<std::pair<std::uintmax_t, std::uintmax_t>> identityOf(const fs::path& file) {
     struct stat status {};
@@ -55,6 +68,8 @@ std::vector<Job> planTargets(const std::vector<fs::path>& sources, const TargetO
     if (options.file && sources.size() > 1)
         throw UsageError("-o takes the result of one photograph, " + std::to_string(sources.size()) +
                          " were given; use -d FOLDER");
+    if (options.file)
+        checkTargetName(*options.file);
     FileSet known;
     for (const fs::path& source : sources)
         known.add(source);

@@ -23,7 +23,8 @@ struct Job {
 
 /// The target of every source: the file or folder told, or NAME-enhanced.EXT beside the source. Formats that
 /// are read only give TIFF.
-/// @throws UsageError when two sources share a target or a target is one of the sources
+/// @throws UsageError when two sources share a target, a target is one of the sources, or nothing can be
+///         written under its name
 std::vector<Job> planTargets(const std::vector<std::filesystem::path>& sources, const TargetOptions& options);
 
 /// True for a file that a run without a target of its own wrote.

@@ -1,10 +1,10 @@
 #include "command/TraceFolder.h"
 
 #include "files/PhotographWriter.h"
+#include "files/TargetFile.h"
 
 #include <cstdio>
 #include <cstring>
-#include <fstream>
 #include <nlohmann/json.hpp>
 
 namespace orvela {
@@ -48,11 +48,10 @@ nlohmann::ordered_json statisticsOf(const CUserParams& params) {
     return statistics;
 }
 
-void writeText(const fs::path& file, const std::string& text) {
-    std::ofstream stream(file, std::ios::binary);
-    stream << text << '\n';
-    if (!stream.flush())
-        throw TargetError(file.string() + ": cannot be written; check the folder and the free space");
+void writeText(const fs::path& target, const std::string& text, bool overwrite) {
+    TargetFile file(target);
+    file.write(text + '\n');
+    file.commit(overwrite);
 }
 
 } // namespace
@@ -96,7 +95,7 @@ void TraceFolder::taskDone(const TaskReport& report, const CThreadedCore& core) 
                                               {"red", params.pHisto_Red},
                                               {"green", params.pHisto_Green},
                                               {"blue", params.pHisto_Blue}}}};
-    writeText(mFolder / (std::string(name) + ".json"), content.dump(1));
+    writeText(mFolder / (std::string(name) + ".json"), content.dump(1), mOverwrite);
 }
 
 } // namespace orvela

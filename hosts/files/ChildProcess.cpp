@@ -16,6 +16,7 @@
 #include <cerrno>
 #include <csignal>
 #include <cstring>
+#include <fstream>
 #include <new>
 #include <system_error>
 
@@ -44,12 +45,14 @@ bool* lacksMemory = nullptr; // in the child: where it tells so
     ::_exit(1);
 }
 
-// Neither messages of the libraries nor a core file, and no life of its own. In a small address space a codec
-// may wait for a thread that could not start: stacks of a usual size are eight times what codecs are content
-// with elsewhere, and a heap for each thread takes the room of all.
+// Neither messages of the libraries nor a core file, and no life of its own: where the system ends processes
+// for want of memory, it is to take this one. In a small address space a codec may wait for a thread that
+// could not start: stacks of a usual size are eight times what codecs are content with elsewhere, and a heap
+// for each thread takes the room of all.
 void detach() {
     ::prctl(PR_SET_PDEATHSIG, SIGKILL);
     ::prctl(PR_SET_DUMPABLE, 0);
+    std::ofstream("/proc/self/oom_score_adj") << 1000;
     const int nowhere = ::open("/dev/null", O_RDWR);
     for (const int handle : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO})
         ::dup2(nowhere, handle);
@@ -94,7 +97,7 @@ ChildProcess::ChildProcess(const std::function<void(const Sink&)>& work) {
         return;
     ::close(mPipe);
     ::munmap(mOutcome, sizeof(Outcome));
-    if (error == ENOMEM)
+    if (error == ENOMEM || error == EAGAIN)
         throw std::bad_alloc();
     throw ChildFailure(std::string("no process can be started: ") + std::strerror(error));
 }
@@ -172,15 +175,6 @@ void ChildProcess::reportEnd() {
     if (end.si_code != CLD_EXITED)
         throw ChildFailure("the codec ended by signal " + std::to_string(end.si_status));
     throw ChildFailure(mOutcome->failure.data());
-}
-
-bool isBeyondMemory(std::uint64_t bytes) {
-    void* there =
-        ::mmap(nullptr, bytes, PROT_READ | PROT_WRITE, MAP_PRIVATE | MAP_ANONYMOUS | MAP_NORESERVE, -1, 0);
-    if (there == MAP_FAILED)
-        return true;
-    ::munmap(there, bytes);
-    return false;
 }
 
 } // namespace orvela

@@ -77,7 +77,4 @@ private:
     int mIdle = 0;
 };
 
-/// Whether so many bytes more would exceed what this process may have.
-bool isBeyondMemory(std::uint64_t bytes);
-
 } // namespace orvela

@@ -6,19 +6,20 @@ namespace orvela {
 
 namespace {
 
-bool hasAlpha(ColorModel model) {
-    return model == ColorModel::GreyAlpha || model == ColorModel::RgbAlpha;
-}
-
 bool isGrey(ColorModel model) {
     return model == ColorModel::Grey || model == ColorModel::GreyAlpha;
+}
+
+bool isForGrey(const Bytes& profile) {
+    constexpr std::size_t colorSpace = 16;
+    return profile.size() > colorSpace && startsWith(ByteView(profile).subspan(colorSpace), "GRAY");
 }
 
 ColorModel modelAfter(ColorModel model, const Conversion& conversion) {
     if (model == ColorModel::Cmyk)
         return model;
     const bool grey = isGrey(model) && !conversion.colours;
-    const bool alpha = hasAlpha(model) && !conversion.flattens;
+    const bool alpha = hasAlpha(model) && !conversion.flattens && !conversion.dropsExtra;
     if (grey)
         return alpha ? ColorModel::GreyAlpha : ColorModel::Grey;
     return alpha ? ColorModel::RgbAlpha : ColorModel::Rgb;
@@ -55,9 +56,10 @@ std::uint32_t overWhite(std::uint32_t sample, std::uint32_t alpha) {
 Conversion conversionFor(FileFormat format, const Photograph& photograph) {
     const bool deep = photograph.depth == 16;
     Conversion conversion;
+    conversion.dropsExtra = photograph.extraChannel && format != FileFormat::Tiff;
     switch (format) {
     case FileFormat::Jpeg:
-        conversion.flattens = hasAlpha(photograph.model);
+        conversion.flattens = hasAlpha(photograph.model) && !photograph.extraChannel;
         conversion.bits = deep ? 8 : 0;
         break;
     case FileFormat::WebP:
@@ -71,7 +73,7 @@ Conversion conversionFor(FileFormat format, const Photograph& photograph) {
     default: // hold what the program reads, or are refused
         break;
     }
-    conversion.dropsProfile = conversion.colours && !photograph.iccProfile.empty();
+    conversion.dropsProfile = conversion.colours && isForGrey(photograph.iccProfile);
     return conversion;
 }
 
@@ -81,19 +83,22 @@ std::vector<std::string> losses(const Conversion& conversion) {
         lost.push_back("16 bits per sample (" + std::to_string(conversion.bits) + " are kept)");
     if (conversion.flattens)
         lost.emplace_back("transparency (laid over white)");
+    if (conversion.dropsExtra)
+        lost.emplace_back("the extra channel");
     if (conversion.dropsProfile)
         lost.emplace_back("the ICC profile, which is one for grey");
     return lost;
 }
 
 bool changesSamples(const Conversion& conversion) {
-    return conversion.flattens || conversion.colours || conversion.bits == 8;
+    return conversion.flattens || conversion.dropsExtra || conversion.colours || conversion.bits == 8;
 }
 
 Photograph converted(const Photograph& photograph, const Conversion& conversion) {
     Photograph result = photograph;
     result.depth = conversion.bits == 8 ? 8 : photograph.depth;
     result.model = modelAfter(photograph.model, conversion);
+    result.extraChannel = photograph.extraChannel && !conversion.dropsExtra;
     if (conversion.dropsProfile)
         result.iccProfile.clear();
 

@@ -7,6 +7,7 @@ namespace orvela {
 /// What must become of a picture so that a file of some format can hold it.
 struct Conversion {
     bool flattens = false;     ///< transparency is laid over white
+    bool dropsExtra = false;   ///< the channel that is no transparency goes
     bool colours = false;      ///< grey becomes RGB
     bool dropsProfile = false; ///< since it describes grey
     int bits = 0;              ///< that a sample keeps of its 16; 0 all that it has

@@ -24,6 +24,13 @@ constexpr std::array kExtensions = {
     Extension{".avif", FileFormat::Heif}, Extension{".hif", FileFormat::Heif},
 };
 
+std::string extensionOf(const std::filesystem::path& path) {
+    std::string text = path.extension().string();
+    std::transform(text.begin(), text.end(), text.begin(),
+                   [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
+    return text;
+}
+
 bool holds(ByteView file, std::size_t at, std::string_view text) {
     return file.size() >= at + text.size() &&
            std::equal(text.begin(), text.end(), file.begin() + static_cast<std::ptrdiff_t>(at),
@@ -62,13 +69,18 @@ std::optional<FileFormat> formatOfContent(ByteView file) {
 }
 
 std::optional<FileFormat> formatOfExtension(const std::filesystem::path& path) {
-    std::string text = path.extension().string();
-    std::transform(text.begin(), text.end(), text.begin(),
-                   [](unsigned char c) { return static_cast<char>(std::tolower(c)); });
+    const std::string text = extensionOf(path);
     for (const Extension& extension : kExtensions)
         if (extension.text == text)
             return extension.format;
     return std::nullopt;
+}
+
+std::optional<std::string> heifCodec(const std::filesystem::path& path) {
+    const std::string text = extensionOf(path);
+    if (text == ".avif")
+        return "av1";
+    return text == ".heic" ? std::optional<std::string>("hevc") : std::nullopt;
 }
 
 std::string pixelName(ColorModel model, int depth) {

@@ -13,6 +13,9 @@ std::optional<FileFormat> formatOfContent(ByteView file);
 /// The format that a file name asks for by its extension, in any case; none for other extensions.
 std::optional<FileFormat> formatOfExtension(const std::filesystem::path& path);
 
+/// The codec that the extension of a HEIF asks for, "hevc" or "av1"; none for one that is any codec's.
+std::optional<std::string> heifCodec(const std::filesystem::path& path);
+
 /// "8-bit CMYK" and the like, for messages.
 std::string pixelName(ColorModel model, int depth);
 

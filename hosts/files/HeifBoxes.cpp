@@ -1,7 +1,8 @@
 #include "files/HeifBoxes.h"
 
+#include <algorithm>
+#include <array>
 #include <map>
-#include <stdexcept>
 #include <string_view>
 
 namespace orvela {
@@ -10,34 +11,9 @@ namespace {
 
 using Items = std::vector<std::uint32_t>;
 
-/// Takes numbers, most significant byte first, off the front of bytes.
-class Cursor {
-public:
-    explicit Cursor(ByteView bytes) : mBytes(bytes) {}
-
-    bool isAtEnd() const { return mBytes.empty(); }
-
-    /// @throws std::out_of_range behind the end
-    ByteView take(std::uint64_t size) {
-        if (size > mBytes.size())
-            throw std::out_of_range("a box is cut short");
-        const ByteView taken = mBytes.first(static_cast<std::size_t>(size));
-        mBytes = mBytes.subspan(static_cast<std::size_t>(size));
-        return taken;
-    }
-    std::uint64_t number(std::uint64_t size) {
-        std::uint64_t value = 0;
-        for (const std::uint8_t byte : take(size))
-            value = value << 8 | byte;
-        return value;
-    }
-    std::uint32_t id(bool wide) { return static_cast<std::uint32_t>(number(wide ? 4 : 2)); }
-
-    ByteView rest() const { return mBytes; }
-
-private:
-    ByteView mBytes;
-};
+std::uint32_t idIn(Cursor& cursor, bool wide) {
+    return static_cast<std::uint32_t>(cursor.number(wide ? 4 : 2));
+}
 
 struct Box {
     std::string_view type;
@@ -54,8 +30,8 @@ Box nextBox(Cursor& cursor) {
     if (size == 0)
         size = whole; // up to the end
     if (size < head)
-        throw std::out_of_range("a box is smaller than its head");
-    return {{reinterpret_cast<const char*>(type.data()), type.size()}, cursor.take(size - head)};
+        throw DamagedBytes("a box is smaller than its head");
+    return {asText(type), cursor.take(size - head)};
 }
 
 std::vector<Box> boxesOf(ByteView content) {
@@ -86,7 +62,7 @@ struct FullBox {
 
 std::uint32_t primaryItem(ByteView pitm) {
     FullBox box(pitm);
-    return box.content.id(box.version > 0);
+    return idIn(box.content, box.version > 0);
 }
 
 // The items that an item is put together from, in order; none when it is coded itself.
@@ -98,11 +74,11 @@ Items partsOf(ByteView meta, std::uint32_t item) {
         const bool wide = box.version > 0;
         for (const Box& reference : boxesOf(box.content.rest())) {
             Cursor cursor(reference.content);
-            if (reference.type != "dimg" || cursor.id(wide) != item)
+            if (reference.type != "dimg" || idIn(cursor, wide) != item)
                 continue;
-            Items parts(cursor.id(false));
+            Items parts(idIn(cursor, false));
             for (std::uint32_t& part : parts)
-                part = cursor.id(wide);
+                part = idIn(cursor, wide);
             return parts;
         }
     }
@@ -116,8 +92,8 @@ std::map<std::uint32_t, std::uint64_t> itemSizes(ByteView iloc) {
     const std::uint64_t fields = cursor.number(2);
     const auto width = [&](int field) { return fields >> (12 - 4 * field) & 15; };
     std::map<std::uint32_t, std::uint64_t> sizes;
-    for (std::uint32_t count = cursor.id(box.version == 2); count > 0; --count) {
-        const std::uint32_t item = cursor.id(box.version == 2);
+    for (std::uint32_t count = idIn(cursor, box.version == 2); count > 0; --count) {
+        const std::uint32_t item = idIn(cursor, box.version == 2);
         if (box.version > 0)
             cursor.take(2); // where the offsets count from
         cursor.take(2 + width(2));
@@ -134,7 +110,7 @@ Items propertiesOf(ByteView ipma, std::uint32_t item) {
     FullBox box(ipma);
     const bool wide = (box.flags & 1) != 0;
     for (std::uint64_t count = box.content.number(4); count > 0; --count) {
-        const bool found = box.content.id(box.version > 0) == item;
+        const bool found = idIn(box.content, box.version > 0) == item;
         Items properties(box.content.number(1));
         for (std::uint32_t& property : properties)
             property = static_cast<std::uint32_t>(box.content.number(wide ? 2 : 1)) & (wide ? 0x7FFF : 0x7F);
@@ -142,6 +118,14 @@ Items propertiesOf(ByteView ipma, std::uint32_t item) {
             return properties;
     }
     return {};
+}
+
+std::vector<Box> chosen(const std::vector<Box>& all, const Items& numbers) {
+    std::vector<Box> boxes;
+    for (const std::uint32_t number : numbers)
+        if (number > 0 && number <= all.size())
+            boxes.push_back(all[number - 1]);
+    return boxes;
 }
 
 Chroma chromaOf(const Box& configuration) {
@@ -156,9 +140,20 @@ Chroma chromaOf(const Box& configuration) {
     return format == 3 ? Chroma::Full : format == 2 ? Chroma::HalfWidth : Chroma::Half;
 }
 
+// What tells how a picture is coded, shaped and turned, and what metadata speak of.
+bool isKnown(const Box& property) {
+    constexpr std::array<std::string_view, 12> names = {"ispe", "pixi", "hvcC", "av1C", "colr", "irot",
+                                                        "imir", "clap", "auxC", "rloc", "lsel", "a1lx"};
+    if (std::find(names.begin(), names.end(), property.type) != names.end())
+        return true;
+    Cursor cursor(property.content);
+    return property.type == "pasp" && cursor.number(4) == cursor.number(4); // pixels are square anyway
+}
+
 HeifCoding codingOf(ByteView file) {
     const ByteView meta = FullBox(boxIn(file, "meta")).content.rest();
-    Items items = {primaryItem(boxIn(meta, "pitm"))};
+    const std::uint32_t primary = primaryItem(boxIn(meta, "pitm"));
+    Items items = {primary};
     // A picture of tiles may itself be turned or framed by another item.
     for (int depth = 0; depth < 3; ++depth) {
         Items parts = partsOf(meta, items[0]);
@@ -172,16 +167,29 @@ HeifCoding codingOf(ByteView file) {
         coding.bytes += sizes[item];
     const ByteView properties = boxIn(meta, "iprp");
     const std::vector<Box> all = boxesOf(boxIn(properties, "ipco"));
-    for (const std::uint32_t number : propertiesOf(boxIn(properties, "ipma"), items[0])) {
-        if (number == 0 || number > all.size())
-            continue;
-        const Box& property = all[number - 1];
+    const ByteView ipma = boxIn(properties, "ipma");
+    for (const Box& property : chosen(all, propertiesOf(ipma, items[0])))
         if (property.type == "hvcC" || property.type == "av1C") {
             coding.isAv1 = property.type == "av1C";
             coding.chroma = chromaOf(property);
         }
-    }
+    for (const Box& property : chosen(all, propertiesOf(ipma, primary)))
+        if (!isKnown(property))
+            coding.otherProperties.emplace_back(property.type);
     return coding;
+}
+
+// Of a track of the kind that is no film.
+int framesOf(ByteView track) {
+    const ByteView media = boxIn(track, "mdia");
+    Cursor handler(boxIn(media, "hdlr"));
+    handler.take(8);
+    constexpr std::uint32_t picture = 0x70696374; // "pict"
+    if (handler.number(4) != picture)
+        return 0;
+    Cursor sizes(boxIn(boxIn(boxIn(media, "minf"), "stbl"), "stsz"));
+    sizes.take(8);
+    return static_cast<int>(std::min<std::uint64_t>(sizes.number(4), INT32_MAX));
 }
 
 } // namespace
@@ -189,9 +197,26 @@ HeifCoding codingOf(ByteView file) {
 std::optional<HeifCoding> heifCoding(ByteView file) {
     try {
         return codingOf(file);
-    } catch (const std::out_of_range&) {
+    } catch (const DamagedBytes&) {
         return std::nullopt;
     }
+}
+
+HeifPictures heifPictures(ByteView file) {
+    HeifPictures pictures;
+    try {
+        for (Cursor cursor(file); !cursor.isAtEnd();) {
+            const Box box = nextBox(cursor);
+            pictures.still = pictures.still || box.type == "meta";
+            if (box.type == "moov")
+                for (const Box& track : boxesOf(box.content))
+                    if (track.type == "trak")
+                        pictures.frames = std::max(pictures.frames, framesOf(track.content));
+        }
+    } catch (const DamagedBytes&) {
+        // What was found before stays found.
+    }
+    return pictures;
 }
 
 } // namespace orvela

@@ -5,7 +5,11 @@
 #include "files/HeifBoxes.h"
 #include "files/HeifLibrary.h"
 #include "files/HeifRate.h"
+#include "files/Memory.h"
+#include "metadata/ExifBlock.h"
 
+#include <algorithm>
+#include <array>
 #include <cstring>
 
 namespace orvela {
@@ -15,6 +19,7 @@ namespace {
 namespace fs = std::filesystem;
 
 using HeifEncoder = HeifPointer<heif_encoder, heif_encoder_release>;
+using HeifColors = HeifPointer<heif_color_profile_nclx, heif_nclx_color_profile_free>;
 using HeifEncodingOptions = HeifPointer<heif_encoding_options, heif_encoding_options_free>;
 
 constexpr int kQuality = 90;
@@ -29,13 +34,18 @@ struct Settings {
     Chroma chroma = Chroma::Full;
     int bitDepth = 8;
     int quality = 0;
+    int orientation = 1; ///< as Exif counts
+    std::optional<ColorCodes> colors;
 };
 
-Settings settingsFor(const Photograph& photograph, const fs::path& target, const WriteOptions& options) {
+Settings settingsFor(const Photograph& photograph, const fs::path& target, const WriteOptions& options,
+                     const Metadata& metadata) {
     const Encoding& source = photograph.encoding;
     const bool known = source.format == FileFormat::Heif;
     Settings settings;
-    settings.isAv1 = target.extension() == ".avif" || (known && source.compression == "av1");
+    settings.isAv1 = heifCodec(target).value_or(known ? source.compression : "hevc") == "av1";
+    settings.orientation = ExifBlock(metadata.exif).orientation();
+    settings.colors = metadata.colors;
     settings.chroma = known ? source.chroma : Chroma::Full;
     if (options.chromaSubsampled)
         settings.chroma = *options.chromaSubsampled ? Chroma::Half : Chroma::Full;
@@ -88,6 +98,22 @@ HeifEncoder encoderFor(heif_context* context, const Settings& settings, int qual
     return encoder;
 }
 
+// Numbers that the library does not know are left out, which reading the file back shows. How RGB becomes
+// brightness and colour is this encoder's choice.
+HeifColors colorsOf(const ColorCodes& codes) {
+    constexpr std::array<std::uint16_t, 3> matrices = {1, 6, 9}; // BT.709, BT.601, BT.2020
+    const bool known = std::find(matrices.begin(), matrices.end(), codes.matrix) != matrices.end();
+    HeifColors colors(heif_nclx_color_profile_alloc());
+    if (!colors)
+        throw std::bad_alloc();
+    static_cast<void>(heif_nclx_color_profile_set_color_primaries(colors.get(), codes.primaries));
+    static_cast<void>(heif_nclx_color_profile_set_transfer_characteristics(colors.get(), codes.transfer));
+    checkHeif(
+        heif_nclx_color_profile_set_matrix_coefficients(colors.get(), known ? codes.matrix : matrices[1]));
+    colors->full_range_flag = 1;
+    return colors;
+}
+
 void addMetadata(heif_context* context, heif_image_handle* handle, const Metadata& metadata) {
     if (!metadata.exif.empty()) {
         Bytes exif = {'E', 'x', 'i', 'f', 0, 0};
@@ -113,11 +139,24 @@ Bytes encode(const Photograph& photograph, const Settings& settings, int quality
     if (!profile.empty())
         checkHeif(heif_image_set_raw_color_profile(image.get(), "prof", profile.data(), profile.size()));
     const HeifEncodingOptions encoding(heif_encoding_options_alloc());
+    encoding->image_orientation = static_cast<heif_orientation>(settings.orientation);
+    const HeifColors colors = settings.colors ? colorsOf(*settings.colors) : nullptr;
+    if (colors) {
+        checkHeif(heif_image_set_nclx_color_profile(image.get(), colors.get()));
+        encoding->output_nclx_profile = colors.get();
+        encoding->save_two_colr_boxes_when_ICC_and_nclx_available = 1;
+        encoding->macOS_compatibility_workaround_no_nclx_profile = 0;
+    }
+    const HeifEncoder encoder = encoderFor(context.get(), settings, quality);
     heif_image_handle* made = nullptr;
-    checkHeif(heif_context_encode_image(context.get(), image.get(),
-                                        encoderFor(context.get(), settings, quality).get(), encoding.get(),
-                                        &made));
+    checkHeif(heif_context_encode_image(context.get(), image.get(), encoder.get(), encoding.get(), &made));
     const HeifHandle handle(made);
+    if (metadata.heifThumbnail > 0) {
+        heif_image_handle* thumbnail = nullptr; // null for a picture that is as small itself
+        checkHeif(heif_context_encode_thumbnail(context.get(), image.get(), made, encoder.get(),
+                                                encoding.get(), metadata.heifThumbnail, &thumbnail));
+        const HeifHandle owner(thumbnail);
+    }
     addMetadata(context.get(), made, metadata);
     Bytes bytes;
     heif_writer writer{1, append};
@@ -142,7 +181,7 @@ int qualityFor(const Photograph& photograph, const Settings& settings) {
 
 Bytes encodeHeif(const Photograph& photograph, const fs::path& target, const WriteOptions& options,
                  const Metadata& metadata) {
-    const Settings settings = settingsFor(photograph, target, options);
+    const Settings settings = settingsFor(photograph, target, options, metadata);
     try {
         ChildProcess child([&](const ChildProcess::Sink& sink) {
             const Bytes bytes = encode(photograph, settings, qualityFor(photograph, settings), metadata);
@@ -154,7 +193,7 @@ Bytes encodeHeif(const Photograph& photograph, const fs::path& target, const Wri
         return bytes;
     } catch (const ChildFailure& failure) {
         // The encoder has no words of its own for want of memory.
-        if (isBeyondMemory(kEncoderBytes + photograph.samples.size() / 3 * kEncoderBytesPerPixel))
+        if (kEncoderBytes + photograph.samples.size() / 3 * kEncoderBytesPerPixel > obtainableMemory())
             throw std::bad_alloc();
         throw PhotographError(target.string() + ": HEIF encoding failed (" + failure.what() +
                               "); choose other settings or another format");

@@ -4,11 +4,13 @@
 
 namespace orvela {
 
-/// The picture as the bytes of a HEIF file with its ICC profile and the Exif and XMP of `metadata`.
-/// Compression, chroma, bit depth and the bytes per pixel are those of a HEIF source where the options say
-/// nothing. A child process encodes.
+/// The picture as the bytes of a HEIF file with its ICC profile.
+/// Compression, chroma, bit depth and the bytes per pixel are those of a HEIF source where the options and
+/// the target's extension say nothing. Readers turn the picture by properties of its own, not by Exif, so
+/// that it gets these. A child process encodes.
 /// @param photograph  RGB with or without transparency
-/// @param target      for messages; .avif asks for AV1 compression
+/// @param target      for messages; .avif asks for AV1 compression, .heic for HEVC
+/// @param metadata    its Exif and XMP, codes of colours and whether there is to be a thumbnail
 /// @throws PhotographError when the picture cannot be encoded
 /// @throws StoppedError when `options.stop` was set
 /// @throws std::bad_alloc

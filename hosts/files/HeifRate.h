@@ -20,9 +20,8 @@ inline constexpr int kLowestHeifQuality = 25;
 inline constexpr int kHighestHeifQuality = 95;
 
 /// The quality at which a picture takes about as many bytes per pixel as given.
-/// @param encode  bytes per pixel that the sample takes at a quality; rises with it; called three times at
-/// the
-///                most
+/// @param encode  bytes per pixel that the sample takes at a quality; rises with it; called five times at the
+/// most
 int matchingQuality(double bytesPerPixel, const std::function<double(int)>& encode);
 
 } // namespace orvela

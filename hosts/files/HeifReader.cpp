@@ -4,6 +4,7 @@
 #include "files/HeifBoxes.h"
 #include "files/HeifLibrary.h"
 #include "files/HeifRate.h"
+#include "files/Memory.h"
 #include "files/Refusal.h"
 
 #include <algorithm>
@@ -25,7 +26,6 @@ struct Head {
     std::int32_t height;
     std::int32_t bits;
     std::int32_t hasAlpha;
-    std::int32_t pictures;
     std::uint64_t profileSize;
 };
 
@@ -50,6 +50,14 @@ private:
     HeifHandle mHandle;
 };
 
+// The colours of RGB with a transparency that is multiplied in.
+template <typename Sample>
+void divideByAlpha(Sample* samples, std::size_t count, unsigned most) {
+    for (std::size_t i = 0; i < count; ++i)
+        if (const unsigned alpha = samples[i | 3]; i % 4 != 3 && alpha > 0)
+            samples[i] = static_cast<Sample>(std::min(most, (samples[i] * most + alpha / 2) / alpha));
+}
+
 Bytes Decoder::profile() const {
     const heif_color_profile_type type = heif_image_handle_get_color_profile_type(mHandle.get());
     if (type != heif_color_profile_type_prof && type != heif_color_profile_type_rICC)
@@ -61,12 +69,9 @@ Bytes Decoder::profile() const {
 
 void Decoder::send(const ChildProcess::Sink& sink) const {
     const Bytes icc = profile();
-    const Head head{heif_image_handle_get_width(mHandle.get()),
-                    heif_image_handle_get_height(mHandle.get()),
+    const Head head{heif_image_handle_get_width(mHandle.get()), heif_image_handle_get_height(mHandle.get()),
                     heif_image_handle_get_luma_bits_per_pixel(mHandle.get()),
-                    heif_image_handle_has_alpha_channel(mHandle.get()),
-                    heif_context_get_number_of_top_level_images(mContext.get()),
-                    icc.size()};
+                    heif_image_handle_has_alpha_channel(mHandle.get()), icc.size()};
     sink.send(head);
     sink.send(icc.data(), icc.size());
     sendSamples(sink, head);
@@ -82,15 +87,21 @@ void Decoder::sendSamples(const ChildProcess::Sink& sink, const Head& head) cons
         heif_image_get_height(decoded, heif_channel_interleaved) != head.height)
         throw std::runtime_error("the picture has other dimensions than the file says");
     int stride = 0;
-    const std::uint8_t* plane = heif_image_get_plane_readonly(decoded, heif_channel_interleaved, &stride);
+    std::uint8_t* plane = heif_image_get_plane(decoded, heif_channel_interleaved, &stride);
+    const bool multiplied =
+        head.hasAlpha != 0 && heif_image_handle_is_premultiplied_alpha(mHandle.get()) != 0;
     std::vector<std::uint16_t> row(static_cast<std::size_t>(head.width) * (head.hasAlpha != 0 ? 4 : 3));
     for (int y = 0; y < head.height; ++y) {
-        const std::uint8_t* line = plane + static_cast<std::ptrdiff_t>(y) * stride;
+        std::uint8_t* line = plane + static_cast<std::ptrdiff_t>(y) * stride;
         if (!deep) {
+            if (multiplied)
+                divideByAlpha(line, row.size(), 255);
             sink.send(line, row.size());
             continue;
         }
         std::memcpy(row.data(), line, row.size() * 2);
+        if (multiplied)
+            divideByAlpha(row.data(), row.size(), (1U << head.bits) - 1);
         // Repeating the high bits below the low ones makes full scale 65535.
         for (std::uint16_t& sample : row)
             sample = static_cast<std::uint16_t>(sample << (16 - head.bits) | sample >> (2 * head.bits - 16));
@@ -104,48 +115,49 @@ void takeCoding(Photograph& photograph, ByteView file) {
     photograph.encoding.chroma = coding ? coding->chroma : Chroma::Half;
     if (!coding)
         return;
+    for (const std::string& property : coding->otherProperties)
+        photograph.unheld.push_back("the HEIF property " + property);
     const double pixels = static_cast<double>(photograph.width) * photograph.height;
     photograph.encoding.heifRate = std::make_shared<const HeifRate>(
         HeifRate{heifSample(photograph), static_cast<double>(coding->bytes) / pixels});
 }
 
-Photograph receive(ChildProcess& child, const fs::path& path, std::uint64_t& pixels) {
+Photograph receive(ChildProcess& child, ByteView file, const fs::path& path, const ReadLimits& limits,
+                   std::uint64_t& pixels) {
     const Head head = child.receive<Head>();
     Photograph photograph;
     photograph.source = path;
     photograph.width = head.width;
     photograph.height = head.height;
-    checkEdges(head.width, head.height, path);
     pixels = static_cast<std::uint64_t>(head.width) * static_cast<std::uint64_t>(head.height);
     if (head.bits < 8 || head.bits > 16)
         refuse(path, "has an unknown number of bits per sample", "save it with 8, 10 or 12 bits");
     photograph.depth = head.bits > 8 ? 16 : 8;
     photograph.model = head.hasAlpha != 0 ? ColorModel::RgbAlpha : ColorModel::Rgb;
-    photograph.pages = std::max(1, head.pictures);
+    checkPicture({head.width, head.height, sampleBytes(photograph), file.size()}, path, limits);
     photograph.encoding.format = FileFormat::Heif;
     photograph.encoding.bitDepth = head.bits;
     photograph.iccProfile.resize(head.profileSize);
     child.receive(photograph.iccProfile.data(), head.profileSize);
-    photograph.samples.resize(pixels * static_cast<std::uint64_t>(samplesPerPixel(photograph.model)) *
-                              static_cast<std::uint64_t>(photograph.depth / 8));
+    photograph.samples.resize(pixels * sampleBytes(photograph));
     child.receive(photograph.samples.data(), photograph.samples.size());
     return photograph;
 }
 
 } // namespace
 
-Photograph readHeif(ByteView file, const fs::path& path) {
+Photograph readHeif(ByteView file, const fs::path& path, const ReadLimits& limits) {
     std::uint64_t pixels = 0;
     try {
         ChildProcess child([&](const ChildProcess::Sink& sink) { Decoder(file).send(sink); });
-        Photograph photograph = receive(child, path, pixels);
+        Photograph photograph = receive(child, file, path, limits, pixels);
         takeCoding(photograph, file);
         return photograph;
     } catch (const ChildFailure& failure) {
         // The decoder has no words of its own for want of memory.
-        if (isBeyondMemory(kDecoderBytes + pixels * kDecoderBytesPerPixel))
+        if (kDecoderBytes + pixels * kDecoderBytesPerPixel > obtainableMemory())
             throw std::bad_alloc();
-        refuse(path, std::string("is damaged or cut short (") + failure.what() + ")", kCopyAgain);
+        refuseUnread(path, failure.what());
     }
 }
 

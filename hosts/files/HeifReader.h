@@ -1,5 +1,6 @@
 #pragma once
 
+#include "files/DeclaredPicture.h"
 #include "files/FileFormat.h"
 
 namespace orvela {
@@ -8,7 +9,7 @@ namespace orvela {
 /// child process decodes it.
 /// @param path  for messages and as the source of the result
 /// @throws PhotographError for files that are cut short or damaged
-/// @throws std::bad_alloc
-Photograph readHeif(ByteView file, const std::filesystem::path& path);
+/// @throws MemoryError, std::bad_alloc
+Photograph readHeif(ByteView file, const std::filesystem::path& path, const ReadLimits& limits = {});
 
 } // namespace orvela

@@ -213,7 +213,8 @@ void Encoder::configure() {
     if (mPhotograph.model == ColorModel::Cmyk)
         mJpeg.write_Adobe_marker =
             mLayout.adobeMarker || mLayout.color == JpegLayout::Color::Ycck ? TRUE : FALSE;
-    mJpeg.optimize_coding = TRUE;
+    mJpeg.arith_code = mLayout.arithmetic ? TRUE : FALSE;
+    mJpeg.optimize_coding = mLayout.arithmetic ? FALSE : TRUE;
     for (int i = 0; i < mJpeg.num_components; ++i) {
         mJpeg.comp_info[i].h_samp_factor = mLayout.components[static_cast<std::size_t>(i)].horizontal;
         mJpeg.comp_info[i].v_samp_factor = mLayout.components[static_cast<std::size_t>(i)].vertical;

@@ -6,8 +6,8 @@
 #include <jerror.h>
 
 #include <algorithm>
-#include <map>
-#include <string_view>
+#include <cstdlib>
+#include <memory>
 
 namespace orvela {
 
@@ -16,13 +16,16 @@ namespace {
 namespace fs = std::filesystem;
 
 constexpr int kProfileMarker = JPEG_APP0 + 2;
+constexpr int kMostScans = 1000; // programs write some ten; a short file may hold so many that it takes hours
 
 class Decoder {
 public:
-    Decoder(ByteView file, const fs::path& path) : mPath(path) {
+    Decoder(ByteView file, const fs::path& path) : mFile(file), mPath(path) {
         mJpeg.err = mErrors.manager();
         attempt([&] {
             jpeg_create_decompress(&mJpeg);
+            mProgress.progress_monitor = watch;
+            mJpeg.progress = &mProgress;
             jpeg_mem_src(&mJpeg, file.data(), file.size());
             jpeg_save_markers(&mJpeg, kProfileMarker, 0xFFFF);
             jpeg_read_header(&mJpeg, TRUE);
@@ -32,20 +35,30 @@ public:
     Decoder(const Decoder&) = delete;
     Decoder& operator=(const Decoder&) = delete;
 
-    void readPicture(Photograph& photograph);
-    Bytes profile() const;
+    void readPicture(Photograph& photograph, const ReadLimits& limits);
+    void readProfile(Photograph& photograph);
     Encoding encoding();
 
 private:
+    static void watch(j_common_ptr jpeg);
     template <typename Work>
     void attempt(const Work& work);
     ColorModel model() const;
+    DeclaredPicture declared() const;
     JpegLayout::Color color() const;
 
+    const ByteView mFile;
     const fs::path& mPath;
     JpegErrors mErrors;
+    jpeg_progress_mgr mProgress{};
     jpeg_decompress_struct mJpeg{};
 };
+
+// The library looks here after every row of blocks of every scan.
+void Decoder::watch(j_common_ptr jpeg) {
+    if (reinterpret_cast<j_decompress_ptr>(jpeg)->input_scan_number > kMostScans)
+        ERREXIT(jpeg, JERR_CANT_SUSPEND);
+}
 
 template <typename Work>
 void Decoder::attempt(const Work& work) {
@@ -56,7 +69,12 @@ void Decoder::attempt(const Work& work) {
     mErrors.throwIfOutOfMemory();
     if (mErrors.code() == JWRN_JPEG_EOF)
         refuse(mPath, "the file is cut short", kCopyAgain);
-    refuse(mPath, "is damaged or cut short (" + mErrors.text() + ")", kCopyAgain);
+    if (mErrors.code() == JERR_CANT_SUSPEND) // see watch()
+        refuse(mPath, "is damaged: it has over " + std::to_string(kMostScans) + " scans", kCopyAgain);
+    if (mErrors.code() == JERR_BAD_PRECISION || mErrors.code() == JERR_SOF_UNSUPPORTED)
+        refuse(mPath, "is a kind of JPEG that cannot be read (" + mErrors.text() + ")",
+               "save it as a JPEG of 8 bits or as a TIFF");
+    refuseUnread(mPath, mErrors.text());
 }
 
 ColorModel Decoder::model() const {
@@ -88,11 +106,23 @@ JpegLayout::Color Decoder::color() const {
     }
 }
 
-void Decoder::readPicture(Photograph& photograph) {
+// Each block of 64 pixels takes a bit at least, unless its coding is arithmetic.
+DeclaredPicture Decoder::declared() const {
+    DeclaredPicture picture;
+    picture.width = mJpeg.image_width;
+    picture.height = mJpeg.image_height;
+    picture.sampleBytes = static_cast<std::uint64_t>(samplesPerPixel(model()));
+    picture.fileBytes = mFile.size();
+    if (mJpeg.arith_code == 0)
+        picture.mostPixelsPerByte = 64 * 8;
+    return picture;
+}
+
+void Decoder::readPicture(Photograph& photograph, const ReadLimits& limits) {
+    checkPicture(declared(), mPath, limits);
     photograph.model = model();
     photograph.width = static_cast<int>(mJpeg.image_width);
     photograph.height = static_cast<int>(mJpeg.image_height);
-    checkEdges(photograph.width, photograph.height, mPath);
     const std::size_t row = mJpeg.image_width * static_cast<std::size_t>(samplesPerPixel(photograph.model));
     photograph.samples.resize(row * mJpeg.image_height);
     attempt([&] {
@@ -116,6 +146,7 @@ Encoding Decoder::encoding() {
     encoding.progressive = mJpeg.progressive_mode != 0;
     JpegLayout& layout = encoding.jpeg.emplace();
     layout.color = color();
+    layout.arithmetic = mJpeg.arith_code != 0;
     layout.adobeMarker = mJpeg.num_components == 4 && mJpeg.saw_Adobe_marker != 0;
     for (int i = 0; i < mJpeg.num_components; ++i) {
         const jpeg_component_info& info = mJpeg.comp_info[i];
@@ -130,31 +161,24 @@ Encoding Decoder::encoding() {
     return encoding;
 }
 
-// The parts by their numbers, up to the first that is missing.
-Bytes Decoder::profile() const {
-    using namespace std::string_view_literals;
-    constexpr std::string_view signature = "ICC_PROFILE\0"sv;
-    constexpr std::size_t head = signature.size() + 2; // with the number of the part and of all parts
-    std::map<int, ByteView> parts;
-    for (jpeg_saved_marker_ptr marker = mJpeg.marker_list; marker != nullptr; marker = marker->next) {
-        const ByteView data(marker->data, marker->data_length);
-        if (data.size() > head && std::equal(signature.begin(), signature.end(), data.begin()))
-            parts[data[signature.size()]] = data.subspan(head);
-    }
-    Bytes profile;
-    for (int number = 1; parts.contains(number); ++number)
-        profile.insert(profile.end(), parts[number].begin(), parts[number].end());
-    return profile;
+void Decoder::readProfile(Photograph& photograph) {
+    JOCTET* data = nullptr;
+    unsigned size = 0;
+    attempt([&] { jpeg_read_icc_profile(&mJpeg, &data, &size); });
+    const std::unique_ptr<JOCTET, decltype(&std::free)> owner(data, std::free);
+    photograph.iccProfile.assign(data, data + size);
+    if (data == nullptr && mErrors.code() == JWRN_BOGUS_ICC)
+        photograph.unheld.emplace_back("the ICC profile, which is damaged");
 }
 
 } // namespace
 
-Photograph readJpeg(ByteView file, const fs::path& path) {
+Photograph readJpeg(ByteView file, const fs::path& path, const ReadLimits& limits) {
     Photograph photograph;
     photograph.source = path;
     Decoder decoder(file, path);
-    photograph.iccProfile = decoder.profile();
-    decoder.readPicture(photograph);
+    decoder.readProfile(photograph);
+    decoder.readPicture(photograph, limits);
     return photograph;
 }
 

@@ -25,6 +25,12 @@ public:
     using PhotographError::PhotographError;
 };
 
+/// The memory does not suffice: see PhotographError.
+class MemoryError : public PhotographError {
+public:
+    using PhotographError::PhotographError;
+};
+
 /// Reading or writing ended early because it was asked to stop; nothing was left behind.
 class StoppedError : public PhotographError {
 public:
@@ -47,6 +53,10 @@ constexpr int samplesPerPixel(ColorModel model) {
     }
 }
 
+constexpr bool hasAlpha(ColorModel model) {
+    return model == ColorModel::GreyAlpha || model == ColorModel::RgbAlpha;
+}
+
 /// How the components of a JPEG are stored.
 struct JpegLayout {
     enum class Color { Grey, YCbCr, Rgb, Cmyk, Ycck };
@@ -63,6 +73,7 @@ struct JpegLayout {
     Color color = Color::YCbCr;
     bool adobeMarker = false; ///< CMYK and YCCK: whether it is marked as such
     std::vector<Component> components;
+    bool arithmetic = false; ///< coded arithmetically instead of by Huffman's tables
 
     bool operator==(const JpegLayout&) const = default;
 };
@@ -90,6 +101,10 @@ struct Encoding {
 /// How a page of a TIFF is stored and what it holds beside its picture. See TiffPage.h.
 struct TiffPage;
 
+/// Notes on what reading makes of the samples.
+inline constexpr char kPaletteNote[] = "its palette was resolved";
+inline constexpr char kBitsNote[] = "its samples were expanded to 8 bits";
+
 /// A photograph in memory: interleaved samples, rows from the top without padding, 8 bits or native 16 bits
 /// each. CMYK samples are raw ink values, 0 without ink; where a format stores them inverted, the inversion
 /// is undone on reading and done again on writing.
@@ -98,6 +113,7 @@ struct Photograph {
     int height = 0;
     int depth = 8; ///< bits per sample, 8 or 16 (0 to 65535)
     ColorModel model = ColorModel::Rgb;
+    bool extraChannel = false; ///< what stands in the place of transparency is none: a saved selection, ...
     std::vector<std::uint8_t> samples;    ///< width * height * samplesPerPixel(model) * depth / 8 bytes
     std::vector<std::uint8_t> iccProfile; ///< empty when there is none
     double xResolution = 0;               ///< pixels per millimetre; 0 when the file gives none

@@ -2,13 +2,19 @@
 
 #include "files/HeifEncoder.h"
 #include "files/JpegEncoder.h"
+#include "files/Memory.h"
 #include "files/Vips.h"
+
+#include <new>
 
 namespace orvela {
 
 namespace {
 
 namespace fs = std::filesystem;
+
+// What the encoders take at the most, lossless WebP most of all; what they say does not tell want of memory.
+constexpr std::uint64_t kEncoderBytesPerPixel = 64;
 
 struct GFree {
     void operator()(void* data) const { g_free(data); }
@@ -68,6 +74,10 @@ Bytes encodeWithVips(const Photograph& photograph, FileFormat format, const fs::
     const std::unique_ptr<void, GFree> owner(data);
     if (isAsked(options.stop))
         throw StoppedError(target.string() + ": stopped; nothing was written");
+    const auto pixels =
+        static_cast<std::uint64_t>(photograph.width) * static_cast<std::uint64_t>(photograph.height);
+    if (failed != 0 && obtainableMemory() < pixels * kEncoderBytesPerPixel)
+        throw std::bad_alloc();
     if (failed != 0)
         throw PhotographError(target.string() + ": " + formatName(format) + " encoding failed (" +
                               takeVipsError() + "); choose other settings or another format");

@@ -1,7 +1,7 @@
 #include "files/PhotographReader.h"
 
-#include "files/Animation.h"
-#include "files/EncodingProbe.h"
+#include "files/CameraRaw.h"
+#include "files/HeifBoxes.h"
 #include "files/HeifReader.h"
 #include "files/JpegReader.h"
 #include "files/PsdFile.h"
@@ -10,8 +10,13 @@
 #include "files/TiffReader.h"
 #include "files/VipsPhotograph.h"
 #include "metadata/MetadataReader.h"
+#include "metadata/PngMetadata.h"
+#include "metadata/WebPMetadata.h"
+
+#include <webp/decode.h>
 
 #include <algorithm>
+#include <limits>
 
 namespace orvela {
 
@@ -42,14 +47,24 @@ VipsImage* load(const Bytes& file, FileFormat format) {
     return image;
 }
 
-VipsHandle open(const fs::path& path, const Bytes& file, FileFormat format) {
+// libvips asks memory for the whole picture before it tells the size. What is damaged is left to it.
+void checkWebp(const fs::path& path, const Bytes& file, const ReadLimits& limits) {
+    WebPBitstreamFeatures features{};
+    if (WebPGetFeatures(file.data(), file.size(), &features) == VP8_STATUS_OK)
+        checkPicture({features.width, features.height, features.has_alpha != 0 ? 4U : 3U, file.size()}, path,
+                     limits);
+}
+
+VipsHandle open(const fs::path& path, const Bytes& file, FileFormat format, const ReadLimits& limits) {
     startVips();
     vips_error_clear();
-    if (format == FileFormat::Png && !pngIsComplete(file))
+    if (format == FileFormat::Png && !hasPngChunk(file, "IEND"))
         refuse(path, "the file is cut short", kCopyAgain);
+    if (format == FileFormat::WebP)
+        checkWebp(path, file, limits);
     VipsHandle image(load(file, format));
     if (!image)
-        refuseUnread(path);
+        refuseUnread(path, takeVipsError());
     return image;
 }
 
@@ -59,14 +74,35 @@ Encoding encodingOf(const Bytes& file, FileFormat format) {
     if (format == FileFormat::Png)
         encoding.progressive = file.size() > 28 && file[28] == 1;
     if (format == FileFormat::WebP)
-        encoding.lossless = webpIsLossless(file);
+        encoding.lossless = webpPictures(file).lossless;
     return encoding;
 }
 
-Photograph decodeFile(const Bytes& file, FileFormat format, const fs::path& path) {
-    const VipsHandle image = open(path, file, format);
+// Depth and kind of colour stand in the first chunk.
+void noteExpansion(Photograph& photograph, const Bytes& png) {
+    constexpr std::uint8_t palette = 3;
+    if (png.size() > 25 && png[25] == palette)
+        photograph.notes.emplace_back(kPaletteNote);
+    else if (png.size() > 25 && png[24] < 8)
+        photograph.notes.emplace_back(kBitsNote);
+}
+
+// Deflate makes at most 1032 bytes of one; the 25th byte tells the bits of a sample.
+double mostPixelsPerByte(const Bytes& file, FileFormat format) {
+    if (format == FileFormat::Png && file.size() > 24 && file[24] > 0)
+        return 1032.0 * 8 / file[24];
+    return std::numeric_limits<double>::infinity();
+}
+
+Photograph decodeFile(const Bytes& file, FileFormat format, const fs::path& path, const ReadLimits& limits) {
+    const VipsHandle image = open(path, file, format, limits);
     Photograph photograph = describeImage(path, image.get());
+    checkPicture({photograph.width, photograph.height, sampleBytes(photograph), file.size(),
+                  mostPixelsPerByte(file, format)},
+                 path, limits);
     photograph.encoding = encodingOf(file, format);
+    if (format == FileFormat::Png)
+        noteExpansion(photograph, file);
     takeSamples(photograph, path, image.get());
     return photograph;
 }
@@ -76,13 +112,17 @@ void refuseAnimation(const fs::path& path, const char* kind, int frames) {
            "--first-frame enhances the first");
 }
 
+void refuseCameraRaw(const fs::path& path) {
+    refuse(path, "is a camera's raw file", "develop it first, and enhance the TIFF or JPEG that you get");
+}
+
 // How many pictures the file shows one after the other.
 int framesOf(const fs::path& path, const Bytes& file, FileFormat format, bool firstOnly) {
     int frames = 1;
     if (format == FileFormat::Png)
         frames = pngFrames(file);
     if (format == FileFormat::WebP)
-        frames = webpFrames(file);
+        frames = webpPictures(file).frames;
     if (format == FileFormat::Heif) {
         const HeifPictures pictures = heifPictures(file);
         if (pictures.frames > 0 && !pictures.still)
@@ -104,16 +144,16 @@ void takeResolution(Photograph& photograph) {
     photograph.yResolution = density->y.value() / density->millimetres();
 }
 
-Photograph read(const Bytes& file, FileFormat format, const fs::path& path) {
+Photograph read(const Bytes& file, FileFormat format, const fs::path& path, const ReadLimits& limits) {
     switch (format) {
     case FileFormat::Jpeg:
-        return readJpeg(file, path);
+        return readJpeg(file, path, limits);
     case FileFormat::Heif:
-        return readHeif(file, path);
+        return readHeif(file, path, limits);
     case FileFormat::Psd:
-        return readPsd(file, path);
+        return readPsd(file, path, limits);
     default:
-        return decodeFile(file, format, path);
+        return decodeFile(file, format, path, limits);
     }
 }
 
@@ -121,8 +161,12 @@ Photograph read(const Bytes& file, FileFormat format, const fs::path& path) {
 
 PhotographReader::PhotographReader(const fs::path& path, const ReadOptions& options)
     : mOptions(options), mFile(std::make_unique<SourceFile>(path)) {
-    const std::optional<FileFormat> format =
-        formatOfContent(mFile->read(0, std::min<std::uint64_t>(mFile->size(), 16)));
+    if (mFile->size() == 0)
+        refuse(path, "the file is empty", kCopyAgain);
+    const Bytes head = mFile->read(0, std::min<std::uint64_t>(mFile->size(), 16));
+    if (isCameraRaw(head))
+        refuseCameraRaw(path);
+    const std::optional<FileFormat> format = formatOfContent(head);
     if (!format)
         refuse(path, "is not a picture of a known kind",
                "JPEG, PNG, TIFF, WebP, PSD and HEIF files can be read");
@@ -130,13 +174,15 @@ PhotographReader::PhotographReader(const fs::path& path, const ReadOptions& opti
     if (mFormat != FileFormat::Tiff)
         return;
     mTiff = std::make_unique<TiffFile>(*mFile, options.firstOnly ? 1 : TiffFile::kAll);
+    if (mTiff->isCameraRaw())
+        refuseCameraRaw(path);
     mPages = mTiff->pages();
 }
 
 PhotographReader::~PhotographReader() = default;
 
 Photograph PhotographReader::next() {
-    Photograph photograph = mTiff ? readTiffPage(*mFile, *mTiff, mNext) : readOther();
+    Photograph photograph = mTiff ? readTiffPage(*mFile, *mTiff, mNext, mOptions.limits) : readOther();
     photograph.source = mFile->path();
     photograph.encoding.format = mFormat;
     photograph.pages = mPages;
@@ -148,9 +194,10 @@ Photograph PhotographReader::next() {
 }
 
 Photograph PhotographReader::readOther() {
+    checkFileSize(mFile->size(), mFile->path(), mOptions.limits);
     const Bytes file = mFile->read(0, mFile->size());
     const int frames = framesOf(mFile->path(), file, mFormat, mOptions.firstOnly);
-    Photograph photograph = read(file, mFormat, mFile->path());
+    Photograph photograph = read(file, mFormat, mFile->path(), mOptions.limits);
     if (frames > 1)
         photograph.unheld.push_back(frames > 2 ? "the other " + std::to_string(frames - 1) + " frames"
                                                : "the other frame");

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "files/DeclaredPicture.h"
 #include "files/Photograph.h"
 
 #include <vector>
@@ -11,6 +12,7 @@ class TiffFile;
 
 struct ReadOptions {
     bool firstOnly = false; ///< of an animation or a file of several pages the first picture
+    ReadLimits limits = {}; ///< of each picture
 };
 
 /// Reads a JPEG, PNG, TIFF, WebP, PSD or HEIF file, recognised by its content, page by page: 8 or 16 bits;
@@ -20,9 +22,8 @@ struct ReadOptions {
 /// page; of a PSD the merged picture is read, of a HEIF the primary one.
 class PhotographReader {
 public:
-    /// @throws PhotographError when the file is missing, a folder, empty, unreadable, no picture, an
-    /// animation
-    ///         (unless asked for its first picture), or a TIFF with a damaged chain of pages
+    /// @throws PhotographError when the file is missing, a folder, empty, unreadable, no picture, a camera's
+    /// raw file, an animation (unless asked for its first picture), or a TIFF with a damaged chain of pages
     explicit PhotographReader(const std::filesystem::path& path, const ReadOptions& options = {});
     ~PhotographReader();
     PhotographReader(const PhotographReader&) = delete;
@@ -31,10 +32,10 @@ public:
     int pages() const { return mPages; }
 
     /// The next page: at first the first one, at most pages() of them.
-    /// @throws PhotographError when it is cut short or a picture that the filter cannot take: over 32767
-    /// pixels
-    ///         wide or high, more than four channels, floating point samples, Lab and other colour models
-    /// @throws std::bad_alloc when the memory does not suffice
+    /// @throws PhotographError when it is cut short, above the limits, or a picture that the filter cannot
+    ///         take: over 32767 pixels wide or high, more than four channels, floating point samples, Lab and
+    ///         other colour models
+    /// @throws MemoryError, std::bad_alloc when the memory does not suffice
     Photograph next();
 
 private:

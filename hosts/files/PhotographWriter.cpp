@@ -8,6 +8,7 @@
 #include "files/TiffFields.h"
 #include "files/TiffWriter.h"
 #include "metadata/MetadataWriter.h"
+#include "metadata/PngMetadata.h"
 
 #include <algorithm>
 
@@ -18,24 +19,21 @@ namespace {
 namespace fs = std::filesystem;
 
 FileFormat targetFormat(const Photograph& photograph, const fs::path& target) {
-    const std::optional<FileFormat> format = formatOfExtension(target);
-    if (!format)
-        throw PhotographError(target.string() + ": the extension \"" + target.extension().string() +
-                              "\" names no known format; use .jpg, .png, .tif, .webp or .heic");
-    const std::string obstacle = formatObstacle(*format, photograph);
+    const FileFormat format = writtenFormat(target);
+    const std::string obstacle = formatObstacle(format, photograph);
     if (!obstacle.empty())
         throw PhotographError(target.string() + ": " + obstacle);
-    if (photograph.pages > 1 && *format != FileFormat::Tiff)
-        throw PhotographError(target.string() + ": " + formatName(*format) + " cannot hold the " +
+    if (photograph.pages > 1 && format != FileFormat::Tiff)
+        throw PhotographError(target.string() + ": " + formatName(format) + " cannot hold the " +
                               std::to_string(photograph.pages) + " pages of " + photograph.source.string() +
                               "; choose a TIFF target, or --first-frame for the first page");
-    return *format;
+    return format;
 }
 
 PreparedMetadata metadataFor(const Photograph& photograph, FileFormat target) {
-    PreparedMetadata metadata =
-        prepareMetadata(photograph.metadata ? *photograph.metadata : Metadata(), target,
-                        {photograph.width, photograph.height, thumbnailsOf(photograph)});
+    PreparedMetadata metadata = prepareMetadata(
+        photograph.metadata ? *photograph.metadata : Metadata(), target,
+        {photograph.width, photograph.height, thumbnailsOf(photograph), !photograph.iccProfile.empty()});
     metadata.lost.insert(metadata.lost.end(), photograph.unheld.begin(), photograph.unheld.end());
     return metadata;
 }
@@ -49,7 +47,23 @@ bool hasMakerNote(const Bytes& exif) {
     return found != nullptr && found->find(tiff::MakerNote) != nullptr;
 }
 
+// Of the page that it comes from, if any.
+std::uint64_t storedCompression(const Photograph& photograph, const TiffStorage& storage) {
+    return photograph.tiffPage ? photograph.tiffPage->number(TIFFTAG_COMPRESSION, COMPRESSION_NONE)
+                               : storage.compression;
+}
+
 } // namespace
+
+FileFormat writtenFormat(const fs::path& target) {
+    const std::optional<FileFormat> format = formatOfExtension(target);
+    if (!format)
+        throw PhotographError(target.string() + ": the extension \"" + target.extension().string() +
+                              "\" names no known format; use .jpg, .png, .tif, .webp or .heic");
+    if (*format == FileFormat::Psd)
+        throw PhotographError(target.string() + ": " + formatObstacle(*format, {}));
+    return *format;
+}
 
 void checkTarget(const Photograph& photograph, const fs::path& target, const WriteOptions& options) {
     targetFormat(photograph, target);
@@ -92,15 +106,19 @@ void PhotographWriter::addPage(const Photograph& photograph, PreparedMetadata& p
     try {
         const TiffStorage storage = tiffStorage(photograph, mOptions);
         if (!hasBegun()) {
-            mFile = std::make_unique<TargetFile>(mTarget);
+            mFile = std::make_unique<TargetFile>(mTarget, mSource);
             mTiff = std::make_unique<TiffWriter>(*mFile, order, metadata.exif, mOptions.stop);
         } else if (hasMakerNote(metadata.exif)) {
             prepared.lost.emplace_back("what the maker note refers to by its place");
         }
-        if (photograph.copied)
+        if (photograph.copied) {
             mTiff->addCopy(photograph.tiffPage->blocks, copiedFields(*photograph.tiffPage));
-        else
+        } else {
+            if (mOptions.compression.empty() && storage.compression != storedCompression(photograph, storage))
+                prepared.lost.push_back(std::string("its kind of compression (") +
+                                        tiffCompressionName(storage.compression) + " is written)");
             mTiff->addPicture(photograph, storage, pageFields(photograph, metadata, order, prepared.lost));
+        }
     } catch (const TiffError& error) {
         throw PhotographError(mTarget.string() + ": TIFF encoding failed (" + error.what() +
                               "); choose other settings or another format");
@@ -110,7 +128,10 @@ void PhotographWriter::addPage(const Photograph& photograph, PreparedMetadata& p
 void PhotographWriter::addEncoded(const Photograph& photograph, PreparedMetadata& metadata) {
     Bytes encoded = encodePhotograph(photograph, metadata.target, mTarget, mOptions, metadata.metadata);
     embedMetadata(metadata, encoded);
-    mFile = std::make_unique<TargetFile>(mTarget);
+    // The library leaves out one that is damaged, or for other colours than the picture's.
+    if (metadata.target == FileFormat::Png && !photograph.iccProfile.empty() && !hasPngChunk(encoded, "iCCP"))
+        metadata.lost.emplace_back("the ICC profile, which does not suit its colours or is damaged");
+    mFile = std::make_unique<TargetFile>(mTarget, mSource);
     mFile->write(encoded, mOptions.stop);
 }
 
@@ -138,8 +159,10 @@ std::string PhotographWriter::prefix(const Note& note) const {
 std::vector<std::string> PhotographWriter::commit() {
     if (mTiff)
         mTiff->finish();
-    mFile->commit(mOptions.overwrite);
     std::vector<std::string> warnings;
+    if (mOptions.keepTime && !mFile->takeTimes(mSource))
+        warnings.push_back(mTarget.string() + ": the time stamps of the photograph could not be kept");
+    mFile->commit(mOptions.overwrite);
     for (const Note& note : mNotes)
         warnings.push_back(prefix(note) + note.text);
     return warnings;

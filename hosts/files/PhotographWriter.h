@@ -14,6 +14,7 @@ namespace orvela {
 /// and HEIF 90, full chroma resolution, LZW.
 struct WriteOptions {
     bool overwrite = false;                  ///< replace an existing target; never the source itself
+    bool keepTime = false;                   ///< the target gets the time stamps of the source
     int quality = 0;                         ///< JPEG, WebP, HEIF: 1 to 100; 0 as the source
     std::optional<bool> chromaSubsampled;    ///< JPEG, HEIF: colour at half resolution both ways, or at full
     std::optional<bool> lossless;            ///< WebP
@@ -21,6 +22,10 @@ struct WriteOptions {
     std::string compression;                 ///< TIFF: "none", "lzw", "deflate", "packbits", "zstd" or "jpeg"
     const std::atomic<bool>* stop = nullptr; ///< set it, also in a signal handler, to end the writing
 };
+
+/// The format that a target's name asks for.
+/// @throws PhotographError for an extension of no format, and for formats that are read only
+FileFormat writtenFormat(const std::filesystem::path& target);
 
 /// Whether writing the photograph there can succeed, as far as can be told without writing: the format can
 /// hold it, the target is not its source, not a folder and does not exist (unless it may be overwritten), and
@@ -38,7 +43,7 @@ class TiffWriter;
 /// files, or all pages of a TIFF one after the other, of which one at a time is in memory.
 /// The target appears whole or not at all: the bytes go to a temporary name in its folder, which is removed
 /// when the object dies, and take the final name once they are on the disk. Without `overwrite` a file that
-/// appears under the final name meanwhile is left alone.
+/// appears under the final name meanwhile is left alone. The target gets the permissions of the source.
 class PhotographWriter {
 public:
     PhotographWriter(std::filesystem::path target, const WriteOptions& options);

@@ -1,8 +1,11 @@
 #include "files/PsdFile.h"
 
 #include "files/Refusal.h"
+#include "metadata/ImageResources.h"
+#include "metadata/PsdMetadata.h"
 
 #include <algorithm>
+#include <limits>
 
 namespace orvela {
 
@@ -11,33 +14,6 @@ namespace {
 namespace fs = std::filesystem;
 
 enum Mode { Bitmap = 0, Gray = 1, Indexed = 2, RGB = 3, CMYK = 4 };
-enum Resource { IccProfile = 1039, VersionInfo = 1057 };
-
-/// Big-endian numbers and byte runs, from the start of a file to its end.
-class Cursor {
-public:
-    Cursor(ByteView bytes, const fs::path& path) : mBytes(bytes), mPath(path) {}
-
-    ByteView take(std::size_t count) {
-        if (count > mBytes.size())
-            refuse(mPath, "the file is cut short", kCopyAgain);
-        const ByteView taken = mBytes.first(count);
-        mBytes = mBytes.subspan(count);
-        return taken;
-    }
-    std::uint32_t number(std::size_t bytes) {
-        std::uint32_t value = 0;
-        for (const std::uint8_t byte : take(bytes))
-            value = value << 8 | byte;
-        return value;
-    }
-    ByteView block() { return take(number(4)); }
-    bool atEnd() const { return mBytes.empty(); }
-
-private:
-    ByteView mBytes;
-    const fs::path& mPath;
-};
 
 struct Header {
     std::size_t channels;
@@ -60,7 +36,6 @@ Header readHeader(Cursor& cursor, const fs::path& path) {
     header.width = cursor.number(4);
     header.depth = static_cast<int>(cursor.number(2));
     header.mode = static_cast<int>(cursor.number(2));
-    checkEdges(static_cast<std::int64_t>(header.width), static_cast<std::int64_t>(header.height), path);
     if (header.depth == 32)
         refuse(path, "has 32-bit float samples", "convert it to 8 or 16 bits per channel");
     if (header.mode > CMYK)
@@ -75,27 +50,19 @@ Header readHeader(Cursor& cursor, const fs::path& path) {
     return header;
 }
 
-void readResources(Cursor cursor, Photograph& photograph, const fs::path& path) {
-    while (!cursor.atEnd()) {
-        cursor.take(4);
-        const std::uint32_t id = cursor.number(2);
-        const std::size_t name = cursor.number(1);
-        cursor.take(name | 1);
-        const std::uint32_t size = cursor.number(4);
-        const ByteView data = cursor.take(size);
-        if (size % 2 == 1 && !cursor.atEnd())
-            cursor.take(1);
-        if (id == IccProfile)
-            photograph.iccProfile.assign(data.begin(), data.end());
-        if (id == VersionInfo && data.size() > 4 && data[4] == 0)
-            refuse(path, "was saved without a merged picture", "save it again with maximum compatibility");
-    }
+void takeResources(ByteView list, Photograph& photograph, const fs::path& path) {
+    const ImageResources resources = imageResources(list);
+    if (const ImageResource* profile = resources.find(resource::IccProfile))
+        photograph.iccProfile = copyOf(profile->data);
+    const ImageResource* version = resources.find(resource::VersionInfo);
+    if (version != nullptr && version->data.size() > 4 && version->data[4] == 0)
+        refuse(path, "was saved without a merged picture", "save it again with maximum compatibility");
 }
 
 void unpackRow(Cursor packed, std::uint8_t* row, std::size_t size, const fs::path& path) {
     std::size_t at = 0;
-    while (at < size && !packed.atEnd()) {
-        const std::uint32_t code = packed.number(1);
+    while (at < size && !packed.isAtEnd()) {
+        const std::uint64_t code = packed.number(1);
         if (code == 128)
             continue;
         const std::size_t count = std::min<std::size_t>(code < 128 ? code + 1 : 257 - code, size - at);
@@ -112,20 +79,20 @@ void unpackRow(Cursor packed, std::uint8_t* row, std::size_t size, const fs::pat
 }
 
 // All rows of the first channel, then all of the second and so on, without packing.
-Bytes readPlanes(Cursor cursor, const Header& header, const fs::path& path) {
+Bytes readPlanes(Cursor& cursor, const Header& header, const fs::path& path) {
     const std::size_t row = header.rowBytes();
     const std::size_t rows = header.height * header.channels;
-    const std::uint32_t compression = cursor.number(2);
+    const std::uint64_t compression = cursor.number(2);
     if (compression > 1)
         refuse(path, "has its merged picture in ZIP compression", "save it as TIFF");
     if (compression == 0) {
         const ByteView plain = cursor.take(row * rows);
         return {plain.begin(), plain.end()};
     }
-    Cursor lengths(cursor.take(2 * rows), path);
+    Cursor lengths(cursor.take(2 * rows));
     Bytes planes(row * rows);
     for (std::size_t y = 0; y < rows; ++y)
-        unpackRow(Cursor(cursor.take(lengths.number(2)), path), planes.data() + y * row, row, path);
+        unpackRow(Cursor(cursor.take(lengths.number(2))), planes.data() + y * row, row, path);
     return planes;
 }
 
@@ -159,6 +126,28 @@ void expandBits(const Bytes& plane, const Header& header, Photograph& photograph
         }
 }
 
+// The colours of a merged picture are mixed with white as far as it is transparent. Some programs do not mix
+// them, which shows where one is darker than its share of white.
+template <typename Sample>
+void takeWhiteOut(Photograph& photograph) {
+    constexpr std::int64_t full = std::numeric_limits<Sample>::max();
+    const auto channels = static_cast<std::size_t>(samplesPerPixel(photograph.model));
+    auto* samples = reinterpret_cast<Sample*>(photograph.samples.data());
+    const std::size_t count = photograph.samples.size() / sizeof(Sample);
+    const auto alphaOf = [&](std::size_t i) {
+        return std::int64_t{samples[i - i % channels + channels - 1]};
+    };
+    for (std::size_t i = 0; i < count; ++i)
+        if (samples[i] + alphaOf(i) < full - 1 && i % channels < channels - 1)
+            return;
+    for (std::size_t i = 0; i < count; ++i) {
+        const std::int64_t alpha = alphaOf(i);
+        const std::int64_t colour = std::max<std::int64_t>(samples[i] + alpha - full, 0);
+        if (alpha > 0 && i % channels < channels - 1)
+            samples[i] = static_cast<Sample>((colour * full + alpha / 2) / alpha);
+    }
+}
+
 ColorModel modelOf(const Header& header) {
     if (header.mode == CMYK)
         return ColorModel::Cmyk;
@@ -169,11 +158,17 @@ ColorModel modelOf(const Header& header) {
     return header.channels == 2 ? ColorModel::GreyAlpha : ColorModel::Grey;
 }
 
-} // namespace
+// Two bytes of a packed row become at most 128.
+DeclaredPicture declared(const Header& header, ByteView file) {
+    const std::size_t samples = header.mode == Indexed ? 3 : header.channels;
+    return {static_cast<std::int64_t>(header.width), static_cast<std::int64_t>(header.height),
+            samples * (header.depth == 16 ? 2 : 1), file.size(), 64.0 * 8 / header.depth};
+}
 
-Photograph readPsd(ByteView file, const fs::path& path) {
-    Cursor cursor(file, path);
+Photograph read(ByteView file, const fs::path& path, const ReadLimits& limits) {
+    Cursor cursor(file);
     const Header header = readHeader(cursor, path);
+    checkPicture(declared(header, file), path, limits);
     const ByteView palette = cursor.block();
     if (header.mode == Indexed && palette.size() < 768)
         refuse(path, "has a damaged palette", kCopyAgain);
@@ -184,16 +179,35 @@ Photograph readPsd(ByteView file, const fs::path& path) {
     photograph.depth = header.depth == 16 ? 16 : 8;
     photograph.model = modelOf(header);
     photograph.encoding.format = FileFormat::Psd;
-    readResources(Cursor(cursor.block(), path), photograph, path);
-    cursor.block(); // the layers
+    takeResources(cursor.block(), photograph, path);
+    const PsdLayers layers = psdLayers(cursor.block());
+    photograph.extraChannel = hasAlpha(photograph.model) && !layers.transparency;
     const Bytes planes = readPlanes(cursor, header, path);
-    if (header.mode == Indexed)
+    if (!cursor.isAtEnd())
+        photograph.unheld.push_back(std::to_string(cursor.rest().size()) + " bytes behind the picture");
+    if (header.mode == Indexed) {
         expandPalette(planes, palette, photograph);
-    else if (header.depth == 1)
+        photograph.notes.emplace_back(kPaletteNote);
+    } else if (header.depth == 1) {
         expandBits(planes, header, photograph);
-    else
+        photograph.notes.emplace_back(kBitsNote);
+    } else {
         interleave(planes, header, photograph);
+    }
+    if (hasAlpha(photograph.model) && layers.transparency)
+        photograph.depth == 16 ? takeWhiteOut<std::uint16_t>(photograph)
+                               : takeWhiteOut<std::uint8_t>(photograph);
     return photograph;
+}
+
+} // namespace
+
+Photograph readPsd(ByteView file, const fs::path& path, const ReadLimits& limits) {
+    try {
+        return read(file, path, limits);
+    } catch (const DamagedBytes&) {
+        refuse(path, "the file is cut short", kCopyAgain);
+    }
 }
 
 } // namespace orvela

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "files/DeclaredPicture.h"
 #include "files/FileFormat.h"
 
 namespace orvela {
@@ -8,7 +9,8 @@ namespace orvela {
 /// one transparency channel beside grey or RGB, stored plainly or packed by runs. Inks, which the file
 /// inverts, are turned back.
 /// @param path  for messages and as the source of the result
-/// @throws PhotographError for files that are cut short or hold another kind of picture
-Photograph readPsd(ByteView file, const std::filesystem::path& path);
+/// @throws PhotographError for files that are cut short or hold another kind of picture, and as
+/// checkPicture()
+Photograph readPsd(ByteView file, const std::filesystem::path& path, const ReadLimits& limits);
 
 } // namespace orvela

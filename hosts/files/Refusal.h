@@ -1,6 +1,5 @@
 #pragma once
 
-#include <cstdint>
 #include <filesystem>
 #include <string>
 
@@ -13,8 +12,10 @@ inline constexpr char kCopyAgain[] = "copy it again from the camera or a backup"
 [[noreturn]] void refuse(const std::filesystem::path& path, const std::string& cause,
                          const std::string& advice);
 
-/// Refuses pictures without pixels and pictures whose edges the filter record cannot express.
-/// @throws PhotographError
-void checkEdges(std::int64_t width, std::int64_t height, const std::filesystem::path& path);
+/// Refuses a photograph that a library could not read: as damaged, or for want of memory where that is what
+/// the library says.
+/// @param text  of the library
+/// @throws PhotographError, MemoryError
+[[noreturn]] void refuseUnread(const std::filesystem::path& path, const std::string& text);
 
 } // namespace orvela

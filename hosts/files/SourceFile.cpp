@@ -17,6 +17,7 @@ namespace {
 
 namespace fs = std::filesystem;
 
+// Without O_NONBLOCK a pipe would be waited for.
 int openFile(const fs::path& path) {
     const int handle = ::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);
     if (handle >= 0)
@@ -32,12 +33,14 @@ std::uint64_t sizeOf(int handle, const fs::path& path) {
     struct stat status {};
     ::fstat(handle, &status);
     if (S_ISDIR(status.st_mode))
-        refuse(path, "is a folder", "name the photographs in it");
+        refuse(path, "is a folder", "name the files in it");
     if (!S_ISREG(status.st_mode))
-        refuse(path, "is not a regular file", "save the photograph to a file first");
-    if (status.st_size == 0)
-        refuse(path, "the file is empty", kCopyAgain);
+        refuse(path, "is not a regular file", "save what it gives to a file first");
     return static_cast<std::uint64_t>(status.st_size);
+}
+
+[[noreturn]] void refuseShorter(const fs::path& path) {
+    refuse(path, "the file became shorter while it was read", "try again when it is complete");
 }
 
 } // namespace
@@ -67,7 +70,7 @@ Bytes SourceFile::read(std::uint64_t at, std::uint64_t size) const {
         if (got < 0)
             refuse(mPath, std::string("cannot be read (") + std::strerror(errno) + ")", "check the disk");
         if (got == 0)
-            refuse(mPath, "the file became shorter while it was read", "try again when it is complete");
+            refuseShorter(mPath);
         done += static_cast<std::size_t>(got);
     }
     return bytes;
@@ -80,6 +83,10 @@ ByteView SourceFile::view() {
             throw std::bad_alloc();
         mView = view;
     }
+    // What the file does not hold any more must not be looked at: the system would end the program.
+    struct stat status {};
+    if (::fstat(mHandle, &status) != 0 || static_cast<std::uint64_t>(status.st_size) < mSize)
+        refuseShorter(mPath);
     return {static_cast<const std::uint8_t*>(mView), mSize};
 }
 

@@ -4,10 +4,10 @@
 
 namespace orvela {
 
-/// A photograph's file, open for reading.
+/// A file that is open for reading.
 class SourceFile {
 public:
-    /// @throws PhotographError when the file is missing, empty, no regular file or may not be read
+    /// @throws PhotographError when the file is missing, no regular file or may not be read
     explicit SourceFile(std::filesystem::path path);
     ~SourceFile();
     SourceFile(const SourceFile&) = delete;
@@ -23,9 +23,9 @@ public:
     /// @throws PhotographError when the disk fails or the file became shorter
     Bytes read(std::uint64_t at, std::uint64_t size) const;
 
-    /// The whole file in the address space, as long as this object lives. Memory is taken by what is looked
-    /// at only, and can be taken back.
-    /// @throws std::bad_alloc
+    /// The whole file in the address space, to be looked at at once. Memory is taken by what is looked at
+    /// only, and can be taken back.
+    /// @throws PhotographError when the file became shorter; std::bad_alloc
     ByteView view();
 
 private:

@@ -1,6 +1,7 @@
 #include "files/TargetFile.h"
 
 #include <fcntl.h>
+#include <sys/file.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
@@ -9,6 +10,7 @@
 #include <cerrno>
 #include <cstdio>
 #include <cstring>
+#include <optional>
 #include <random>
 #include <string>
 
@@ -57,12 +59,81 @@ fs::path folderOf(const fs::path& target) {
     return target.has_parent_path() ? target.parent_path() : fs::path(".");
 }
 
+// ".NAME.orvela-": what the temporaries of a target begin with. Two long names may share it, which does no
+// harm: it only decides which leftovers are looked at.
+std::string temporaryStart(const fs::path& target) {
+    constexpr std::size_t kTellingPart = 100;
+    return '.' + target.filename().string().substr(0, kTellingPart) + ".orvela-";
+}
+
+constexpr std::string_view kTemporaryEnd = ".part";
+
 // A name that neither another run nor another photograph of this one takes; creation is exclusive anyway.
 fs::path temporaryFor(const fs::path& target) {
-    std::random_device random;
-    std::array<char, 40> name{};
-    std::snprintf(name.data(), name.size(), ".orvela-%08x%08x.part", random(), random());
-    return folderOf(target) / name.data();
+    std::array<char, 16> number{};
+    std::snprintf(number.data(), number.size(), "%08x", std::random_device()());
+    return folderOf(target) / (temporaryStart(target) + number.data() + std::string(kTemporaryEnd));
+}
+
+enum class Lock { Mine, Others, Unknown };
+
+// A temporary is locked while its writer lives. Where the file system knows no locks nothing can be told.
+Lock lock(int handle) {
+    if (::flock(handle, LOCK_EX | LOCK_NB) == 0)
+        return Lock::Mine;
+    return errno == EWOULDBLOCK ? Lock::Others : Lock::Unknown;
+}
+
+void removeIfLeft(const fs::path& temporary) {
+    const int handle = ::open(temporary.c_str(), O_RDONLY | O_NOFOLLOW | O_NONBLOCK | O_CLOEXEC);
+    if (handle < 0)
+        return;
+    if (lock(handle) == Lock::Mine)
+        ::unlink(temporary.c_str());
+    ::close(handle);
+}
+
+// What killed programs left of the target. A folder that cannot be listed keeps it.
+void removeLeftovers(const fs::path& target) {
+    const std::string start = temporaryStart(target);
+    std::error_code error;
+    for (fs::directory_iterator entry(folderOf(target), error), end; !error && entry != end;
+         entry.increment(error)) {
+        const std::string name = entry->path().filename().string();
+        if (name.starts_with(start) && name.ends_with(kTemporaryEnd))
+            removeIfLeft(entry->path());
+    }
+}
+
+// A new temporary, locked; none when another program took it for left over before the lock was there.
+int createLocked(const fs::path& temporary, mode_t mode) {
+    const int handle = ::open(temporary.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, mode);
+    struct stat status {};
+    if (handle < 0 || (lock(handle) != Lock::Others && ::fstat(handle, &status) == 0 && status.st_nlink > 0))
+        return handle;
+    ::close(handle);
+    errno = EEXIST;
+    return -1;
+}
+
+// The standard output or error that the file is; none for other files.
+std::optional<int> standardHandle(const struct stat& file) {
+    for (const int handle : {STDOUT_FILENO, STDERR_FILENO}) {
+        struct stat status {};
+        if (::fstat(handle, &status) == 0 && status.st_dev == file.st_dev && status.st_ino == file.st_ino)
+            return handle;
+    }
+    return std::nullopt;
+}
+
+// To open them by name once more would write over what they hold.
+int openStream(const fs::path& target) {
+    struct stat status {};
+    if (::stat(target.c_str(), &status) != 0)
+        return -1;
+    if (const std::optional<int> handle = standardHandle(status))
+        return ::fcntl(*handle, F_DUPFD_CLOEXEC, 0);
+    return ::open(target.c_str(), O_WRONLY | O_NOCTTY | O_CLOEXEC);
 }
 
 } // namespace
@@ -76,6 +147,12 @@ void checkTargetPath(const fs::path& target, const fs::path& source, bool overwr
         if (!source.empty() && ::stat(source.c_str(), &origin) == 0 && there.st_dev == origin.st_dev &&
             there.st_ino == origin.st_ino)
             refuse(target, "is the photograph itself", "choose another name; the source is never replaced");
+        if (!S_ISREG(there.st_mode))
+            refuse(target, "is not a regular file", "choose another name");
+        if (standardHandle(there))
+            refuse(target, "takes what this program tells", "choose another name");
+    } else if (errno == ENAMETOOLONG) {
+        refuseSystem(target, errno);
     }
     if (!overwrite && ::lstat(target.c_str(), &there) == 0)
         refuseExisting(target);
@@ -88,17 +165,41 @@ void checkTargetPath(const fs::path& target, const fs::path& source, bool overwr
         refuseSystem(target, errno);
 }
 
-TargetFile::TargetFile(const fs::path& target) : mTarget(target), mTemporary(temporaryFor(target)) {
-    mHandle = ::open(mTemporary.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0666);
+bool isStream(const fs::path& target) {
+    struct stat status {};
+    return ::stat(target.c_str(), &status) == 0 && !S_ISDIR(status.st_mode) &&
+           (S_ISCHR(status.st_mode) || S_ISFIFO(status.st_mode) || standardHandle(status));
+}
+
+TargetFile::TargetFile(const fs::path& target, const fs::path& source) : mTarget(target) {
+    if (isStream(target))
+        mHandle = openStream(target);
+    else
+        create(source);
     if (mHandle < 0)
         refuseSystem(mTarget, errno);
+}
+
+void TargetFile::create(const fs::path& source) {
+    removeLeftovers(mTarget);
+    struct stat status {};
+    const bool likeSource = !source.empty() && ::stat(source.c_str(), &status) == 0;
+    const mode_t mode = likeSource ? status.st_mode & 0777 : 0666;
+    do {
+        mTemporary = temporaryFor(mTarget);
+        mHandle = createLocked(mTemporary, mode);
+    } while (mHandle < 0 && errno == EEXIST);
+    // The mask for new files has nothing to say here. A file system without permissions has none to keep.
+    if (likeSource && mHandle >= 0)
+        static_cast<void>(::fchmod(mHandle, mode));
 }
 
 TargetFile::~TargetFile() {
     if (mHandle < 0)
         return;
+    if (!mTemporary.empty())
+        ::unlink(mTemporary.c_str());
     ::close(mHandle);
-    ::unlink(mTemporary.c_str());
 }
 
 void TargetFile::write(ByteView bytes, const std::atomic<bool>* stop) {
@@ -117,6 +218,18 @@ void TargetFile::write(ByteView bytes, const std::atomic<bool>* stop) {
         throw StoppedError(mTarget.string() + ": stopped; nothing was written");
 }
 
+void TargetFile::write(std::string_view text) {
+    write(ByteView(reinterpret_cast<const std::uint8_t*>(text.data()), text.size()));
+}
+
+bool TargetFile::takeTimes(const fs::path& source) {
+    struct stat status {};
+    if (::stat(source.c_str(), &status) != 0)
+        return false;
+    const std::array<timespec, 2> times = {status.st_atim, status.st_mtim};
+    return ::futimens(mHandle, times.data()) == 0;
+}
+
 void TargetFile::overwrite(std::uint64_t at, ByteView bytes) {
     while (!bytes.empty()) {
         const ssize_t written = ::pwrite(mHandle, bytes.data(), bytes.size(), static_cast<off_t>(at));
@@ -129,20 +242,28 @@ void TargetFile::overwrite(std::uint64_t at, ByteView bytes) {
 }
 
 void TargetFile::commit(bool overwrite) {
+    if (mTemporary.empty()) {
+        close();
+        return;
+    }
     if (::fsync(mHandle) != 0)
         refuseSystem(mTarget, errno);
     rename(overwrite);
-    // Some file systems report a full disk only here.
-    const int closed = ::close(mHandle);
-    mHandle = -1;
-    if (closed != 0)
-        refuseSystem(mTarget, errno);
+    close();
     const int folder = ::open(folderOf(mTarget).c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
     if (folder >= 0) {
         // A file system that cannot sync folders has nothing better to offer.
         static_cast<void>(::fsync(folder));
         ::close(folder);
     }
+}
+
+// Some file systems report a full disk only here.
+void TargetFile::close() {
+    const int closed = ::close(mHandle);
+    mHandle = -1;
+    if (closed != 0)
+        refuseSystem(mTarget, errno);
 }
 
 void TargetFile::rename(bool overwrite) {

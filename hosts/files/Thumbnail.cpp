@@ -26,6 +26,8 @@ bool apply(VipsHandle& image, Operation operation, Arguments... arguments) {
 // The picture reduced into the box, as 8-bit sRGB without transparency.
 VipsHandle reduced(const Photograph& photograph, int width, int height) {
     VipsHandle image = vipsImage(photograph);
+    if (photograph.extraChannel)
+        apply(image, vips_extract_band, 0, "n", samplesPerPixel(photograph.model) - 1);
     // One that differs by the rounding of an edge fills the box.
     const double fit = std::min(static_cast<double>(width) / photograph.width,
                                 static_cast<double>(height) / photograph.height);

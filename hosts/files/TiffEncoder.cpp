@@ -55,10 +55,6 @@ private:
     bool mKeeps = false;
 };
 
-bool hasAlpha(const Photograph& photograph) {
-    return photograph.model == ColorModel::GreyAlpha || photograph.model == ColorModel::RgbAlpha;
-}
-
 // The part of a picture that one strip or tile of one plane holds.
 struct Block {
     std::uint32_t left;
@@ -79,7 +75,7 @@ public:
           mHeight(static_cast<std::uint32_t>(photograph.height)),
           mPerPixel(samplesPerPixel(photograph.model)),
           mInverted(storage.photometric == PHOTOMETRIC_MINISWHITE),
-          mMultiplied(hasAlpha(photograph) && storage.extraSample == EXTRASAMPLE_ASSOCALPHA) {}
+          mMultiplied(hasAlpha(photograph.model) && storage.extraSample == EXTRASAMPLE_ASSOCALPHA) {}
 
     /// Beyond the edges nought.
     Bytes of(const Block& block) const {
@@ -158,7 +154,7 @@ void Blocks::describe() {
     mTiff.set(TIFFTAG_COMPRESSION, int{mStorage.compression});
     mTiff.set(TIFFTAG_PHOTOMETRIC, int{mStorage.photometric});
     mTiff.set(TIFFTAG_PLANARCONFIG, mStorage.separate ? PLANARCONFIG_SEPARATE : PLANARCONFIG_CONTIG);
-    if (hasAlpha(mPhotograph))
+    if (hasAlpha(mPhotograph.model))
         mTiff.set(TIFFTAG_EXTRASAMPLES, 1, &mStorage.extraSample);
     if (mStorage.predictor != 0)
         mTiff.set(TIFFTAG_PREDICTOR, int{mStorage.predictor});

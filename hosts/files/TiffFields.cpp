@@ -118,9 +118,8 @@ void addBlock(std::vector<TiffField>& fields, const Bytes& block) {
 // What metadata do not speak of: which page it is, its inks, ...
 void addRest(std::vector<TiffField>& fields, const TiffPage& page, std::vector<std::string>& lost) {
     for (const TiffField& field : page.fields) {
-        if (isStorage(field.tag) || isPointer(field.tag) || field.tag == TIFFTAG_SUBIFD ||
-            field.tag == TIFFTAG_IMAGESOURCEDATA)
-            continue; // metadata tell of the last two
+        if (isStorage(field.tag) || isPointer(field.tag) || field.tag == TIFFTAG_SUBIFD)
+            continue; // metadata tell of the last
         if (leadsAway(field))
             lost.push_back("what the tag " + hexadecimal(field.tag) + " leads to");
         else

@@ -1,5 +1,6 @@
 #include "files/TiffFile.h"
 
+#include "files/CameraRaw.h"
 #include "files/LibTiff.h"
 #include "files/Refusal.h"
 
@@ -98,9 +99,13 @@ TiffPage TiffFile::page(int index) const {
     for (const TagEntry& entry : directory(index).entries)
         if (entry.value.empty())
             page.damaged.push_back(entry.tag);
-        else
+        else if (entry.tag != TIFFTAG_IMAGESOURCEDATA) // layers, perhaps larger than the picture
             page.fields.push_back(tiffField(entry));
     return page;
+}
+
+bool TiffFile::isCameraRaw() const {
+    return orvela::isCameraRaw(TiffView(mFile.view()));
 }
 
 bool TiffFile::isMask(const TiffPage& page) {
@@ -148,7 +153,7 @@ Bytes TiffFile::readRgb(int index) const {
         }
         return rgb;
     } catch (const TiffError& error) {
-        refusePage(index, std::string("cannot be decoded (") + error.what() + ")");
+        refuseUnread(pageName(index), error.what());
     }
 }
 

@@ -18,6 +18,9 @@ public:
 
     int pages() const { return static_cast<int>(mPlaces.size()); }
 
+    /// Whether what it shows is a preview only; see CameraRaw.h.
+    bool isCameraRaw() const;
+
     /// Whether there are pages that were not wanted.
     bool hasMore() const { return mHasMore; }
 

@@ -17,7 +17,7 @@ struct TiffField {
 /// One page of a TIFF as its directory tells it.
 struct TiffPage {
     ByteOrder order = ByteOrder::Little;
-    std::vector<TiffField> fields;
+    std::vector<TiffField> fields;      ///< but for Photoshop's layers, of which metadata tell
     std::vector<std::uint16_t> damaged; ///< tags of fields without a value or of an unknown type
     std::vector<Bytes> blocks; ///< strips or tiles as they stand, of a page that is to be copied; else empty
 

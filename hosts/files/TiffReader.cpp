@@ -9,6 +9,9 @@
 #include <tiff.h>
 #include <unistd.h>
 
+#include <algorithm>
+#include <limits>
+
 namespace orvela {
 
 namespace {
@@ -42,28 +45,55 @@ int qualityOf(const TiffFile& tiff, const TiffPage& page, int index) {
     return shared > 0 ? shared : jpegQuality(tiff.readBlocks(page, index, 1).front());
 }
 
+// A code of LZW has 9 bits at least and stands for 4096 bytes at most.
+double mostBytesPerByte(const TiffPage& page) {
+    switch (page.number(TIFFTAG_COMPRESSION, COMPRESSION_NONE)) {
+    case COMPRESSION_NONE:
+        return 1;
+    case COMPRESSION_PACKBITS:
+        return 64;
+    case COMPRESSION_LZW:
+        return 4096.0 * 8 / 9;
+    case COMPRESSION_DEFLATE:
+    case COMPRESSION_ADOBE_DEFLATE:
+        return 1032;
+    default:
+        return std::numeric_limits<double>::infinity();
+    }
+}
+
+DeclaredPicture declared(const TiffPage& page, const SourceFile& file) {
+    const bool palette = page.number(TIFFTAG_PHOTOMETRIC, PHOTOMETRIC_MINISBLACK) == PHOTOMETRIC_PALETTE;
+    const std::uint64_t bits = std::max<std::uint64_t>(1, page.number(TIFFTAG_BITSPERSAMPLE, 1));
+    DeclaredPicture picture;
+    picture.width = static_cast<std::int64_t>(page.number(TIFFTAG_IMAGEWIDTH, 0));
+    picture.height = static_cast<std::int64_t>(page.number(TIFFTAG_IMAGELENGTH, 0));
+    picture.sampleBytes = palette ? 3 : page.number(TIFFTAG_SAMPLESPERPIXEL, 1) * (bits > 8 ? 2 : 1);
+    picture.fileBytes = file.size();
+    picture.mostPixelsPerByte = mostBytesPerByte(page) * 8 / static_cast<double>(bits);
+    picture.fileInView = true;
+    return picture;
+}
+
 // Size and profile, as the directory tells them.
-Photograph describePage(const TiffPage& page, const fs::path& name) {
+Photograph describePage(const TiffPage& page) {
     Photograph photograph;
-    const auto width = static_cast<std::int64_t>(page.number(TIFFTAG_IMAGEWIDTH, 0));
-    const auto height = static_cast<std::int64_t>(page.number(TIFFTAG_IMAGELENGTH, 0));
-    checkEdges(width, height, name);
-    photograph.width = static_cast<int>(width);
-    photograph.height = static_cast<int>(height);
+    photograph.width = static_cast<int>(page.number(TIFFTAG_IMAGEWIDTH, 0));
+    photograph.height = static_cast<int>(page.number(TIFFTAG_IMAGELENGTH, 0));
     if (const TiffField* profile = page.find(TIFFTAG_ICCPROFILE))
         photograph.iccProfile = profile->value;
     return photograph;
 }
 
 Photograph decodeYcbcr(const TiffFile& tiff, const TiffPage& page, int index) {
-    Photograph photograph = describePage(page, tiff.pageName(index));
+    Photograph photograph = describePage(page);
     photograph.samples = tiff.readRgb(index);
     photograph.notes.emplace_back("its YCbCr samples were converted to RGB");
     return photograph;
 }
 
 Photograph decodeMask(const TiffFile& tiff, TiffPage& page, int index) {
-    Photograph photograph = describePage(page, tiff.pageName(index));
+    Photograph photograph = describePage(page);
     photograph.copied = true;
     photograph.model = ColorModel::Grey;
     page.blocks = tiff.readBlocks(page, index);
@@ -75,20 +105,24 @@ Photograph decodeWithVips(const SourceFile& file, const TiffPage& page, const fs
     vips_error_clear();
     const VipsHandle image = loadPage(file, index);
     if (!image)
-        refuseUnread(name);
+        refuseUnread(name, takeVipsError());
     Photograph photograph = describeImage(name, image.get());
     takeSamples(photograph, name, image.get());
+    photograph.extraChannel =
+        hasAlpha(photograph.model) &&
+        page.number(TIFFTAG_EXTRASAMPLES, EXTRASAMPLE_UNSPECIFIED) == EXTRASAMPLE_UNSPECIFIED;
     if (page.number(TIFFTAG_PHOTOMETRIC, PHOTOMETRIC_MINISBLACK) == PHOTOMETRIC_PALETTE)
-        photograph.notes.emplace_back("its palette was resolved");
+        photograph.notes.emplace_back(kPaletteNote);
     else if (page.number(TIFFTAG_BITSPERSAMPLE, 1) < 8)
-        photograph.notes.emplace_back("its samples were expanded to 8 bits");
+        photograph.notes.emplace_back(kBitsNote);
     return photograph;
 }
 
 } // namespace
 
-Photograph readTiffPage(SourceFile& file, const TiffFile& tiff, int index) {
+Photograph readTiffPage(SourceFile& file, const TiffFile& tiff, int index, const ReadLimits& limits) {
     const auto page = std::make_shared<TiffPage>(tiff.page(index));
+    checkPicture(declared(*page, file), tiff.pageName(index), limits);
     Photograph photograph = TiffFile::isMask(*page) ? decodeMask(tiff, *page, index)
                             : isPlainYcbcr(*page)   ? decodeYcbcr(tiff, *page, index)
                                                   : decodeWithVips(file, *page, tiff.pageName(index), index);

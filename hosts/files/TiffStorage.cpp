@@ -113,7 +113,7 @@ TiffStorage tiffStorage(const Photograph& photograph, const WriteOptions& option
     TiffStorage storage;
     storage.compression = compression.code;
     storage.photometric = photometricOf(photograph, page);
-    storage.extraSample = EXTRASAMPLE_UNASSALPHA;
+    storage.extraSample = photograph.extraChannel ? EXTRASAMPLE_UNSPECIFIED : EXTRASAMPLE_UNASSALPHA;
     if (compression.predicts)
         storage.predictor = PREDICTOR_HORIZONTAL;
     if (page != nullptr) {

@@ -9,13 +9,13 @@ namespace {
 void ignoreMessage(const gchar*, GLogLevelFlags, const gchar*, gpointer) {}
 
 bool start() {
+    g_log_set_handler("VIPS",
+                      static_cast<GLogLevelFlags>(G_LOG_LEVEL_WARNING | G_LOG_LEVEL_INFO | G_LOG_LEVEL_DEBUG),
+                      ignoreMessage, nullptr);
     if (VIPS_INIT("orvela") != 0)
         throw PhotographError("libvips cannot start: " + takeVipsError() + "; check its installation");
     vips_cache_set_max(0);
     vips_concurrency_set(1);
-    g_log_set_handler("VIPS",
-                      static_cast<GLogLevelFlags>(G_LOG_LEVEL_WARNING | G_LOG_LEVEL_INFO | G_LOG_LEVEL_DEBUG),
-                      ignoreMessage, nullptr);
     return true;
 }
 

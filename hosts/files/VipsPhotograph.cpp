@@ -62,31 +62,12 @@ int storeRows(VipsRegion* region, VipsRect* area, void* target) {
 
 } // namespace
 
-void refuseUnread(const fs::path& path) {
-    refuse(path, "is damaged or cut short (" + takeVipsError() + ")", kCopyAgain);
-}
-
-std::string textField(VipsImage* image, const char* name) {
-    const char* text = nullptr;
-    if (vips_image_get_typeof(image, name) == 0 || vips_image_get_string(image, name, &text) != 0)
-        return {};
-    return text;
-}
-
-int numberField(VipsImage* image, const char* name) {
-    int value = 0;
-    if (vips_image_get_typeof(image, name) != 0)
-        vips_image_get_int(image, name, &value);
-    return value;
-}
-
 Photograph describeImage(const fs::path& path, VipsImage* image) {
     Photograph photograph;
     photograph.width = vips_image_get_width(image);
     photograph.height = vips_image_get_height(image);
     photograph.model = modelOf(path, image);
     photograph.depth = depthOf(path, image);
-    checkEdges(photograph.width, photograph.height, path);
     takeProfile(photograph, image);
     return photograph;
 }
@@ -94,7 +75,7 @@ Photograph describeImage(const fs::path& path, VipsImage* image) {
 void takeSamples(Photograph& photograph, const fs::path& path, VipsImage* image) {
     photograph.samples.resize(VIPS_IMAGE_SIZEOF_IMAGE(image));
     if (vips_sink_disc(image, storeRows, photograph.samples.data()) != 0)
-        refuseUnread(path);
+        refuseUnread(path, takeVipsError());
 }
 
 } // namespace orvela

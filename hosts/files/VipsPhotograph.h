@@ -7,13 +7,6 @@
 
 namespace orvela {
 
-/// Refuses a file that libvips could not read, with its message. @throws PhotographError
-[[noreturn]] void refuseUnread(const std::filesystem::path& path);
-
-/// A field of the image; empty or 0 when it is missing.
-std::string textField(VipsImage* image, const char* name);
-int numberField(VipsImage* image, const char* name);
-
 /// Size, colour model, depth and profile of the image.
 /// @param path  for messages
 /// @throws PhotographError when the filter cannot take such a picture

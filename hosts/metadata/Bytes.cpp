@@ -16,6 +16,16 @@ std::uint64_t number(ByteView bytes, std::size_t at, std::size_t size, ByteOrder
     return value;
 }
 
+ByteView Cursor::take(std::uint64_t count) {
+    const ByteView taken = slice(mBytes, 0, count);
+    mBytes = mBytes.subspan(taken.size());
+    return taken;
+}
+
+std::uint64_t Cursor::number(std::uint64_t size) {
+    return orvela::number(take(size), 0, size, ByteOrder::Big);
+}
+
 void store(Bytes& bytes, std::size_t at, std::uint64_t value, std::size_t size, ByteOrder order) {
     slice(bytes, at, size);
     for (std::size_t i = 0; i < size; ++i)

@@ -27,6 +27,25 @@ ByteView slice(ByteView bytes, std::size_t at, std::size_t count);
 /// The number in the `size` bytes, 1 to 8, from `at` on. @throws DamagedBytes when there are fewer
 std::uint64_t number(ByteView bytes, std::size_t at, std::size_t size, ByteOrder order);
 
+/// Takes bytes and numbers, most significant byte first, off the front of bytes.
+class Cursor {
+public:
+    explicit Cursor(ByteView bytes) : mBytes(bytes) {}
+
+    bool isAtEnd() const { return mBytes.empty(); }
+    ByteView rest() const { return mBytes; }
+
+    /// @throws DamagedBytes when there are fewer
+    ByteView take(std::uint64_t count);
+    /// Of up to 8 bytes. @throws DamagedBytes when there are fewer
+    std::uint64_t number(std::uint64_t size);
+    /// As many bytes as the four before them tell. @throws DamagedBytes when there are fewer
+    ByteView block() { return take(number(4)); }
+
+private:
+    ByteView mBytes;
+};
+
 /// Overwrites the `size` bytes from `at` on. @throws DamagedBytes when there are fewer
 void store(Bytes& bytes, std::size_t at, std::uint64_t value, std::size_t size, ByteOrder order);
 

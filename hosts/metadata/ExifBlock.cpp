@@ -165,13 +165,17 @@ void ExifBlock::setDimensions(int width, int height) {
     });
 }
 
-bool ExifBlock::makeUpright() {
-    bool turned = false;
+int ExifBlock::orientation() const {
+    std::uint64_t found = 1;
     forEach(tiff::Orientation, [&](const TagEntry& entry, bool first) {
-        turned = turned || (first && TiffView(mBytes).value(entry) >= 5);
-        patch(entry, 1);
+        if (first)
+            found = TiffView(mBytes).value(entry);
     });
-    return turned;
+    return found >= 1 && found <= 8 ? static_cast<int>(found) : 1;
+}
+
+void ExifBlock::makeUpright() {
+    forEach(tiff::Orientation, [&](const TagEntry& entry, bool) { patch(entry, 1); });
 }
 
 std::optional<Density> ExifBlock::density() const {
@@ -261,7 +265,7 @@ bool ExifBlock::renew(const Thumbnail& thumbnail, const ThumbnailMaker& make, bo
 bool ExifBlock::renewThumbnails(const ThumbnailMaker& make, bool turned) {
     bool all = true;
     std::vector<Thumbnail> found = thumbnails();
-    // From the last one on, since the one before holds the link to it.
+    // From the last one on: the link of each then leads to what is left behind it.
     std::reverse(found.begin(), found.end());
     for (const Thumbnail& thumbnail : found)
         if (!renew(thumbnail, make, turned)) {
@@ -272,7 +276,9 @@ bool ExifBlock::renewThumbnails(const ThumbnailMaker& make, bool turned) {
 }
 
 void ExifBlock::drop(const Thumbnail& thumbnail) {
-    store(mBytes, thumbnail.linkAt, thumbnail.directory.next, 4, mOrder);
+    const std::size_t next =
+        thumbnail.directory.next == 0 ? 0 : TiffView(mBytes).offset(thumbnail.directory.linkAt);
+    store(mBytes, thumbnail.linkAt, next, 4, mOrder);
     if (isShared(thumbnail))
         return;
     constexpr std::size_t padding = 4;

@@ -30,14 +30,15 @@ public:
     /// Whether a directory could not be followed.
     bool isDamaged() const { return mDamaged; }
     const Bytes& bytes() const { return mBytes; }
-    bool isEmpty() const { return mBytes.empty(); }
 
     /// Gives the tags that state the picture's edges these values.
     void setDimensions(int width, int height);
 
+    /// How the picture has to be turned, 1 to 8; 1, as it stands, where nothing or nothing known is said.
+    int orientation() const;
+
     /// Turns every orientation to "as it stands".
-    /// @return whether the picture lay on its side
-    bool makeUpright();
+    void makeUpright();
 
     /// What the resolution tags state; none when they are not all there.
     std::optional<Density> density() const;

@@ -58,6 +58,28 @@ void takeItem(const heif_image_handle* picture, heif_item_id id, Metadata& metad
     }
 }
 
+void takeColors(const heif_image_handle* picture, Metadata& metadata) {
+    heif_color_profile_nclx* found = nullptr;
+    if (heif_image_handle_get_nclx_color_profile(picture, &found).code != heif_error_Ok)
+        return;
+    metadata.colors =
+        ColorCodes{static_cast<std::uint16_t>(found->color_primaries),
+                   static_cast<std::uint16_t>(found->transfer_characteristics),
+                   static_cast<std::uint16_t>(found->matrix_coefficients), found->full_range_flag != 0};
+    heif_nclx_color_profile_free(found);
+}
+
+void takeThumbnail(const heif_image_handle* picture, Metadata& metadata) {
+    heif_item_id id = 0;
+    heif_image_handle* thumbnail = nullptr;
+    if (heif_image_handle_get_list_of_thumbnail_IDs(picture, &id, 1) != 1 ||
+        heif_image_handle_get_thumbnail(picture, id, &thumbnail).code != heif_error_Ok)
+        return;
+    const Handle owner(thumbnail);
+    metadata.heifThumbnail =
+        std::max(heif_image_handle_get_width(thumbnail), heif_image_handle_get_height(thumbnail));
+}
+
 std::string nameOf(std::string_view kind) {
     constexpr std::array<std::pair<std::string_view, const char*>, 8> names = {{
         {"hdrgainmap", "the gain map"},
@@ -123,6 +145,8 @@ Metadata readHeifMetadata(ByteView file) {
         } catch (const DamagedBytes&) {
             metadata.damaged.emplace_back("the Exif data");
         }
+    takeColors(picture, metadata);
+    takeThumbnail(picture, metadata);
     nameOtherPictures(context.get(), picture, metadata);
     return metadata;
 }

@@ -13,6 +13,7 @@ enum Id : std::uint16_t {
     IccProfile = 0x040F,
     Exif = 0x0422,
     Exif3 = 0x0423,
+    VersionInfo = 0x0421,
     Xmp = 0x0424,
 };
 } // namespace resource

@@ -1,5 +1,6 @@
 #include "metadata/JpegMetadata.h"
 
+#include "metadata/ExtendedXmp.h"
 #include "metadata/ImageResources.h"
 #include "metadata/JpegSegments.h"
 

@@ -8,15 +8,12 @@ namespace orvela {
 inline constexpr std::size_t kJpegExifLimit = 65533 - 6;
 inline constexpr std::size_t kJpegXmpLimit = 65533 - 29;
 
-/// Name of the segments that a long XMP packet goes on in.
-inline constexpr char kExtendedXmp[] = "extended XMP";
-
 /// What the segments of a JPEG say.
 Metadata readJpegMetadata(ByteView file);
 
 /// Puts the metadata into an encoded JPEG, in place of what the encoder wrote, whose colour profile and Adobe
-/// marker stay. A block over the limits above must have been made to fit; a longer XMP packet goes into
-/// extension segments.
+/// marker stay. A longer Exif block goes on in further segments. A longer XMP packet must have been made to
+/// fit.
 void embedIntoJpeg(const Metadata& metadata, Bytes& encoded);
 
 } // namespace orvela

@@ -20,4 +20,14 @@ const char* formatName(FileFormat format) {
     return "";
 }
 
+bool ColorCodes::isPlain() const {
+    constexpr std::uint16_t rec709 = 1;
+    constexpr std::uint16_t unspecified = 2;
+    constexpr std::uint16_t rec601 = 6;
+    constexpr std::uint16_t srgb = 13;
+    const bool primary = primaries == rec709 || primaries == unspecified;
+    return primary &&
+           (transfer == rec709 || transfer == unspecified || transfer == rec601 || transfer == srgb);
+}
+
 } // namespace orvela

@@ -54,6 +54,23 @@ struct Chunk {
     bool operator==(const Chunk&) const = default;
 };
 
+/// Colours by the numbers of ISO/IEC 23091-2 (H.273): the cICP chunk of a PNG, the nclx box of a HEIF.
+struct ColorCodes {
+    std::uint16_t primaries = 1;
+    std::uint16_t transfer = 13;
+    std::uint16_t matrix = 0;
+    bool fullRange = true;
+
+    /// Whether they tell what every reader takes for granted: nothing, or the colours of sRGB or of video
+    /// like it.
+    bool isPlain() const;
+    /// Whether both tell the same of RGB samples, of which there is no matrix.
+    bool looksLike(const ColorCodes& other) const {
+        return primaries == other.primaries && transfer == other.transfer;
+    }
+    bool operator==(const ColorCodes&) const = default;
+};
+
 /// What a photograph's file says beside its picture, as bytes that can go into files of other formats.
 struct Metadata {
     FileFormat format = FileFormat::Png;
@@ -62,8 +79,10 @@ struct Metadata {
     Bytes resources;                ///< Photoshop's image resources, IPTC among them: a list of "8BIM" blocks
     std::vector<Text> texts;        ///< of a PNG; a JPEG's comments by the keyword Comment
     std::optional<Density> density; ///< what the container itself says; Exif's never overrules it
-    std::vector<Chunk> chunks;      ///< ancillary chunks of a PNG without neutral meaning, and its texts
-    std::vector<Chunk> segments;    ///< APPn segments of a JPEG without neutral meaning
+    std::optional<ColorCodes> colors;
+    int heifThumbnail = 0;           ///< longer edge of the thumbnail beside a HEIF's picture; 0 without one
+    std::vector<Chunk> chunks;       ///< ancillary chunks of a PNG without neutral meaning, and its texts
+    std::vector<Chunk> segments;     ///< APPn segments of a JPEG without neutral meaning
     std::vector<std::string> unheld; ///< what cannot travel whatever the target: "the gain map"
     std::vector<std::string>
         damaged; ///< what could not be understood and travels as it stands: "the Exif data"

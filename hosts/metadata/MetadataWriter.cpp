@@ -1,5 +1,6 @@
 #include "metadata/MetadataWriter.h"
 
+#include "metadata/ExtendedXmp.h"
 #include "metadata/ImageResources.h"
 #include "metadata/JpegMetadata.h"
 #include "metadata/MetadataReader.h"
@@ -8,8 +9,6 @@
 #include "metadata/Utf8.h"
 #include "metadata/WebPMetadata.h"
 
-#include <QCryptographicHash>
-
 #include <algorithm>
 #include <array>
 #include <regex>
@@ -17,8 +16,6 @@
 namespace orvela {
 
 namespace {
-
-using namespace std::string_view_literals;
 
 using Names = std::vector<std::string>;
 
@@ -66,6 +63,7 @@ public:
         }
         moveResources();
         moveDensity();
+        moveColors();
         if (mResult.target == FileFormat::Jpeg)
             fitJpeg();
         fitTiff();
@@ -81,9 +79,9 @@ private:
     bool moveText(const Text& text);
     void moveResources();
     void moveDensity();
+    void moveColors();
     void fitJpeg();
     void fitTiff();
-    void splitXmp();
 
     Metadata& metadata() { return mResult.metadata; }
     void lose(const std::string& name) { mResult.lost.push_back(name); }
@@ -96,34 +94,44 @@ private:
 
 void Preparation::adaptToPicture() {
     mExif.setDimensions(mPicture.width, mPicture.height);
-    bool turned = false;
+    const bool turned = mSource.format == FileFormat::Heif && mExif.orientation() >= 5;
     if (mSource.format == FileFormat::Heif) {
-        turned = mExif.makeUpright();
+        mExif.makeUpright();
         static const std::regex property("(tiff:Orientation(?:=[\"']|>))[2-8]");
         const std::string upright = std::regex_replace(std::string(asText(mSource.xmp)), property, "$011");
         metadata().xmp = copyOf(asBytes(upright));
     }
-    const bool inExif = mExif.renewThumbnails(mPicture.makeThumbnail, turned);
+    // A second directory of a TIFF would be a second page.
+    const bool inExif = mResult.target == FileFormat::Tiff
+                            ? !mExif.dropThumbnails()
+                            : mExif.renewThumbnails(mPicture.makeThumbnail, turned);
     const bool inResources = renewResourceThumbnail(metadata().resources, mPicture.makeThumbnail);
-    if (!inExif || !inResources)
+    const bool inHeif = mSource.heifThumbnail == 0 || mResult.target == FileFormat::Heif;
+    if (!inExif || !inResources || !inHeif)
         lose("the thumbnail");
 }
 
 void Preparation::dropSegments() {
+    if (mSource.segments.empty())
+        return;
     Names names;
+    const std::optional<Bytes> xmp = joinXmp(mSource.xmp, mSource.segments);
+    if (xmp)
+        metadata().xmp = *xmp;
     for (const Chunk& segment : mSource.segments)
-        if (std::find(names.begin(), names.end(), segment.name) == names.end())
+        if (!(xmp && segment.name == kExtendedXmp) &&
+            std::find(names.begin(), names.end(), segment.name) == names.end())
             names.push_back(segment.name);
     mResult.lost.insert(mResult.lost.end(), names.begin(), names.end());
     metadata().segments.clear();
 }
 
-// Of texts and colours others tell; a background is of no use where nothing is transparent.
+// Of texts and colours others tell.
 void Preparation::dropChunks() {
     Names names;
     for (const Chunk& chunk : mSource.chunks) {
         const bool text = chunk.name == "tEXt" || chunk.name == "zTXt" || chunk.name == "iTXt";
-        if (!text && chunk.name != "bKGD" && !isPlainColour(chunk))
+        if (!text && !isPlainColour(chunk))
             names.push_back(chunk.name);
     }
     if (!names.empty())
@@ -184,62 +192,50 @@ void Preparation::moveDensity() {
         return;
     if (mSource.density->unit != DensityUnit::None)
         mExif.setDensity(*mSource.density);
+    else if (mSource.density->x.value() != mSource.density->y.value())
+        lose("the shape of its pixels");
     metadata().density.reset();
 }
 
-// The packet goes into extension segments whole; the main one only refers to them.
-void Preparation::splitXmp() {
-    const std::string_view packet = asText(mSource.xmp);
-    const std::size_t begin = std::min(packet.find("<x:xmpmeta"), packet.find("<rdf:RDF"));
-    const std::size_t end = packet.rfind("<?xpacket");
-    if (begin == std::string_view::npos) {
-        lose("the XMP data");
-        metadata().xmp.clear();
+// RGB samples have no matrix, and an ICC profile says more than codes.
+void Preparation::moveColors() {
+    if (!mSource.colors || mSource.format == mResult.target)
         return;
-    }
-    const std::string_view body =
-        packet.substr(begin, end == std::string_view::npos || end < begin ? end : end - begin);
-    const std::string id =
-        QCryptographicHash::hash(QByteArrayView(body.data(), static_cast<qsizetype>(body.size())),
-                                 QCryptographicHash::Md5)
-            .toHex()
-            .toUpper()
-            .toStdString();
-    const std::string note =
-        "<x:xmpmeta xmlns:x=\"adobe:ns:meta/\"><rdf:RDF "
-        "xmlns:rdf=\"http://www.w3.org/1999/02/22-rdf-syntax-ns#\"><rdf:Description rdf:about=\"\" "
-        "xmlns:xmpNote=\"http://ns.adobe.com/xmp/note/\" xmpNote:HasExtendedXMP=\"" +
-        id + "\"/></rdf:RDF></x:xmpmeta>";
-    metadata().xmp = copyOf(asBytes(note));
-    constexpr std::size_t most = 65000;
-    for (std::size_t at = 0; at < body.size(); at += most) {
-        Bytes data = copyOf(asBytes("http://ns.adobe.com/xmp/extension/\0"sv));
-        append(data, id);
-        append(data, body.size(), 4, ByteOrder::Big);
-        append(data, at, 4, ByteOrder::Big);
-        append(data, body.substr(at, most));
-        metadata().segments.push_back({kExtendedXmp, std::move(data), 0xE1});
-    }
+    const ColorCodes& codes = *mSource.colors;
+    metadata().colors.reset();
+    if (codes.isPlain() || mPicture.hasProfile)
+        return;
+    if (mResult.target == FileFormat::Png || mResult.target == FileFormat::Heif)
+        metadata().colors = ColorCodes{codes.primaries, codes.transfer};
+    else
+        lose("the code of its colours (primaries " + std::to_string(codes.primaries) + ", transfer " +
+             std::to_string(codes.transfer) + ")");
 }
 
+// Some cameras let a long block go on in further segments; few programs know of that.
 void Preparation::fitJpeg() {
-    if (mExif.bytes().size() > kJpegExifLimit && mExif.dropThumbnails())
+    const auto isLong = [this] {
+        return mExif.bytes().size() > kJpegExifLimit && mSource.format != FileFormat::Jpeg;
+    };
+    if (isLong() && mExif.dropThumbnails())
         lose("the thumbnail");
-    if (mExif.bytes().size() > kJpegExifLimit) {
+    if (isLong()) {
         lose("the Exif data, of over 64 KiB");
         mExif = ExifBlock({});
     }
-    if (mSource.xmp.size() > kJpegXmpLimit)
-        splitXmp();
+    if (mSource.xmp.size() <= kJpegXmpLimit)
+        return;
+    metadata().xmp.clear();
+    if (std::optional<PartedXmp> parted = partXmp(mSource.xmp)) {
+        metadata().xmp = std::move(parted->main);
+        metadata().segments = std::move(parted->segments);
+    } else {
+        lose("the XMP data");
+    }
 }
 
-// A second directory of a TIFF would be a second page.
 void Preparation::fitTiff() {
-    if (mResult.target != FileFormat::Tiff)
-        return;
-    if (mExif.dropThumbnails())
-        lose("the thumbnail");
-    if (mExif.isDamaged()) {
+    if (mResult.target == FileFormat::Tiff && mExif.isDamaged()) {
         lose("the Exif data, which are damaged");
         mExif = ExifBlock({});
     }
@@ -258,6 +254,8 @@ Names differences(const Metadata& wanted, const Metadata& found) {
     check(wanted.segments == found.segments, "APPn segments");
     check(wanted.chunks.size() <= found.chunks.size(), "PNG chunks");
     check(!wanted.density || found.density, "the density");
+    check(!wanted.colors || (found.colors && wanted.colors->looksLike(*found.colors)),
+          "the code of its colours");
     return names;
 }
 

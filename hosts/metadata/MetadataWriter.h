@@ -10,6 +10,7 @@ struct PictureFacts {
     int width = 0;
     int height = 0;
     ThumbnailMaker makeThumbnail; ///< of this picture
+    bool hasProfile = false;      ///< an ICC profile goes with it
 };
 
 /// Metadata made ready for a file of one format.

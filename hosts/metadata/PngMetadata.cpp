@@ -20,6 +20,7 @@ constexpr auto kXmpKeyword = "XML:com.adobe.xmp"sv;
 constexpr auto kProfileKeyword = "Raw profile type "sv;
 constexpr std::size_t kHead = 8; ///< length and name
 constexpr std::size_t kSum = 4;
+constexpr std::size_t kHeaderSize = 13; ///< of IHDR
 constexpr std::size_t kLongestKeyword = 79;
 
 struct RawChunk {
@@ -184,10 +185,15 @@ void takeDensity(ByteView data, Metadata& metadata) {
     metadata.density = {edge(0), edge(4), data[8] == 1 ? DensityUnit::Metre : DensityUnit::None};
 }
 
+void takeColors(ByteView data, Metadata& metadata) {
+    if (data.size() == 4)
+        metadata.colors = ColorCodes{data[0], data[1], data[2], data[3] != 0};
+}
+
 // Chunks that describe the picture whatever becomes of its samples. The others that may stand in a file tell
 // how these are stored, or belong to an animation.
 bool isKept(std::string_view name) {
-    constexpr std::array names = {"gAMA"sv, "cHRM"sv, "sRGB"sv, "cICP"sv, "mDCV"sv, "cLLI"sv, "tIME"sv,
+    constexpr std::array names = {"gAMA"sv, "cHRM"sv, "sRGB"sv, "mDCV"sv, "cLLI"sv, "tIME"sv,
                                   "bKGD"sv, "oFFs"sv, "pCAL"sv, "sCAL"sv, "sTER"sv, "sPLT"sv};
     return std::find(names.begin(), names.end(), name) != names.end();
 }
@@ -207,13 +213,23 @@ bool isText(std::string_view name) {
 bool suits(const Chunk& chunk, ByteView header) {
     if (chunk.name != "bKGD")
         return true;
-    const bool color = number(header, 9, 1, ByteOrder::Big) % 4 >= 2;
-    return number(header, 8, 1, ByteOrder::Big) >= 8 && chunk.data.size() == (color ? 6 : 2);
+    const bool color = header[9] % 4 >= 2;
+    return header[8] >= 8 && chunk.data.size() == (color ? 6 : 2);
 }
 
 void takeChunk(Chunk chunk, ByteView header, Metadata& metadata) {
-    if (header.size() >= 13 && suits(chunk, header))
+    if (suits(chunk, header))
         metadata.chunks.push_back(std::move(chunk));
+    else
+        metadata.unheld.push_back("the PNG chunk " + chunk.name);
+}
+
+// The bits that the samples were made of; the result's fill all that there are.
+void takeSignificance(ByteView bits, ByteView header, Metadata& metadata) {
+    constexpr std::uint8_t palette = 3;
+    const std::uint8_t depth = header[9] == palette ? std::uint8_t{8} : header[8];
+    if (std::any_of(bits.begin(), bits.end(), [&](std::uint8_t bit) { return bit < depth; }))
+        metadata.unheld.emplace_back("the PNG chunk sBIT");
 }
 
 void put(Bytes& file, std::string_view name, ByteView data) {
@@ -264,13 +280,16 @@ void putResources(Bytes& file, ByteView resources) {
     put(file, "zTXt", data);
 }
 
-void putMetadata(Bytes& file, const Metadata& metadata, ByteView header) {
+void putMetadata(Bytes& file, const Metadata& metadata) {
     for (const Chunk& chunk : metadata.chunks)
-        if (suits(chunk, header))
-            put(file, chunk.name, chunk.data);
+        put(file, chunk.name, chunk.data);
     if (metadata.format != FileFormat::Png)
         for (const Chunk& chunk : pngTexts(metadata.texts))
             put(file, chunk.name, chunk.data);
+    if (const auto& colors = metadata.colors)
+        put(file, "cICP",
+            Bytes{static_cast<std::uint8_t>(colors->primaries), static_cast<std::uint8_t>(colors->transfer),
+                  static_cast<std::uint8_t>(colors->matrix), static_cast<std::uint8_t>(colors->fullRange)});
     if (metadata.density)
         put(file, "pHYs", densityChunk(*metadata.density));
     if (!metadata.exif.empty())
@@ -287,6 +306,9 @@ Metadata readPngMetadata(ByteView file) {
     Metadata metadata;
     metadata.format = FileFormat::Png;
     const std::vector<RawChunk> chunks = chunksOf(file);
+    if (chunks.empty() || chunks.front().data.size() < kHeaderSize)
+        return metadata; // which the reader of the picture refuses
+    const ByteView header = chunks.front().data;
     // The chunk for Exif goes before a text that holds one.
     for (const RawChunk& chunk : chunks)
         if (chunk.name == "eXIf" && metadata.exif.empty())
@@ -296,8 +318,12 @@ Metadata readPngMetadata(ByteView file) {
             takeText(chunk, metadata);
         else if (chunk.name == "pHYs")
             takeDensity(chunk.data, metadata);
+        else if (chunk.name == "cICP")
+            takeColors(chunk.data, metadata);
         else if (isKept(chunk.name))
-            takeChunk({std::string(chunk.name), copyOf(chunk.data)}, chunks.front().data, metadata);
+            takeChunk({std::string(chunk.name), copyOf(chunk.data)}, header, metadata);
+        else if (chunk.name == "sBIT")
+            takeSignificance(chunk.data, header, metadata);
         else if (chunk.name != "eXIf" && !isKnownStorage(chunk.name))
             metadata.unheld.push_back("the PNG chunk " + std::string(chunk.name));
     }
@@ -311,9 +337,28 @@ void embedIntoPng(const Metadata& metadata, Bytes& encoded) {
             continue;
         append(file, chunk.whole);
         if (chunk.name == "IHDR")
-            putMetadata(file, metadata, chunk.data);
+            putMetadata(file, metadata);
     }
     encoded = std::move(file);
+}
+
+bool hasPngChunk(ByteView file, std::string_view name) {
+    const std::vector<RawChunk> chunks = chunksOf(file);
+    return std::any_of(chunks.begin(), chunks.end(), [&](const RawChunk& one) { return one.name == name; });
+}
+
+int pngFrames(ByteView file) {
+    std::uint64_t frames = 0;
+    bool isFrame = false; // the picture for readers that do not know animations
+    for (const RawChunk& chunk : chunksOf(file)) {
+        if (chunk.name == "IDAT")
+            break;
+        if (chunk.name == "acTL" && chunk.data.size() >= 4)
+            frames = number(chunk.data, 0, 4, ByteOrder::Big);
+        isFrame = isFrame || chunk.name == "fcTL";
+    }
+    const int shown = static_cast<int>(std::min<std::uint64_t>(frames, INT32_MAX));
+    return shown == 0 ? 1 : std::max(shown, isFrame ? 1 : 2);
 }
 
 std::vector<Chunk> pngTexts(const std::vector<Text>& texts) {

@@ -10,14 +10,6 @@ namespace {
 
 constexpr std::size_t kHeader = 26;
 
-// The part of the file at `at`, which is moved behind it.
-ByteView part(ByteView file, std::size_t& at) {
-    const std::size_t size = number(file, at, 4, ByteOrder::Big);
-    const ByteView data = slice(file, at + 4, size);
-    at += 4 + size;
-    return data;
-}
-
 Bytes dataOf(const ImageResources& resources, std::uint16_t id) {
     const ImageResource* found = resources.find(id);
     return found == nullptr ? Bytes() : copyOf(found->data);
@@ -27,12 +19,18 @@ Bytes dataOf(const ImageResources& resources, std::uint16_t id) {
 const std::vector<std::uint16_t> kElsewhere = {
     resource::IccProfile, resource::Exif, resource::Exif3, resource::Xmp, 0x0400, 0x0402, 0x042D, 0x0430};
 
-// A single one is the merged picture itself. Below zero the first transparency is that of the merged picture.
-int layerCount(ByteView layers) {
-    if (layers.size() < 6 || number(layers, 0, 4, ByteOrder::Big) == 0)
-        return 0;
-    const auto count = static_cast<std::int16_t>(number(layers, 4, 2, ByteOrder::Big));
-    return std::abs(int{count});
+// Those of 16 bits stand in a named block, of a multiple of four bytes, behind the place of others.
+ByteView deepLayers(Cursor section) {
+    section.block(); // the mask of all
+    while (section.rest().size() >= 12) {
+        section.take(4);
+        const std::string_view name = asText(section.take(4));
+        const ByteView data = section.block();
+        if (name == "Lr16")
+            return data;
+        section.take((4 - data.size() % 4) % 4);
+    }
+    return {};
 }
 
 } // namespace
@@ -41,20 +39,40 @@ Metadata readPsdMetadata(ByteView file) {
     Metadata metadata;
     metadata.format = FileFormat::Psd;
     try {
-        std::size_t at = kHeader;
-        part(file, at); // the palette
-        const ByteView list = part(file, at);
+        Cursor cursor(file);
+        cursor.take(kHeader);
+        cursor.block(); // the palette
+        const ByteView list = cursor.block();
         const ImageResources resources = imageResources(list);
         metadata.exif = dataOf(resources, resource::Exif);
         metadata.xmp = dataOf(resources, resource::Xmp);
         metadata.density = resourceDensity(list);
         metadata.resources = withoutResources(list, kElsewhere);
-        if (layerCount(part(file, at)) > 1)
+        if (psdLayers(cursor.block()).count > 0)
             metadata.unheld.emplace_back("the layers");
     } catch (const DamagedBytes&) {
         metadata.damaged.emplace_back("Photoshop's data");
     }
     return metadata;
+}
+
+// The count is below zero where the first channel beside the colours is transparency.
+PsdLayers psdLayers(ByteView section) {
+    PsdLayers layers;
+    try {
+        Cursor cursor(section);
+        ByteView list = cursor.isAtEnd() ? section : cursor.block();
+        if (list.empty() && !cursor.isAtEnd())
+            list = deepLayers(cursor);
+        if (list.empty())
+            return layers;
+        const auto count = static_cast<std::int16_t>(number(list, 0, 2, ByteOrder::Big));
+        layers.transparency = count < 0;
+        layers.count = std::abs(int{count}) > 1 ? std::abs(int{count}) : 0;
+    } catch (const DamagedBytes&) {
+        // Then none can be told of.
+    }
+    return layers;
 }
 
 } // namespace orvela

@@ -102,10 +102,11 @@ TagField classic(const TiffView& view, const TagEntry& entry) {
     return field;
 }
 
-std::vector<TagField> fieldsOf(const TiffView& view, const TagDirectory& directory) {
+// Of the first directory what describes the picture.
+std::vector<TagField> fieldsOf(const TiffView& view, const TagDirectory& directory, bool first) {
     std::vector<TagField> fields;
     for (const TagEntry& entry : directory.entries)
-        if (!entry.value.empty() && !isPointer(entry.tag))
+        if (!entry.value.empty() && !isPointer(entry.tag) && !(first && isTiffStructure(entry.tag)))
             fields.push_back(classic(view, entry));
     return fields;
 }
@@ -123,10 +124,9 @@ void addBelow(std::vector<TagField>& fields, std::uint16_t pointer, const std::v
 Bytes blockOf(const TiffView& view, const ExifDirectories& directories, const TagEntry* note) {
     const auto fields = [&](std::uint16_t pointer) {
         const TagDirectory* found = directories.find(pointer);
-        return found == nullptr ? std::vector<TagField>() : fieldsOf(view, *found);
+        return found == nullptr ? std::vector<TagField>() : fieldsOf(view, *found, pointer == 0);
     };
     std::vector<TagField> first = fields(0);
-    std::erase_if(first, [](const TagField& field) { return isTiffStructure(field.tag); });
     std::vector<TagField> exif = fields(tiff::ExifIfd);
     BlockBuilder builder(view.order(), note);
     addBelow(exif, tiff::InteropIfd, fields(tiff::InteropIfd), builder, view.order());

@@ -48,14 +48,14 @@ void CThreadedCore::run() {
     mTaskNumber = 0;
     mFailure = {};
 
-    announce(0, 1, "Duplicating Input Plane");
+    announce(0, 1, "Duplicating Input Plane", "Copying the picture");
     emitPercentDone(0);
     if (runPipeline()) {
-        announce(1, 1, "All Done");
+        announce(1, 1, "All Done", "Done");
         emitPercentDone(100);
         mLastProcessingDone = true;
     } else {
-        announce(0, 1, "Failed");
+        announce(0, 1, "Failed", "Failed");
         emitPercentDone(0);
     }
 }
@@ -121,7 +121,8 @@ void CThreadedCore::emitPercentDone(int percent) {
     Q_EMIT percentDone(percent);
 }
 
-void CThreadedCore::announce(int step, int total, const char* name) {
+void CThreadedCore::announce(int step, int total, const char* name, const char* title) {
+    mStepTitle = title;
     Q_EMIT stepDone(step, total, QString::fromLatin1(name));
     QCoreApplication::processEvents();
     // The permit may come from a handler on this very thread, so waiting must let its events through.

@@ -64,6 +64,9 @@ public:
     /// Asks the run to end: rows not yet begun are not worked on. From any thread.
     void stop();
 
+    /// What the step that was announced last does, in words for people.
+    const char* stepTitle() const { return mStepTitle; }
+
     /// Releases the permit that the run waits for after each stepDone().
     void stepHandled();
 
@@ -102,7 +105,7 @@ protected:
     virtual bool doRun() = 0;
 
     /// Emits stepDone(), processes events and waits until the step was handled.
-    void announce(int step, int total, const char* name);
+    void announce(int step, int total, const char* name, const char* title);
 
     /// Makes, applies and destroys one task.
     void runTask(const orvela::PipelineTask& task);
@@ -121,6 +124,7 @@ private:
     void record(const orvela::PipelineTask& task, const TaskBase& made);
 
     QSemaphore mSemaphore;
+    const char* mStepTitle = "";
     bool mLastProcessingDone = false;
     int mLastPercent = 0;
     std::atomic<int> mReportedPercent = 0; ///< latest percentage of any row

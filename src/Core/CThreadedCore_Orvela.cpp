@@ -25,7 +25,7 @@ bool CThreadedCore_Orvela::doRun() {
         if (step.logBefore)
             Log::log(LogLevel::Debug, "%s", step.logBefore);
         if (!step.announced || step.announced(mParams))
-            announce(mCurrentStep++, mTotalSteps, step.label);
+            announce(mCurrentStep++, mTotalSteps, step.label, step.title);
         for (const PipelineTask& task : step.tasks)
             runTask(task);
         if (step.logAfter)

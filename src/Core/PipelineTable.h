@@ -22,7 +22,8 @@ struct PipelineTask {
 
 /// One announced step and the tasks run under it, in order.
 struct PipelineStep {
-    const char* label;
+    const char* label; ///< as announced and logged
+    const char* title; ///< the same for people
     std::vector<PipelineTask> tasks;
     bool (*announced)(const CUserParams& params) = nullptr; ///< null: always
     const char* logBefore = nullptr;                        ///< debug line before the announcement

@@ -2,9 +2,7 @@
 
 #include "Settings/SettingFields.h"
 
-#include <QFile>
 #include <QJsonDocument>
-#include <QSaveFile>
 
 namespace orvela {
 
@@ -36,7 +34,7 @@ void checkValue(const QString& path, const QString& name, const QJsonValue& valu
         fail(path, QStringLiteral("%1 must be a number from 0 to %2").arg(name).arg(high));
 }
 
-QJsonObject parse(const QString& path, const QByteArray& text) {
+QJsonObject rootOf(const QByteArray& text, const QString& path) {
     QJsonParseError error;
     const QJsonDocument document = QJsonDocument::fromJson(text, &error);
     if (document.isNull())
@@ -59,13 +57,9 @@ QJsonObject parse(const QString& path, const QByteArray& text) {
 
 PresetFile::PresetFile() : mRoot{{kVersionKey, kVersion}, {kSettingsKey, QJsonObject()}} {}
 
-PresetFile PresetFile::read(const QString& path) {
-    QFile file(path);
-    if (!file.open(QIODevice::ReadOnly))
-        fail(path, QStringLiteral("cannot be read (%1); check the name and its permissions")
-                       .arg(file.errorString()));
+PresetFile PresetFile::parse(const QByteArray& text, const QString& path) {
     PresetFile preset;
-    preset.mRoot = parse(path, file.readAll());
+    preset.mRoot = rootOf(text, path);
     const QJsonObject settings = preset.mRoot.value(kSettingsKey).toObject();
     for (auto entry = settings.begin(); entry != settings.end(); ++entry)
         checkValue(path, entry.key(), entry.value());
@@ -95,11 +89,8 @@ void PresetFile::take(const CSliderParams& sliders) {
     mRoot.insert(kSettingsKey, settings);
 }
 
-void PresetFile::write(const QString& path) const {
-    QSaveFile file(path);
-    const QByteArray text = QJsonDocument(mRoot).toJson();
-    if (!file.open(QIODevice::WriteOnly) || file.write(text) != text.size() || !file.commit())
-        fail(path, QStringLiteral("cannot be written (%1); choose another place").arg(file.errorString()));
+QByteArray PresetFile::text() const {
+    return QJsonDocument(mRoot).toJson();
 }
 
 QStringList PresetFile::unknownNames() const {

@@ -9,38 +9,38 @@
 
 namespace orvela {
 
-/// A preset file that cannot be read or written: the text names the file, the cause and what to do.
+/// A file that is no preset, or cannot be read: the text names the file, the cause and what to do.
 class PresetError : public std::runtime_error {
 public:
     using std::runtime_error::runtime_error;
 };
 
-/// Settings as a JSON file, by field name:
+/// Settings as the text of a JSON file, by field name:
 ///
 ///     { "version": 1, "settings": { "SaturationValue": 640, "SaturationEnabled": true } }
 ///
 /// Values are positions (0 to 1000) or picker colours (0 to 255), switches are true or false. Whatever else
-/// the file holds is kept as it is and written back.
+/// the text holds is kept as it is and comes back in text().
 class PresetFile {
 public:
     /// An empty preset.
     PresetFile();
 
-    /// @throws PresetError for a file that cannot be read, is no preset, has a newer version or holds a value
-    ///         of the wrong type or out of range
-    static PresetFile read(const QString& path);
+    /// @param path  of the file that holds the text, for messages
+    /// @throws PresetError for a text that is no preset, has a newer version or holds a value of the wrong
+    ///         type or out of range
+    static PresetFile parse(const QByteArray& text, const QString& path);
 
-    /// Sets the fields that the file names; the others stay.
+    /// Sets the fields that the text names; the others stay.
     void applyTo(CSliderParams& sliders) const;
 
     /// Takes every field of `sliders`.
     void take(const CSliderParams& sliders);
 
-    /// Writes the whole file or, when that fails, leaves an older one as it was.
-    /// @throws PresetError
-    void write(const QString& path) const;
+    /// What the file is to hold.
+    QByteArray text() const;
 
-    /// Names in the file that this version does not know.
+    /// Names in the text that this version does not know.
     QStringList unknownNames() const;
 
 private:

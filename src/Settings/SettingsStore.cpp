@@ -1,8 +1,12 @@
 #include "Settings/SettingsStore.h"
 
+#include <QStandardPaths>
+
 namespace orvela {
 
 namespace {
+
+const QString kOrganization = QStringLiteral("Kestrand");
 
 QString& application() {
     static QString name = QStringLiteral("Orvela");
@@ -12,7 +16,13 @@ QString& application() {
 } // namespace
 
 QSettings openSettings() {
-    return QSettings(QStringLiteral("Kestrand"), application());
+    return QSettings(kOrganization, application());
+}
+
+QString settingsPath() {
+    return QStringLiteral("%1/%2/%3.conf")
+        .arg(QStandardPaths::writableLocation(QStandardPaths::GenericConfigLocation), kOrganization,
+             application());
 }
 
 void setSettingsApplication(const QString& name) {

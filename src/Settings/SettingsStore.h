@@ -9,6 +9,9 @@ namespace orvela {
 /// names.
 QSettings openSettings();
 
+/// The file of the store on systems without a registry, told without reading it.
+QString settingsPath();
+
 /// Has the store of another application opened from now on. Tests keep to one of their own.
 void setSettingsApplication(const QString& name);
 

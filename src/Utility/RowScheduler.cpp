@@ -9,6 +9,11 @@
 #include <tbb/partitioner.h>
 #include <tbb/task_arena.h>
 
+#include <latch>
+#include <system_error>
+#include <thread>
+#include <vector>
+
 #if defined(__SANITIZE_THREAD__)
 #include <sanitizer/tsan_interface.h>
 #endif
@@ -37,9 +42,30 @@ void handOver(const void*) {}
 void takeOver(const void*) {}
 #endif
 
+// Whether so many threads can run beside the calling one. A worker that cannot be started is one that the
+// library waits for, without end, before it lets go of its workers.
+bool canStart(int threads) {
+    std::latch end(1);
+    std::vector<std::thread> started;
+    started.reserve(static_cast<std::size_t>(threads));
+    bool can = true;
+    try {
+        for (int i = 0; i < threads; ++i)
+            started.emplace_back([&end] { end.wait(); });
+    } catch (const std::system_error&) {
+        can = false;
+    }
+    end.count_down();
+    for (std::thread& thread : started)
+        thread.join();
+    return can;
+}
+
 } // namespace
 
 RowScheduler::RowScheduler(int threads) : mImpl(std::make_unique<Impl>()) {
+    if (!canStart((threads >= 1 ? threads : defaultThreads()) - 1))
+        threads = 1;
     // The library keeps to one thread per processor otherwise. The limit holds for the whole process, so a
     // scheduler with fewer threads must not set it.
     if (threads > defaultThreads()) {

@@ -11,6 +11,7 @@ namespace orvela {
 /// had as far as every living scheduler that asks for more allows.
 class RowScheduler {
 public:
+    /// Uses the calling thread alone when the system does not grant as many.
     /// @param threads  number of threads, or below 1 for the automatic choice (one per processor)
     explicit RowScheduler(int threads);
     /// Ends the worker threads that no other scheduler uses.

@@ -34,6 +34,7 @@ struct Session {
         QObject::connect(
             &core, &CThreadedCore::stepDone, &core, [this](int step, int total, const QString& name) {
                 steps.push_back(QStringLiteral("%1/%2 %3").arg(step).arg(total).arg(name).toStdString());
+                titles.emplace_back(core.stepTitle());
                 if (onStep)
                     onStep(name);
                 core.stepHandled();
@@ -47,6 +48,7 @@ struct Session {
     CARGBPlaneProxyDirect proxy;
     Core core;
     std::vector<std::string> steps;
+    std::vector<std::string> titles;
     std::vector<int> percents;
     std::function<void(const QString&)> onStep;
 };
@@ -58,6 +60,10 @@ TEST(CThreadedCore, AnnouncesItsStepsAndTheSpotsOnlyWhenTheyAreRemoved) {
         session.core.run();
         ASSERT_EQ(session.steps.size(), count);
         EXPECT_EQ(session.steps.front(), "0/1 Duplicating Input Plane");
+        EXPECT_EQ(session.titles.front(), "Copying the picture");
+        EXPECT_EQ(session.titles.at(count - 2), "Automatic gamma, second pass");
+        for (const std::string& title : session.titles)
+            EXPECT_TRUE(title.size() > 3 && title.find('_') == std::string::npos) << title;
         EXPECT_EQ(session.steps[1], "0/34 Sharp_Smart");
         EXPECT_EQ(session.steps[17], sixteenth);
         EXPECT_EQ(session.steps[count - 2], std::to_string(count - 3) + "/34 Auto_Gamma");

@@ -1,6 +1,7 @@
 #include "command/SettingOptions.h"
 
 #include "command/ModeNames.h"
+#include "command/NearestNames.h"
 
 #include <gtest/gtest.h>
 
@@ -22,8 +23,8 @@ TEST(ModeNames, ModesAreFoundByEitherNameInAnyWriting) {
     EXPECT_EQ(ModeNames::find(""), nullptr);
     for (const ModeDescription* mode : ModeNames::selectable())
         EXPECT_EQ(ModeNames::find(ModeNames::identifierOf(*mode)), mode);
-    EXPECT_EQ(ModeNames::nearest("portret").front(), "Portrait");
-    EXPECT_EQ(ModeNames::nearest("macropo").front(), "MacroPro");
+    EXPECT_EQ(NearestNames::of("portret", ModeNames::identifiers()).front(), "Portrait");
+    EXPECT_EQ(NearestNames::of("macropo", ModeNames::identifiers()).front(), "MacroPro");
 }
 
 TEST(SettingOptions, ShownNumbersBecomePositions) {

@@ -53,7 +53,7 @@ TEST(Animations, AreRefusedByNameUnlessTheFirstFrameIsAskedFor) {
         const char* cause;
         const char* note;
     } animations[] = {
-        {"a.webp", "is an animation of 3 frames; --first-frame", "cannot hold: the other 2 frames"},
+        {"a.webp", "is an animation of 3 frames; --first-frame", "the other 2 frames"},
         {"three.png", "is an animation of 3 frames; --first-frame", "cannot hold: the other 2 frames"},
         {"hidden.png", "is an animation of 2 frames; --first-frame", "cannot hold: the other frame"},
         {"twelve.avif", "is an image sequence of 12 frames; --first", "cannot hold: the other 11 frames"}};

@@ -3,6 +3,7 @@
 #include "files/PhotographReader.h"
 #include "hosts/TestFiles.h"
 #include "hosts/TestPhotograph.h"
+#include "metadata/JpegSegments.h"
 
 #include <gmock/gmock.h>
 
@@ -12,6 +13,9 @@
 using namespace orvela;
 
 namespace {
+
+using testing::Contains;
+using testing::Field;
 
 Bytes bytesOf(const std::string& text) {
     return {text.begin(), text.end()};
@@ -133,6 +137,19 @@ TEST(JpegFile, WritesEveryLayoutThatCanBeRead) {
         EXPECT_EQ(read.encoding.jpeg, inks.encoding.jpeg);
         EXPECT_LT(meanError(read, inks), marked ? 40 : 25);
     }
+    Photograph arithmetic = plain(ColorModel::Grey);
+    JpegLayout::Component component;
+    component.quantizer.fill(3);
+    arithmetic.encoding.format = FileFormat::Jpeg;
+    arithmetic.encoding.jpeg = {Grey, false, {component}, true};
+    for (const bool progressive : {false, true}) {
+        arithmetic.encoding.progressive = progressive;
+        const Bytes coded = encodeJpeg(arithmetic, "t.jpg", {});
+        EXPECT_EQ(jpegSize(coded), (JpegSize{61, 47}));
+        EXPECT_EQ(readJpeg(coded, "t.jpg").encoding.jpeg, arithmetic.encoding.jpeg);
+        EXPECT_LT(meanError(readJpeg(coded, "t.jpg"), arithmetic), 3);
+        EXPECT_THAT(jpegSegments(coded), Contains(Field(&JpegSegment::marker, progressive ? 0xCA : 0xC9)));
+    }
     Photograph wide = plain(ColorModel::Rgb);
     JpegLayout& layout = wide.encoding.jpeg.emplace();
     layout.components.resize(3);
@@ -182,6 +199,15 @@ TEST(JpegFile, KeepsLargeProfiles) {
     const Bytes jpeg = encodeJpeg(photograph, "t.jpg", {});
     const Photograph read = readJpeg(jpeg, "t.jpg");
     EXPECT_EQ(read.iccProfile, photograph.iccProfile);
+    // One of which a part is missing is none.
+    Bytes parted = jpeg;
+    const std::string_view head("ICC_PROFILE\0\2", 13);
+    const auto second = std::search(parted.begin(), parted.end(), head.begin(), head.end());
+    ASSERT_NE(second, parted.end());
+    second[12] = 9;
+    const Photograph without = readJpeg(parted, "t.jpg");
+    EXPECT_TRUE(without.iccProfile.empty());
+    EXPECT_THAT(without.unheld, testing::ElementsAre("the ICC profile, which is damaged"));
     photograph.iccProfile.resize(17'000'000);
     EXPECT_THROW(encodeJpeg(photograph, "t.jpg", {}), PhotographError);
 }
@@ -198,6 +224,26 @@ TEST(JpegFile, RefusesDamage) {
         ADD_FAILURE() << "read";
     } catch (const PhotographError& error) {
         EXPECT_THAT(error.what(), testing::StartsWith("s.jpg: is damaged or cut short ("));
+    }
+}
+
+// Each scan takes the time of a whole picture, and few bytes.
+TEST(JpegFile, RefusesToReadForHours) {
+    WriteOptions options;
+    options.progressive = true;
+    const Bytes jpeg = encodeJpeg(plain(ColorModel::Grey), "s.jpg", options);
+    const std::string_view start("\xFF\xDA");
+    const auto last = std::find_end(jpeg.begin(), jpeg.end(), start.begin(), start.end(),
+                                    [](std::uint8_t a, char b) { return a == static_cast<std::uint8_t>(b); });
+    Bytes many(jpeg.begin(), last);
+    for (int i = 0; i < 1100; ++i)
+        many.insert(many.end(), last, jpeg.end() - 2);
+    append(many, "\xFF\xD9");
+    try {
+        readJpeg(many, "s.jpg");
+        ADD_FAILURE() << "read";
+    } catch (const PhotographError& error) {
+        EXPECT_THAT(error.what(), testing::StartsWith("s.jpg: is damaged: it has over 1000 scans; "));
     }
 }
 

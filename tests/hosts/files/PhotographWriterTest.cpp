@@ -153,6 +153,39 @@ TEST(PhotographWriter, KilledInTheMiddleLeavesNoPartUnderTheFinalName) {
         fs::remove(folder / "a.tif");
     }
     EXPECT_GT(unfinished, 0);
+    TargetFile(folder / "a.tif").commit(true);
+    EXPECT_EQ(folder.count(), 1U) << "the next run removes what the killed ones left";
+}
+
+// Others that write the same target keep what they write, however many are killed meanwhile.
+TEST(PhotographWriter, LeavesTheTemporariesOfLivingProcesses) {
+    const TestFolder folder;
+    std::vector<pid_t> children;
+    for (int i = 0; i < 8; ++i) {
+        children.push_back(::fork());
+        if (children.back() != 0)
+            continue;
+        for (int round = 0; round < 40; ++round) {
+            TargetFile file(folder / "a.tif");
+            file.write(Bytes(1000, static_cast<std::uint8_t>(i)));
+            ::usleep(500);
+            file.write(Bytes(1000, static_cast<std::uint8_t>(i)));
+            file.commit(true);
+        }
+        ::_exit(0);
+    }
+    ::usleep(20000);
+    ::kill(children[0], SIGKILL);
+    ::kill(children[1], SIGKILL);
+    for (std::size_t i = 0; i < children.size(); ++i) {
+        int status = -1;
+        ::waitpid(children[i], &status, 0);
+        EXPECT_EQ(status, i < 2 ? SIGKILL : 0);
+    }
+    const std::string text = folder.text("a.tif");
+    EXPECT_EQ(text, std::string(2000, text.at(0)));
+    TargetFile(folder / "a.tif").commit(true);
+    EXPECT_EQ(folder.count(), 1U);
 }
 
 // Given settings go before the source's.

@@ -341,7 +341,9 @@ TEST(TiffPages, TellWhatTheyBecome) {
         "convert p.png -colors 16 png8:q.png && convert q.png -type Palette -compress LZW palette.tif && "
         "vips tiffsave p.png jpeg.tif "
         "--compression jpeg --Q 71 && exiftool -q -overwrite_original -m '-ImageSourceData<=p.png' jpeg.tif");
-    EXPECT_THAT(rewrite(folder / "bits.tif", folder / "b.tif"), ElementsAre(HasSubstr("expanded to 8 bits")));
+    EXPECT_THAT(rewrite(folder / "bits.tif", folder / "b.tif"),
+                ElementsAre(HasSubstr("cannot hold: its kind of compression (lzw is written)"),
+                            HasSubstr("expanded to 8 bits")));
     EXPECT_THAT(rewrite(folder / "palette.tif", folder / "p.tif"),
                 ElementsAre(HasSubstr("palette was resolved")));
     EXPECT_THAT(rewrite(folder / "jpeg.tif", folder / "j.tif"), ElementsAre(HasSubstr("the layers")));
@@ -351,6 +353,32 @@ TEST(TiffPages, TellWhatTheyBecome) {
         "p.tif rgb:t && cmp s t");
     EXPECT_EQ(readPhotograph(folder / "j.tif").encoding.quality, 71);
     EXPECT_EQ(folder.output("exiftool -s3 -Compression -YCbCrSubSampling j.tif"), "JPEG\nYCbCr4:2:0 (2 2)\n");
+}
+
+// A preview before the data of a sensor is none of them; one smaller picture below another is no raw file.
+TEST(TiffPages, OfCameraRawFilesAreRefused) {
+    const TestFolder folder;
+    for (const int below : {PHOTOMETRIC_RGB, PHOTOMETRIC_CFA}) {
+        {
+            const Tiff tiff = openTiff(folder / "s.tif", "w");
+            toff_t places[] = {0};
+            TIFFSetField(tiff.get(), TIFFTAG_SUBIFD, 1, places);
+            writePage(tiff.get(), kPages[0], 0);
+            Page page = {16, 14, 8, 1, below};
+            page.samples = below == PHOTOMETRIC_RGB ? 3 : 1;
+            writePage(tiff.get(), page, 1);
+        }
+        if (below == PHOTOMETRIC_RGB) {
+            EXPECT_THAT(rewrite(folder / "s.tif", folder / "t.tif"), ElementsAre(HasSubstr("sub-images")));
+            continue;
+        }
+        try {
+            readPhotograph(folder / "s.tif");
+            ADD_FAILURE() << "read";
+        } catch (const PhotographError& error) {
+            EXPECT_THAT(error.what(), HasSubstr("s.tif: is a camera's raw file; "));
+        }
+    }
 }
 
 TEST(TiffPages, ThatAreDamagedAreNamed) {
@@ -390,6 +418,11 @@ END
         }
     }
     EXPECT_EQ(folder.count(), causes.size() + 2); // the source and the log
+    // One that is cut while it is read, too.
+    PhotographReader reader(folder / "s.tif");
+    reader.next();
+    fs::resize_file(folder / "s.tif", 100);
+    EXPECT_THROW(reader.next(), PhotographError);
     EXPECT_THAT(writePhotograph(readPhotograph(folder / "beyond.tif", {.firstOnly = true}), folder / "t.png"),
                 ElementsAre(HasSubstr("the other pages")));
 }

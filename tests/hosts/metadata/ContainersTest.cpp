@@ -6,6 +6,7 @@
 #include "files/TiffWriter.h"
 #include "hosts/TestFiles.h"
 #include "hosts/TestPhotograph.h"
+#include "metadata/ExtendedXmp.h"
 #include "metadata/ImageResources.h"
 #include "metadata/MetadataReader.h"
 #include "metadata/MetadataWriter.h"
@@ -20,10 +21,13 @@ using namespace orvela;
 
 namespace {
 
+using testing::AllOf;
+using testing::Contains;
 using testing::ElementsAre;
 using testing::EndsWith;
 using testing::HasSubstr;
 using testing::IsEmpty;
+using testing::Not;
 
 // Puts `piece`, given as Python, behind the first `at` bytes of a file.
 std::string insert(const char* file, int at, const std::string& piece) {
@@ -81,6 +85,10 @@ TEST(Containers, KeepTheirOwnDensityWhateverExifSays) {
         folder.run(std::string("rm ") + c.target);
     }
     EXPECT_NEAR(readPhotograph(folder / "e.jpg").xResolution, 300 / 25.4, 1e-9);
+    // Without a unit it is the shape of the pixels, for which not every format has a place.
+    folder.run("exiftool -q -overwrite_original -JFIF:YResolution=2 n.jpg");
+    EXPECT_THAT(convert(folder, "n.jpg", "t.png"), IsEmpty());
+    EXPECT_THAT(convert(folder, "n.jpg", "t.webp"), ElementsAre(EndsWith("hold: the shape of its pixels")));
 }
 
 TEST(Containers, CarryTextsAndColoursOfPng) {
@@ -97,9 +105,9 @@ TEST(Containers, CarryTextsAndColoursOfPng) {
     const std::string list = "exiftool -a -s -PNG:all -x Interlace ";
     EXPECT_EQ(folder.output(list + "t.png"), folder.output(list + "s.png"));
     EXPECT_THAT(folder.output(list + "t.png"), HasSubstr("A title"));
-    EXPECT_THAT(
-        convert(folder, "s.png", "t.jpg"),
-        ElementsAre(EndsWith("the JPEG file cannot hold: PNG texts Title; PNG chunks gAMA, cHRM, tIME")));
+    EXPECT_THAT(convert(folder, "s.png", "t.jpg"),
+                ElementsAre(EndsWith(
+                    "the JPEG file cannot hold: PNG texts Title; PNG chunks gAMA, cHRM, tIME, bKGD")));
     EXPECT_EQ(folder.output("exiftool -s3 -Artist -Copyright -Comment t.jpg"), "A. Writer\ngrün\ncafé\n");
     EXPECT_THAT(convert(folder, "t.jpg", "u.png"), IsEmpty());
     EXPECT_EQ(folder.output("exiftool -s3 -PNG:Comment -EXIF:Artist u.png"), "café\nA. Writer\n");
@@ -110,6 +118,26 @@ TEST(Containers, CarryTextsAndColoursOfPng) {
                       "+ chunk(b'tEXt', b'Author\\0A') ") +
                " && exiftool -q -overwrite_original -EXIF:Artist=A p.png");
     EXPECT_THAT(convert(folder, "p.png", "p.jpg"), IsEmpty());
+}
+
+// What tells of old samples, of a palette or of nothing known does not go.
+TEST(Containers, NameSmallChunksThatDoNotTravel) {
+    const TestFolder folder;
+    folder.run(
+        "convert $S/coffee.png -resize 64x48! -strip -define png:exclude-chunks=all s.png && "
+        "cp s.png d.png && convert s.png -colors 8 -define png:exclude-chunks=all png8:p.png && "
+        "convert s.png w.webp && " +
+        insert("s.png", kBehindPngHeader, "chunk(b'sBIT', bytes([8, 8, 8]))") + " && " +
+        insert("d.png", kBehindPngHeader, "chunk(b'sBIT', bytes([5, 6, 5]))") + " && " +
+        insert("p.png", kBehindPngHeader, "chunk(b'bKGD', bytes(1))") +
+        " && python3 -c \"import struct; b = open('w.webp', 'rb').read(); c = b'ABCD' + struct.pack('<I', "
+        "4) + bytes(4); h = bytes([0] * 4) + struct.pack('<I', 63)[:3] + struct.pack('<I', 47)[:3]; "
+        "b = b'WEBPVP8X' + struct.pack('<I', 10) + h + b[12:] + c; "
+        "open('w.webp', 'wb').write(b'RIFF' + struct.pack('<I', len(b)) + b)\"");
+    EXPECT_THAT(convert(folder, "s.png", "s.jpg"), IsEmpty());
+    EXPECT_THAT(convert(folder, "d.png", "e.png"), ElementsAre(EndsWith("hold: the PNG chunk sBIT")));
+    EXPECT_THAT(convert(folder, "p.png", "q.png"), Contains(EndsWith("hold: the PNG chunk bKGD")));
+    EXPECT_THAT(convert(folder, "w.webp", "x.webp"), ElementsAre(EndsWith("hold: the WebP chunk ABCD")));
 }
 
 TEST(Containers, CarryPhotoshopsResources) {
@@ -199,6 +227,8 @@ TEST(Containers, SplitLongXmpAndShortenLongExif) {
                "'-XMP-dc:Description<=long' s.png");
     EXPECT_THAT(convert(folder, "s.png", "t.jpg.jpg"), IsEmpty());
     EXPECT_EQ(folder.output("exiftool -b -XMP-dc:Description t.jpg.jpg"), folder.text("long"));
+    EXPECT_THAT(convert(folder, "t.jpg.jpg", "u.png"), IsEmpty());
+    EXPECT_EQ(folder.output("exiftool -b -XMP-dc:Description u.png"), folder.text("long"));
 
     Metadata metadata;
     ExifBlock block({});
@@ -225,7 +255,38 @@ TEST(Containers, SplitLongXmpAndShortenLongExif) {
     metadata.exif = block.bytes();
     const PreparedMetadata tooLong = prepareMetadata(metadata, FileFormat::Jpeg, {1, 1, none});
     EXPECT_TRUE(tooLong.metadata.exif.empty());
+    // From a JPEG that holds it in several segments it goes into one that does.
+    folder.run("mkdir more");
+    metadata.format = FileFormat::Jpeg;
+    Photograph photograph = readPhotograph(folder / "t.jpg");
+    photograph.metadata = std::make_shared<const Metadata>(metadata);
+    EXPECT_THAT(writePhotograph(photograph, folder / "more/t.jpg"), IsEmpty());
+    EXPECT_EQ(readPhotograph(folder / "more/t.jpg").metadata->exif, metadata.exif);
     EXPECT_THAT(tooLong.lost, ElementsAre(HasSubstr("64 KiB")));
+}
+
+// The parts in any order, beside what the main packet itself says.
+TEST(Containers, JoinXmpOfSeveralSegments) {
+    const auto packet = [](const std::string& tree) {
+        return "<x:xmpmeta xmlns:x='adobe:ns:meta/'>\n<rdf:RDF "
+               "xmlns:rdf='http://www.w3.org/1999/02/22-rdf-syntax-ns#'><rdf:Description rdf:about='' " +
+               tree + "/></rdf:RDF>\n</x:xmpmeta>";
+    };
+    const std::string other =
+        packet("xmlns:x1='http://example.org/' x1:Long='" + std::string(70000, 'l') + "'");
+    std::vector<Chunk> segments = partXmp(asBytes(other)).value().segments;
+    ASSERT_EQ(segments.size(), 2U);
+    std::swap(segments[0], segments[1]);
+    const std::string id(asText(ByteView(segments[0].data).subspan(35, 32)));
+    const std::string main = packet("xmlns:tiff='http://ns.adobe.com/tiff/1.0/' tiff:Make='M' "
+                                    "xmlns:xmpNote='http://ns.adobe.com/xmp/note/' xmpNote:HasExtendedXMP='" +
+                                    id + "'");
+    const Bytes joined = joinXmp(asBytes(main), segments).value();
+    EXPECT_THAT(std::string(asText(joined)),
+                AllOf(HasSubstr("tiff:Make='M'"), HasSubstr("x1:Long='lll"), Not(HasSubstr(id))));
+    EXPECT_FALSE(joinXmp(asBytes(packet("")), segments));
+    segments.pop_back();
+    EXPECT_FALSE(joinXmp(asBytes(main), segments));
 }
 
 TEST(Containers, ReadAndWriteBigTiff) {

@@ -68,7 +68,9 @@ std::vector<std::size_t> changedPlaces(const Bytes& before, const Bytes& after) 
 TEST(ExifBlock, ChangesOnlyTheBytesThatItIsAskedFor) {
     ExifBlock block(smallBlock());
     EXPECT_FALSE(block.isDamaged());
-    EXPECT_TRUE(block.makeUpright());
+    EXPECT_EQ(block.orientation(), 6);
+    block.makeUpright();
+    EXPECT_EQ(block.orientation(), 1);
     block.setDimensions(300, 70000);
     EXPECT_THAT(changedPlaces(smallBlock(), block.bytes()),
                 testing::ElementsAre(18, 48, 49, 60, 61, 62)); // 6 -> 1, 9 -> 300, 7 -> 70000
@@ -116,6 +118,15 @@ TEST(ExifBlock, DropsThumbnailsThatDoNotFitOrCannotBeRead) {
     Bytes huge = smallBlock();
     huge[105] = 0xFF; // 65283 pixels high
     dropped(huge);
+    // Of two none is left.
+    Bytes two = smallBlock();
+    store(two, 94, two.size(), 4, ByteOrder::Little); // the link behind the first
+    addDirectory(two, {{tiff::JpegOffset, tiff::Long, 154}, {tiff::JpegLength, tiff::Long, 15}}, 0);
+    append(two, jpegOf(4, 3, 15));
+    const ThumbnailMaker none = [](int, int, int) { return Bytes(); };
+    ExifBlock both(two);
+    EXPECT_FALSE(both.renewThumbnails(none, false));
+    EXPECT_EQ(number(both.bytes(), 34, 4, ByteOrder::Little), 0U);
     // One that stands where the directory does is not written over.
     Bytes shared = smallBlock();
     shared[78] = 0;
