@@ -16,7 +16,17 @@ function(orvela_install folder file)
     endif()
 endfunction()
 
-install(CODE "set(record \"${PROJECT_BINARY_DIR}/install_folders.txt\")")
+# Beside the manifest, whose paths lack DESTDIR, the build folder keeps the folders that were made, and DESTDIR: the
+# latter when all is installed, as the manifest is.
+install(CODE [[
+    set(records "${CMAKE_CURRENT_LIST_DIR}")
+    set(destdir "$ENV{DESTDIR}")
+    if(NOT destdir STREQUAL "")
+        cmake_path(ABSOLUTE_PATH destdir NORMALIZE)
+    endif()
+]])
+cmake_language(DEFER DIRECTORY "${PROJECT_SOURCE_DIR}" CALL install CODE
+               [[file(WRITE "${records}/install_destdir.txt" "${destdir}")]])
 
 add_custom_target(uninstall COMMAND ${CMAKE_COMMAND} -P ${PROJECT_SOURCE_DIR}/cmake/Uninstall.cmake
                   WORKING_DIRECTORY ${PROJECT_BINARY_DIR} VERBATIM)

@@ -1,7 +1,14 @@
-# Part of an installation: appends to the file `record` those of `folder` and what is around it that are still missing.
+# Part of an installation: puts those of `folder` and what is around it that are still missing, the inner ones first,
+# before what stands in the file `install_folders.txt` of the folder `records`.
 cmake_path(ABSOLUTE_PATH folder BASE_DIRECTORY "${CMAKE_INSTALL_PREFIX}")
-set(folder "$ENV{DESTDIR}${folder}")
+set(folder "${destdir}${folder}")
+set(made "")
 while(NOT EXISTS "${folder}")
-    file(APPEND "${record}" "${folder}\n")
+    string(APPEND made "${folder}\n")
     cmake_path(GET folder PARENT_PATH folder)
 endwhile()
+set(known "")
+if(EXISTS "${records}/install_folders.txt")
+    file(READ "${records}/install_folders.txt" known)
+endif()
+file(WRITE "${records}/install_folders.txt" "${made}${known}")

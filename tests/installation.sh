@@ -5,20 +5,29 @@ cmake=$1 source=$2 build=$3
 scratch=$(mktemp -d)
 export HOME=$scratch XDG_CONFIG_HOME=$scratch/config
 
-# The build folder keeps the record of an installation that its owner made.
-keep() { for file in install_manifest.txt install_folders.txt; do [ ! -e "$1/$file" ] || mv "$1/$file" "$2"; done; }
-keep "$build" "$scratch"
-finish() { rm -f "$build"/install_{manifest,folders}.txt && keep "$scratch" "$build" && rm -r "$scratch"; }
-trap finish EXIT
+trap 'rm -r "$scratch"' EXIT
 
 fail() { echo "FAILED: $*" >&2 && exit 1; }
 expect() { [ "$2" = "$3" ] || fail "$1: \"$2\" instead of \"$3\""; }
 
+for shell in bash zsh fish; do command -v $shell >/dev/null || fail "$shell is missing; packages.txt lists what tests need"; done
+
+# The build folder keeps the record of its owner's installation: what is done here is recorded in a copy of its scripts.
+records=$scratch/records
+(cd "$build" && find . -name cmake_install.cmake -exec cp --parents -t "$(mkdir -p "$records" && echo "$records")" {} +)
+find "$records" -type f -exec sed -i -E "s#\"$build/(.*cmake_install.cmake|\\$\{CMAKE_INSTALL_MANIFEST\})\"#\"$records/\1\"#" {} +
+owned() { stat -c '%n %Y %i' "$build"/install_*.txt 2>/dev/null || :; }
+before=$(owned)
+install_to() { "$cmake" --install "$records" --prefix "$1" >"$scratch/log"; }
+uninstalling=$(ninja -C "$build" -t commands uninstall | tail -n 1)
+[[ $uninstalling == "cd $build && "* ]] || fail "uninstalling goes by \"$uninstalling\""
+uninstall() { sh -c "cd '$records' && ${uninstalling#*&& }" >"$scratch/log" 2>&1; }
+
 prefix=$scratch/prefix
 mkdir -p "$prefix/share/man" && echo mine >"$prefix/share/mine"
 find "$prefix" | sort >"$scratch/before"
-"$cmake" --install "$build" --prefix "$prefix" >"$scratch/log"
-"$cmake" --install "$build" --prefix "$prefix" >"$scratch/log" # once more: as it was
+install_to "$prefix"
+install_to "$prefix" # once more: as it was
 export PATH=$prefix/bin:$PATH
 share=$prefix/share
 
@@ -77,26 +86,81 @@ for values in "$(taken --chroma enhance none.png)" "$(taken --compression enhanc
         tr '\n' ' ' <"$script" | sed 's/\\n/ /g' | grep -q "[^a-z]$values[^a-z]" || fail "$script lacks \"$values\""
     done
 done
-if command -v zsh >/dev/null; then zsh -n "$share/zsh/site-functions/_orvela"; fi
-if command -v fish >/dev/null; then
-    complete() { fish -c 'source $argv[1]; complete -C $argv[2]' "$share/fish/vendor_completions.d/orvela.fish" "$1" | cut -f1 | xargs; }
-    expect "modes in fish" "$(complete 'orvela enhance --mode Portrait')" "Portrait PortraitPro"
-    expect "final touch in fish" "$(complete 'orvela enhance --final-touch AbsContrast=3,AbsB')" "AbsContrast=3,AbsBrightness="
-    expect "options in fish" "$(complete 'orvela enhance --qua')" "--quality"
-fi
+
+# Real shells complete a typed line. complete_in_SHELL LINE: the words it has then, or what is offered.
+zsh -n "$share/zsh/site-functions/_orvela"
+mkdir "$scratch/typing" && cd "$scratch/typing"
+typed() { printf '%s\t\001printf "%%s|" \005 >out' "$1"; } # completes, goes to the start of the line and to its end
+complete_in_bash() {
+    printf '. "%s"\n%s\nexit\n' "$share/bash-completion/completions/orvela" "$(typed "orvela $1")" |
+        TERM=xterm bash --norc -i >"$scratch/log" 2>&1
+    cut -d'|' -f2- out
+}
+complete_in_zsh() {
+    zsh -f -c 'zmodload zsh/zpty && zpty shell zsh -f -i
+        zpty -w shell "fpath=($1 \$fpath); autoload -Uz compinit; compinit -u -D; bindkey -e; PS1=READY; echo LOADED"
+        zpty -r shell output $'\''*\nLOADED*READY*'\''
+        zpty -w -n shell "$2"$'\''\rexit\r'\''
+        zpty -r shell output "*NEVER*" || :' zsh "$share/zsh/site-functions" "$(typed "orvela $1")" >"$scratch/log" 2>&1
+    cut -d'|' -f2- out
+}
+complete_in_fish() { fish -c 'source $argv[1]; complete -C $argv[2]' "$share/fish/vendor_completions.d/orvela.fish" "orvela $1" | cut -f1 | paste -sd'|'; }
+
+orvela enhance --mode Saturation --value 5 --save-preset "$scratch/look.json"
+for name in 'My Look' '$(touch PWNED)'; do orvela presets import "$scratch/look.json" "$name"; done
+orvela presets import --mode Adjustments "$scratch/look.json" Mine
+for shell in bash zsh; do
+    complete=complete_in_$shell
+    expect "blank in $shell" "$($complete 'presets remove My')" "presets|remove|My Look|"
+    expect "blank in a quoted word in $shell" "$($complete 'enhance --preset "My L')" "enhance|--preset|My Look|"
+    expect "shell code in $shell" "$($complete 'presets export \$')" 'presets|export|$(touch PWNED)|'
+    expect "quoted shell code in $shell" "$($complete 'presets export "\$')" 'presets|export|$(touch PWNED)|'
+    expect "mode behind = in $shell" "$($complete 'enhance --mode=PortraitP')" "enhance|--mode=PortraitPro|"
+    expect "preset of a mode in $shell" "$($complete 'presets remove --mode Adjustments M')" "presets|remove|--mode|Adjustments|Mine|"
+    expect "preset of a mode for enhance in $shell" "$($complete 'enhance --mode=Adjustments --preset=M')" \
+        "enhance|--mode=Adjustments|--preset=Mine|"
+    expect "preset for a mode without in $shell" "$($complete 'enhance --mode Macro --preset M')" "enhance|--mode|Macro|--preset|My Look|"
+    expect "final touch has presets in $shell" "$($complete 'presets list --mode FinalT')" "presets|list|--mode|FinalTouch|"
+    expect "final touch is no mode in $shell" "$($complete 'enhance --mode FinalT')" "enhance|--mode|FinalT|"
+    rm out
+done
+expect "modes in fish" "$(complete_in_fish 'enhance --mode Portrait')" "Portrait|PortraitPro"
+expect "mode behind = in fish" "$(complete_in_fish 'enhance --mode=PortraitP')" "--mode=PortraitPro"
+expect "final touch in fish" "$(complete_in_fish 'enhance --final-touch AbsContrast=3,AbsB')" "AbsContrast=3,AbsBrightness="
+expect "options in fish" "$(complete_in_fish 'enhance --qua')" "--quality"
+expect "presets in fish" "$(complete_in_fish 'presets remove ')" '$(touch PWNED)|My Look'
+expect "preset of a mode in fish" "$(complete_in_fish 'presets remove --mode Adjustments ')" "Mine"
+expect "preset of a mode for enhance in fish" "$(complete_in_fish 'enhance --mode=Adjustments --preset=')" "--preset=Mine"
+expect "preset for a mode without in fish" "$(complete_in_fish 'enhance --mode Macro --preset ')" '$(touch PWNED)|My Look'
+expect "final touch has presets in fish" "$(complete_in_fish 'presets list --mode FinalT')" "FinalTouch"
+expect "final touch is no mode in fish" "$(complete_in_fish 'enhance --mode FinalT')" ""
+expect "what completing ran" "$(ls)" ""
 cd /
 
 # Removing leaves what was there, also what somebody else put into a folder of it meanwhile.
 echo mine >"$share/orvela/samples/mine"
-"$cmake" --build "$build" --target uninstall >"$scratch/log"
+uninstall || fail "$(cat "$scratch/log")"
 expect "what is left" "$(find "$share/orvela" -type f)" "$share/orvela/samples/mine"
 rm -r "$share/orvela"
 find "$prefix" | sort | diff "$scratch/before" - || fail "the prefix before (<) and after (>)"
-"$cmake" --build "$build" --target uninstall >"$scratch/log" 2>&1 && fail "nothing was there to remove"
+uninstall && fail "nothing was there to remove"
 grep -q "Nothing was installed" "$scratch/log" || fail "$(cat "$scratch/log")"
 
-# A package is made below DESTDIR, whatever the prefix.
-DESTDIR=$scratch/package "$cmake" --install "$build" --prefix /usr >"$scratch/log"
-test -x "$scratch/package/usr/bin/orvela" || fail "DESTDIR does not count"
-DESTDIR=$scratch/package "$cmake" --build "$build" --target uninstall >"$scratch/log"
-test ! -e "$scratch/package" || fail "$(find "$scratch/package")"
+# Brackets in a path and what looks like a refusal of CMake are names like others.
+for odd in "$scratch/[odd" "$scratch/[a-c]" "$scratch/a-NOTFOUND"; do
+    install_to "$odd"
+    echo mine >"$odd/share/orvela/samples/mine-NOTFOUND"
+    uninstall || fail "$(cat "$scratch/log")"
+    expect "what is left" "$(find "$odd" -type f)" "$odd/share/orvela/samples/mine-NOTFOUND"
+done
+
+# A package is made below DESTDIR, whatever the prefix; removing it needs no DESTDIR and leaves the prefix itself alone.
+mkdir -p "$scratch/system/bin" && echo mine >"$scratch/system/bin/orvela"
+for package in "$scratch/package" package; do
+    (cd "$scratch" && DESTDIR=$package install_to "$scratch/system")
+    test -x "$scratch/package$scratch/system/bin/orvela" || fail "DESTDIR does not count"
+    uninstall || fail "$(cat "$scratch/log")"
+    test ! -e "$scratch/package" || fail "$(find "$scratch/package")"
+    expect "the system's file" "$(cat "$scratch/system/bin/orvela")" "mine"
+done
+expect "the owner's record" "$(owned)" "$before"

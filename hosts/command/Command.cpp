@@ -32,27 +32,37 @@ void addEnhance(CLI::App& program, Action& action, StopSignals& signals) {
     const auto options = std::make_shared<EnhanceOptions>();
     options->declare(*command);
     command->callback([&action, &signals, options] {
-        action = [&signals, options] { return enhancePhotographs(*options, signals); };
+        action = [&signals, options] {
+            PresetFiles::checkStore();
+            return enhancePhotographs(*options, signals);
+        };
     });
 }
 
 void addModes(CLI::App& program, Action& action) {
     CLI::App* command = program.add_subcommand("modes", "List the modes and their sliders");
     const auto asJson = std::make_shared<bool>(false);
-    command->add_flag("--json", *asJson, "as JSON");
+    CLI::Option* json = command->add_flag("--json", *asJson, "as JSON");
     const auto kind = std::make_shared<std::string>();
     command->add_option("--names", *kind, "names only, one a line: modes, settings or final-touch")
         ->option_text("KIND")
-        ->check(CLI::IsMember(nameKinds()));
+        ->check(CLI::IsMember(nameKinds()))
+        ->excludes(json);
     command->callback([&action, asJson, kind] {
         action = [asJson, kind] { return kind->empty() ? listModes(*asJson) : listNames(*kind); };
     });
 }
 
-void addPresets(CLI::App& program, Action& action) {
+void addPresets(CLI::App& program, Action& action, StopSignals& signals) {
     CLI::App* command = program.add_subcommand("presets", "List, export, import and remove stored presets");
     const auto options = std::make_shared<PresetsOptions>();
-    options->declare(*command, [&action, options](Action chosen) { action = std::move(chosen); });
+    options->declare(*command, [&action, &signals, options](Action chosen) {
+        action = [&signals, chosen = std::move(chosen)] {
+            const StopAction leave(signals, [&signals] { signals.leave(); });
+            PresetFiles::checkStore();
+            return chosen();
+        };
+    });
 }
 
 // No option and no argument means anything when it is empty; a script's variable often is.
@@ -70,7 +80,6 @@ ExitStatus refuse(ExitStatus status, const std::string& text) {
 
 ExitStatus perform(const Action& action) {
     try {
-        PresetFiles::checkStore();
         return action();
     } catch (const UsageError& error) {
         return refuse(ExitStatus::WrongUsage, error.what());
@@ -100,7 +109,7 @@ int runProgram(int argc, char** argv) {
     Action action;
     addEnhance(program, action, signals);
     addModes(program, action);
-    addPresets(program, action);
+    addPresets(program, action, signals);
     refuseEmptyValues(program);
     try {
         program.parse(argc, argv);

@@ -8,6 +8,7 @@
 #include "command/PresetFiles.h"
 #include "command/ProgressLine.h"
 #include "command/Sources.h"
+#include "files/FileFormat.h"
 #include "files/Memory.h"
 #include "files/PhotographReader.h"
 #include "files/PhotographWriter.h"
@@ -31,6 +32,8 @@ constexpr std::uint64_t kSampleCopies = 2;
 constexpr std::uint64_t kChannelBytes = 2;
 constexpr std::uint64_t kPlanes = 3;
 constexpr std::uint64_t kPlaneBytes = 3;
+// The process of a HEIF's codec holds the picture several times.
+constexpr std::uint64_t kHeifCodecBytes = 10;
 
 int threadsOf(const EnhanceOptions& options) {
     return options.threads > 0 ? options.threads : RowScheduler::defaultThreads();
@@ -56,7 +59,7 @@ private:
     ExitStatus runGuarded(const Job& job);
     void runJob(const Job& job);
     void makeFolder();
-    ReadOptions reading() const;
+    ReadOptions reading(const Job& job) const;
     bool runPage(const Job& job, PhotographReader& reader, PhotographWriter& writer);
     Photograph read(PhotographReader& reader);
     std::optional<TraceOptions> traceOf(const Job& job, const Photograph& photograph) const;
@@ -115,9 +118,10 @@ void Batch::runJob(const Job& job) {
     makeFolder();
     WriteOptions writing = mOptions.writing;
     writing.stop = &mSignals.stopRequested();
+    removeLeftovers(job.target);
     checkTargetPath(job.target, job.source, writing.overwrite);
     mProgress.begin(QString::fromStdString(Messages::shown(job.source.filename().string())));
-    PhotographReader reader(job.source, reading());
+    PhotographReader reader(job.source, reading(job));
     PhotographWriter writer(job.target, writing);
     for (int page = 0; page < reader.pages(); ++page) {
         mProgress.page(page, reader.pages());
@@ -160,12 +164,14 @@ void Batch::makeFolder() {
         fs::create_directories(*mOptions.targets.folder, error);
 }
 
-ReadOptions Batch::reading() const {
+ReadOptions Batch::reading(const Job& job) const {
     // The final touch keeps one more plane, the trace the last picture and the one to compare it with.
     const std::uint64_t planes = kPlanes + (mSettings.runsFinalTouch ? 1 : 0) + (mOptions.trace ? 2 : 0);
     ReadOptions reading = mOptions.reading;
     reading.limits.sampleCopies = kSampleCopies;
     reading.limits.workBytes = kChannelBytes + planes * kPlaneBytes;
+    if (formatOfExtension(job.target) == FileFormat::Heif)
+        reading.limits.workBytes += kHeifCodecBytes;
     reading.limits.mappedBytes = mMapped;
     return reading;
 }
@@ -208,13 +214,6 @@ void savePreset(const EnhanceOptions& options, const RunSettings& settings) {
         return;
     static_cast<void>(PresetFiles::toWriteInto(*options.savePreset, options.writing.overwrite));
     PresetFiles::write(settings.preset, *options.savePreset, options.writing.overwrite);
-}
-
-// A pipe is opened once somebody reads it, for which a signal does not wait.
-void openLog(std::optional<LogFile>& log, const EnhanceOptions& options, StopSignals& signals) {
-    const StopAction leave(signals, [&signals] { signals.leave(); });
-    if (options.log)
-        log.emplace(*options.log, options.writing.overwrite);
 }
 
 ExitStatus report(const Sources& sources) {
@@ -274,8 +273,11 @@ ExitStatus enhancePhotographs(const EnhanceOptions& options, StopSignals& signal
     std::signal(SIGPIPE, SIG_IGN); // nobody reads the log any more: no reason to leave the photographs
     std::optional<LogFile> log;
     try {
+        // A pipe is opened once somebody reads it, for which a signal does not wait.
+        const StopAction leave(signals, [&signals] { signals.leave(); });
         savePreset(options, settings);
-        openLog(log, options, signals);
+        if (options.log)
+            log.emplace(*options.log, options.writing.overwrite, signals.stopRequested());
     } catch (const std::runtime_error& error) { // of a preset or of a target
         return targetTrouble(error.what());
     }

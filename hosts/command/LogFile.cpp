@@ -8,10 +8,10 @@ namespace {
 
 namespace fs = std::filesystem;
 
-const fs::path& checked(const fs::path& path, bool overwrite) {
+fs::path checked(const fs::path& path, bool overwrite) {
     if (!isStream(path))
         checkTargetPath(path, {}, overwrite);
-    return path;
+    return linkedFile(path);
 }
 
 } // namespace
@@ -25,7 +25,8 @@ public:
         if (mLog.mFailure)
             return;
         try {
-            mLog.mFile.write((line + '\n').toStdString());
+            mLog.mFile.write((line + '\n').toStdString(), &mLog.mStop);
+        } catch (const StoppedError&) { // nobody reads the pipe: the rest is left out
         } catch (...) {
             mLog.mFailure = std::current_exception();
         }
@@ -35,8 +36,8 @@ private:
     LogFile& mLog;
 };
 
-LogFile::LogFile(const fs::path& path, bool overwrite)
-    : mFile(checked(path, overwrite)), mOverwrite(overwrite) {
+LogFile::LogFile(const fs::path& path, bool overwrite, const std::atomic<bool>& stop)
+    : mFile(checked(path, overwrite)), mOverwrite(overwrite), mStop(stop) {
     Log::setThreshold(LogLevel::Debug);
     Log::install(std::make_unique<Lines>(*this));
 }

@@ -12,8 +12,9 @@ namespace orvela {
 class LogFile {
 public:
     /// Makes it the log of the process, everything down to the debug level.
+    /// @param stop  when set, lines that a pipe does not take at once are left out
     /// @throws TargetError when the file cannot be written or must not be overwritten
-    LogFile(const std::filesystem::path& path, bool overwrite);
+    LogFile(const std::filesystem::path& path, bool overwrite, const std::atomic<bool>& stop);
     ~LogFile();
     LogFile(const LogFile&) = delete;
     LogFile& operator=(const LogFile&) = delete;
@@ -27,6 +28,7 @@ private:
 
     TargetFile mFile;
     bool mOverwrite;
+    const std::atomic<bool>& mStop;
     std::exception_ptr mFailure; ///< of the first line that could not be written
 };
 

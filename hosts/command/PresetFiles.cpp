@@ -41,7 +41,7 @@ PresetFile toWriteInto(const std::string& path, bool overwrite) {
 }
 
 void write(const PresetFile& preset, const std::string& path, bool overwrite) {
-    TargetFile file(path, path);
+    TargetFile file(linkedFile(path), path);
     file.write(preset.text().toStdString());
     file.commit(overwrite);
 }

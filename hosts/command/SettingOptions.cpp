@@ -140,7 +140,9 @@ PresetFile presetNamed(const std::string& given, EGUIMode mode, std::vector<std:
     const QString name = QString::fromStdString(given);
     const std::optional<CSliderParams> stored = PresetFiles::stored(mode, name);
     std::error_code none;
-    const bool isThere = std::filesystem::exists(given, none);
+    const std::filesystem::file_status status = std::filesystem::status(given, none);
+    // What cannot be looked at has a message of its own.
+    const bool isThere = status.type() != std::filesystem::file_type::not_found;
     if (isThere && !(stored && std::filesystem::is_directory(given, none))) {
         if (stored)
             notes.push_back(given + ": the file is read, not the stored preset of that name");

@@ -7,8 +7,18 @@ _orvela_names() {
     compadd "${@:2}" -a names
 }
 
-_orvela_modes() { _orvela_names modes; compadd FinalTouch }
-_orvela_presets() { local -a names=(${(f)"$(orvela presets list 2>/dev/null)"}); compadd -a names }
+_orvela_modes() { _orvela_names modes; [[ $words[2] != presets ]] || compadd FinalTouch }
+
+# Those of the line's mode; `enhance` takes those of Advanced where the mode has none.
+_orvela_presets() {
+    local mode=${${words[(r)--mode=*]}#--mode=}
+    local -i at=${words[(i)--mode]}
+    (( at < $#words )) && mode=$words[at+1]
+    local -a names=(${(f)"$(orvela presets list --mode ${mode:-Advanced} 2>/dev/null ||
+        { [[ $words[2] == enhance ]] && orvela presets list 2>/dev/null })"})
+    compadd -a names
+}
+
 _orvela_presets_or_files() { _orvela_presets; _files }
 _orvela_assignments() { compset -P '*,'; _orvela_names $1 -S = }
 
@@ -20,9 +30,10 @@ _orvela_options() {
 }
 
 _orvela() {
-    local depth=1
+    local depth=1 option=$words[CURRENT-1]
     [[ $words[2] == presets ]] && depth=2
-    case $words[CURRENT-1] in
+    [[ $PREFIX == --*=* ]] && option=${PREFIX%%=*} && compset -P 1 '*='
+    case $option in
         --mode) _orvela_modes; return ;;
         --set) _orvela_assignments settings; return ;;
         --final-touch) _orvela_assignments final-touch; return ;;
@@ -38,8 +49,10 @@ _orvela() {
         _orvela_options $depth
     elif [[ $words[2] == presets ]] && (( CURRENT == 3 )); then
         compadd list export import remove
-    elif [[ "$words[2] $words[3]" == presets\ (export|remove) ]] && (( CURRENT == 4 )); then
+    elif [[ "$words[2] $words[3]" == "presets remove" ]]; then
         _orvela_presets
+    elif [[ "$words[2] $words[3]" == "presets export" ]]; then
+        _orvela_presets_or_files
     elif [[ $words[2] != modes ]]; then
         _files
     fi

@@ -1,6 +1,7 @@
 #include "files/TargetFile.h"
 
 #include <fcntl.h>
+#include <poll.h>
 #include <sys/file.h>
 #include <sys/stat.h>
 #include <unistd.h>
@@ -8,6 +9,7 @@
 #include <algorithm>
 #include <array>
 #include <cerrno>
+#include <climits>
 #include <cstdio>
 #include <cstring>
 #include <optional>
@@ -62,11 +64,15 @@ fs::path folderOf(const fs::path& target) {
 // ".NAME.orvela-": what the temporaries of a target begin with. Two long names may share it, which does no
 // harm: it only decides which leftovers are looked at.
 std::string temporaryStart(const fs::path& target) {
-    constexpr std::size_t kTellingPart = 100;
-    return '.' + target.filename().string().substr(0, kTellingPart) + ".orvela-";
+    std::size_t tellingPart = 100;
+    const std::string name = target.filename().string();
+    while (tellingPart < name.size() && static_cast<std::uint8_t>(name[tellingPart]) >> 6 == 2)
+        --tellingPart; // not within a character
+    return '.' + name.substr(0, tellingPart) + ".orvela-";
 }
 
 constexpr std::string_view kTemporaryEnd = ".part";
+constexpr std::size_t kNumberDigits = 8;
 
 // A name that neither another run nor another photograph of this one takes; creation is exclusive anyway.
 fs::path temporaryFor(const fs::path& target) {
@@ -93,16 +99,12 @@ void removeIfLeft(const fs::path& temporary) {
     ::close(handle);
 }
 
-// What killed programs left of the target. A folder that cannot be listed keeps it.
-void removeLeftovers(const fs::path& target) {
-    const std::string start = temporaryStart(target);
-    std::error_code error;
-    for (fs::directory_iterator entry(folderOf(target), error), end; !error && entry != end;
-         entry.increment(error)) {
-        const std::string name = entry->path().filename().string();
-        if (name.starts_with(start) && name.ends_with(kTemporaryEnd))
-            removeIfLeft(entry->path());
-    }
+bool isTemporary(std::string_view name, std::string_view start) {
+    if (!name.starts_with(start) || !name.ends_with(kTemporaryEnd) ||
+        name.size() != start.size() + kNumberDigits + kTemporaryEnd.size())
+        return false;
+    const std::string_view number = name.substr(start.size(), kNumberDigits);
+    return number.find_first_not_of("0123456789abcdef") == std::string_view::npos;
 }
 
 // A new temporary, locked; none when another program took it for left over before the lock was there.
@@ -136,6 +138,17 @@ int openStream(const fs::path& target) {
     return ::open(target.c_str(), O_WRONLY | O_NOCTTY | O_CLOEXEC);
 }
 
+// Waits until a stream takes PIPE_BUF bytes, or fails; false when it was stopped before.
+bool isReady(int handle, const std::atomic<bool>* stop) {
+    constexpr int patience = 50; // milliseconds between looks at the stop
+    pollfd asked = {handle, POLLOUT, 0};
+    const auto stopped = [stop] { return stop != nullptr && *stop; };
+    while (::poll(&asked, 1, stopped() ? 0 : patience) == 0)
+        if (stopped())
+            return false;
+    return true;
+}
+
 } // namespace
 
 void checkTargetPath(const fs::path& target, const fs::path& source, bool overwrite) {
@@ -163,6 +176,22 @@ void checkTargetPath(const fs::path& target, const fs::path& source, bool overwr
         refuseSystem(target, ENOTDIR);
     if (::access(folder.c_str(), W_OK | X_OK) != 0)
         refuseSystem(target, errno);
+}
+
+fs::path linkedFile(const fs::path& name) {
+    std::error_code error;
+    const fs::path real = fs::is_symlink(name, error) ? fs::canonical(name, error) : name;
+    return error ? name : real;
+}
+
+// A folder that cannot be listed keeps them.
+void removeLeftovers(const fs::path& target) {
+    const std::string start = temporaryStart(target);
+    std::error_code error;
+    for (fs::directory_iterator entry(folderOf(target), error), end; !error && entry != end;
+         entry.increment(error))
+        if (isTemporary(entry->path().filename().string(), start))
+            removeIfLeft(entry->path());
 }
 
 bool isStream(const fs::path& target) {
@@ -203,9 +232,10 @@ TargetFile::~TargetFile() {
 }
 
 void TargetFile::write(ByteView bytes, const std::atomic<bool>* stop) {
-    constexpr std::size_t chunk = 1 << 20;
+    const std::size_t chunk = mTemporary.empty() ? PIPE_BUF : 1 << 20;
     while (!bytes.empty()) {
-        if (stop != nullptr && *stop)
+        const bool ready = !mTemporary.empty() || isReady(mHandle, stop);
+        if (stop != nullptr && (*stop || !ready))
             throw StoppedError(mTarget.string() + ": stopped; nothing was written");
         const ssize_t written = ::write(mHandle, bytes.data(), std::min(chunk, bytes.size()));
         if (written < 0 && errno != EINTR)
@@ -218,8 +248,8 @@ void TargetFile::write(ByteView bytes, const std::atomic<bool>* stop) {
         throw StoppedError(mTarget.string() + ": stopped; nothing was written");
 }
 
-void TargetFile::write(std::string_view text) {
-    write(ByteView(reinterpret_cast<const std::uint8_t*>(text.data()), text.size()));
+void TargetFile::write(std::string_view text, const std::atomic<bool>* stop) {
+    write(ByteView(reinterpret_cast<const std::uint8_t*>(text.data()), text.size()), stop);
 }
 
 bool TargetFile::takeTimes(const fs::path& source) {

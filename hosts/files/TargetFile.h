@@ -18,6 +18,12 @@ void checkTargetPath(const std::filesystem::path& target, const std::filesystem:
 /// and this program's standard output and error under any name.
 bool isStream(const std::filesystem::path& target);
 
+/// Where a name leads that is a link to a file; else the name itself.
+std::filesystem::path linkedFile(const std::filesystem::path& name);
+
+/// Removes the temporaries that killed programs left of the target, not those of living ones.
+void removeLeftovers(const std::filesystem::path& target);
+
 /// A file that grows under a temporary name in the target's folder and takes the target's name when it is
 /// complete and on the disk. The temporary is removed when the object dies before that; those that killed
 /// programs left of the same target are removed when it is made. A stream is written to as it stands.
@@ -30,10 +36,10 @@ public:
     TargetFile(const TargetFile&) = delete;
     TargetFile& operator=(const TargetFile&) = delete;
 
-    /// Appends bytes; `stop`, when given, is looked at after each MiB.
+    /// Appends bytes; `stop`, when given, is looked at after each MiB, and while a stream takes nothing.
     /// @throws TargetError, StoppedError
     void write(ByteView bytes, const std::atomic<bool>* stop = nullptr);
-    void write(std::string_view text);
+    void write(std::string_view text, const std::atomic<bool>* stop = nullptr);
 
     /// Gives it the times of the last access and change of `source`, when all is written.
     /// @return whether that could be done

@@ -16,7 +16,12 @@ QString& application() {
 } // namespace
 
 QSettings openSettings() {
+#ifdef Q_OS_WIN
     return QSettings(kOrganization, application());
+#else
+    // By its file: the store alone, not what the system and the organisation have beside it.
+    return QSettings(settingsPath(), QSettings::NativeFormat);
+#endif
 }
 
 QString settingsPath() {

@@ -124,7 +124,7 @@ TEST(PhotographWriter, StopsWhenAskedAndLeavesNothing) {
     WriteOptions options;
     options.stop = &stop;
     EXPECT_THROW(writePhotograph(plain(ColorModel::Rgb), folder / "a.png", options), StoppedError);
-    TargetFile(folder / "b.png").write({}, nullptr); // given up before the commit
+    TargetFile(folder / "b.png").write(ByteView()); // given up before the commit
     EXPECT_EQ(folder.count(), 0U);
 }
 
