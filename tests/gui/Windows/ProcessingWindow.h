@@ -34,6 +34,8 @@ public:
         return window.findChild<Widget*>(QLatin1String(name));
     }
 
+    CThreadedCore* core() { return window.findChildren<CThreadedCore*>().last(); }
+
     void click(const char* button) { QTest::mouseClick(find(button), Qt::LeftButton); }
 
     /// What the engine makes of the picture by itself.
