@@ -118,7 +118,6 @@ void Batch::runJob(const Job& job) {
     makeFolder();
     WriteOptions writing = mOptions.writing;
     writing.stop = &mSignals.stopRequested();
-    removeLeftovers(job.target);
     checkTargetPath(job.target, job.source, writing.overwrite);
     mProgress.begin(QString::fromStdString(Messages::shown(job.source.filename().string())));
     PhotographReader reader(job.source, reading(job));

@@ -25,7 +25,7 @@ public:
         if (mLog.mFailure)
             return;
         try {
-            mLog.mFile.write((line + '\n').toStdString(), &mLog.mStop);
+            mLog.mFile.write((line + '\n').toStdString(), mLog.mStop);
         } catch (const StoppedError&) { // nobody reads the pipe: the rest is left out
         } catch (...) {
             mLog.mFailure = std::current_exception();
@@ -37,7 +37,7 @@ private:
 };
 
 LogFile::LogFile(const fs::path& path, bool overwrite, const std::atomic<bool>& stop)
-    : mFile(checked(path, overwrite)), mOverwrite(overwrite), mStop(stop) {
+    : mFile(checked(path, overwrite)), mOverwrite(overwrite), mStop(isStream(path) ? &stop : nullptr) {
     Log::setThreshold(LogLevel::Debug);
     Log::install(std::make_unique<Lines>(*this));
 }

@@ -12,7 +12,7 @@ namespace orvela {
 class LogFile {
 public:
     /// Makes it the log of the process, everything down to the debug level.
-    /// @param stop  when set, lines that a pipe does not take at once are left out
+    /// @param stop  when set, a stream, which nobody may read, gets no more lines; a file still does
     /// @throws TargetError when the file cannot be written or must not be overwritten
     LogFile(const std::filesystem::path& path, bool overwrite, const std::atomic<bool>& stop);
     ~LogFile();
@@ -28,8 +28,8 @@ private:
 
     TargetFile mFile;
     bool mOverwrite;
-    const std::atomic<bool>& mStop;
-    std::exception_ptr mFailure; ///< of the first line that could not be written
+    const std::atomic<bool>* mStop; ///< for a stream
+    std::exception_ptr mFailure;    ///< of the first line that could not be written
 };
 
 } // namespace orvela

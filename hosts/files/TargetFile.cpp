@@ -167,8 +167,10 @@ void checkTargetPath(const fs::path& target, const fs::path& source, bool overwr
     } else if (errno == ENAMETOOLONG) {
         refuseSystem(target, errno);
     }
-    if (!overwrite && ::lstat(target.c_str(), &there) == 0)
+    if (!overwrite && ::lstat(target.c_str(), &there) == 0) {
+        removeLeftovers(target); // nothing else will look for them
         refuseExisting(target);
+    }
     const fs::path folder = folderOf(target);
     if (::stat(folder.c_str(), &there) != 0)
         refuseSystem(target, errno);
