@@ -57,7 +57,9 @@ void takeJfif(ByteView data, Metadata& metadata) {
                           data[7] == 1   ? DensityUnit::Inch
                           : data[7] == 2 ? DensityUnit::Centimetre
                                          : DensityUnit::None};
-    if (density.x.numerator > 0 && density.y.numerator > 0)
+    // Square pixels without a unit are what encoders write that know no density.
+    const bool says = density.unit != DensityUnit::None || density.x != density.y;
+    if (says && density.x.numerator > 0 && density.y.numerator > 0)
         metadata.density = density;
     if (data[12] > 0 && data[13] > 0)
         metadata.unheld.emplace_back("the JFIF thumbnail");

@@ -182,7 +182,9 @@ void takeDensity(ByteView data, Metadata& metadata) {
     const auto edge = [&](std::size_t at) {
         return Rational{static_cast<std::uint32_t>(number(data, at, 4, ByteOrder::Big)), 1};
     };
-    metadata.density = {edge(0), edge(4), data[8] == 1 ? DensityUnit::Metre : DensityUnit::None};
+    const Density density{edge(0), edge(4), data[8] == 1 ? DensityUnit::Metre : DensityUnit::None};
+    if (density.x.numerator > 0 && density.y.numerator > 0)
+        metadata.density = density;
 }
 
 void takeColors(ByteView data, Metadata& metadata) {

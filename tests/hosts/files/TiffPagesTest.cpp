@@ -381,6 +381,40 @@ TEST(TiffPages, OfCameraRawFilesAreRefused) {
     }
 }
 
+// The first strip stands where one maker's raw files have their mark.
+TEST(TiffPages, OfOneGreyAreNoCameraRawFile) {
+    const TestFolder folder;
+    folder.run("convert -size 16x16 'xc:rgb(73,73,73)' -type TrueColor -depth 8 -compress none s.tif && "
+               "head -c 12 s.tif | tail -c 4 | grep -q IIII");
+    EXPECT_EQ(readPhotograph(folder / "s.tif").width, 16);
+}
+
+TEST(TiffPages, ThatAreAMaskStandForNoPicture) {
+    const TestFolder folder;
+    writeTiff(folder / "m.tif", "wl", {kPages.back()});
+    writeTiff(folder / "two.tif", "wl", {kPages.back(), kPages.front()});
+    for (const auto& [source, target] :
+         {std::pair("m.tif", "t.tif"), {"m.tif", "t.jpg"}, {"two.tif", "t.png"}}) {
+        PhotographReader reader(folder / source);
+        const Photograph page = reader.next();
+        EXPECT_THROW(checkTarget(page, folder / target, {}), PhotographError) << source << target;
+    }
+    EXPECT_THAT(rewrite(folder / "two.tif", folder / "t.tif"), IsEmpty());
+}
+
+TEST(TiffPages, OfSeparatePlanesKeepTheirColoursAsJpeg) {
+    const TestFolder folder;
+    folder.run("convert -size 32x32 'xc:rgb(220,60,20)' -depth 8 -interlace plane -compress none s.tif");
+    WriteOptions options;
+    options.compression = "jpeg";
+    writePhotograph(readPhotograph(folder / "s.tif"), folder / "t.tif", options);
+    std::uint32_t pixel[32 * 32] = {};
+    ASSERT_EQ(TIFFReadRGBAImage(openTiff(folder / "t.tif", "r").get(), 32, 32, pixel, 0), 1);
+    EXPECT_NEAR(TIFFGetR(pixel[500]), 220, 3);
+    EXPECT_NEAR(TIFFGetG(pixel[500]), 60, 3);
+    EXPECT_NEAR(TIFFGetB(pixel[500]), 20, 3);
+}
+
 TEST(TiffPages, ThatAreDamagedAreNamed) {
     const TestFolder folder;
     writeTiff(folder / "s.tif", "wl", {kPages[0], kPages[1], kPages[3]});

@@ -56,7 +56,8 @@ TEST(Containers, KeepTheirOwnDensityWhateverExifSays) {
                "cp s.jpg e.jpg && exiftool -q -overwrite_original -Make=M -IFD0:XResolution=72 "
                "-IFD0:YResolution=72 e.jpg && vips copy s.jpg n.jpg[strip] && "
                "exiftool -q -overwrite_original -JFIF:ResolutionUnit=None -JFIF:XResolution=1 "
-               "-JFIF:YResolution=1 n.jpg");
+               "-JFIF:YResolution=1 n.jpg && cp n.jpg h.jpg && exiftool -q -overwrite_original "
+               "-IFD0:ResolutionUnit=inches -IFD0:XResolution=240 -IFD0:YResolution=240 h.jpg");
     const struct {
         const char* source;
         const char* target;
@@ -76,6 +77,8 @@ TEST(Containers, KeepTheirOwnDensityWhateverExifSays) {
         {"s.tif", "t.jpg", "JFIF:ResolutionUnit -JFIF:XResolution", "2 120"},
         {"s.tif", "t.tif", "IFD0:ResolutionUnit -IFD0:XResolution", "3 120"},
         {"n.jpg", "t.jpg", "JFIF:ResolutionUnit -JFIF:XResolution", "0 1"},
+        {"h.jpg", "t.jpg", "IFD0:ResolutionUnit -IFD0:XResolution", "2 240"}, // square pixels say no density
+        {"h.jpg", "t.tif", "IFD0:ResolutionUnit -IFD0:XResolution", "2 240"},
     };
     for (const auto& c : cases) {
         EXPECT_THAT(convert(folder, c.source, c.target), IsEmpty()) << c.source << ' ' << c.target;
@@ -85,6 +88,7 @@ TEST(Containers, KeepTheirOwnDensityWhateverExifSays) {
         folder.run(std::string("rm ") + c.target);
     }
     EXPECT_NEAR(readPhotograph(folder / "e.jpg").xResolution, 300 / 25.4, 1e-9);
+    EXPECT_NEAR(readPhotograph(folder / "h.jpg").xResolution, 240 / 25.4, 1e-9);
     // Without a unit it is the shape of the pixels, for which not every format has a place.
     folder.run("exiftool -q -overwrite_original -JFIF:YResolution=2 n.jpg");
     EXPECT_THAT(convert(folder, "n.jpg", "t.png"), IsEmpty());
