@@ -103,7 +103,7 @@ std::optional<Density> densityOf(const TiffView& view, const TagDirectory& direc
         return {part(0), part(4)};
     };
     Density density{rational(tiff::XResolution), rational(tiff::YResolution)};
-    if (density.x.value() <= 0 || density.y.value() <= 0)
+    if (!density.isMeant())
         return std::nullopt;
     const TagEntry* entry = directory.find(tiff::ResolutionUnit);
     const std::uint64_t unit = entry == nullptr || entry->value.empty() ? 2 : view.value(*entry);

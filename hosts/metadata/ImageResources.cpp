@@ -120,7 +120,8 @@ std::optional<Density> resourceDensity(ByteView list) {
         const auto fixed = static_cast<std::uint32_t>(number(found->data, at, 4, ByteOrder::Big));
         return fixed % 65536 == 0 ? Rational{fixed / 65536, 1} : Rational{fixed, 65536};
     };
-    return Density{value(0), value(8), DensityUnit::Inch};
+    const Density density{value(0), value(8), DensityUnit::Inch};
+    return density.isMeant() ? std::optional(density) : std::nullopt;
 }
 
 bool renewResourceThumbnail(Bytes& list, const ThumbnailMaker& make) {

@@ -59,7 +59,7 @@ void takeJfif(ByteView data, Metadata& metadata) {
                                          : DensityUnit::None};
     // Square pixels without a unit are what encoders write that know no density.
     const bool says = density.unit != DensityUnit::None || density.x != density.y;
-    if (says && density.x.numerator > 0 && density.y.numerator > 0)
+    if (says && density.isMeant())
         metadata.density = density;
     if (data[12] > 0 && data[13] > 0)
         metadata.unheld.emplace_back("the JFIF thumbnail");

@@ -183,7 +183,7 @@ void takeDensity(ByteView data, Metadata& metadata) {
         return Rational{static_cast<std::uint32_t>(number(data, at, 4, ByteOrder::Big)), 1};
     };
     const Density density{edge(0), edge(4), data[8] == 1 ? DensityUnit::Metre : DensityUnit::None};
-    if (density.x.numerator > 0 && density.y.numerator > 0)
+    if (density.isMeant())
         metadata.density = density;
 }
 

@@ -6,6 +6,8 @@
 #include <sys/wait.h>
 
 using namespace orvela;
+using testing::ElementsAre;
+using testing::HasSubstr;
 
 namespace {
 
@@ -51,12 +53,16 @@ TEST(PhotographReader, NamesMissingPermission) {
 TEST(PhotographReader, ReadsBitmapsAsGreyAndTheFirstPageOfSeveral) {
     const TestFolder folder;
     folder.run("convert -size 9x2 xc:white -fill black -draw 'point 8,1' -monochrome -compress None m.png && "
-               "convert m.png -compress Group4 m.tif && convert m.png -compress None m.psd && "
+               "convert m.png -compress Group4 m.tif && "
+               "convert m.png -negate -depth 1 GRAY:rows && python3 -c \"open('m.psd', 'wb').write("
+               "b'8BPS\\0\\1' + bytes(7) + b'\\1' + bytes([0, 0, 0, 2, 0, 0, 0, 9, 0, 1]) + bytes(16) + "
+               "open('rows', 'rb').read())\" && "
                "convert $S/coffee.png -resize 5x3! $S/rocket.jpg pages.tif");
     for (const char* name : {"m.png", "m.tif", "m.psd"}) {
         const Photograph read = readPhotograph(folder / name);
         std::vector<std::uint8_t> expected(18, 255);
         expected[17] = 0;
+        EXPECT_THAT(read.notes, ElementsAre(HasSubstr("expanded"))) << name; // they have one bit
         EXPECT_EQ(read.model, ColorModel::Grey) << name;
         EXPECT_EQ(read.samples, expected) << name;
     }

@@ -57,7 +57,8 @@ TEST(Containers, KeepTheirOwnDensityWhateverExifSays) {
                "-IFD0:YResolution=72 e.jpg && vips copy s.jpg n.jpg[strip] && "
                "exiftool -q -overwrite_original -JFIF:ResolutionUnit=None -JFIF:XResolution=1 "
                "-JFIF:YResolution=1 n.jpg && cp n.jpg h.jpg && exiftool -q -overwrite_original "
-               "-IFD0:ResolutionUnit=inches -IFD0:XResolution=240 -IFD0:YResolution=240 h.jpg");
+               "-IFD0:ResolutionUnit=inches -IFD0:XResolution=240 -IFD0:YResolution=240 h.jpg && "
+               "convert s.png -density 0 z.psd");
     const struct {
         const char* source;
         const char* target;
@@ -78,6 +79,7 @@ TEST(Containers, KeepTheirOwnDensityWhateverExifSays) {
         {"s.tif", "t.tif", "IFD0:ResolutionUnit -IFD0:XResolution", "3 120"},
         {"n.jpg", "t.jpg", "JFIF:ResolutionUnit -JFIF:XResolution", "0 1"},
         {"h.jpg", "t.jpg", "IFD0:ResolutionUnit -IFD0:XResolution", "2 240"}, // square pixels say no density
+        {"z.psd", "t.png", "PNG:PixelUnits -PNG:PixelsPerUnitX", ""},         // zeros say none
         {"h.jpg", "t.tif", "IFD0:ResolutionUnit -IFD0:XResolution", "2 240"},
     };
     for (const auto& c : cases) {
