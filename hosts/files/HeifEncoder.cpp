@@ -3,10 +3,10 @@
 #include "files/ChildProcess.h"
 #include "files/Conversion.h"
 #include "files/HeifBoxes.h"
-#include "files/HeifLibrary.h"
 #include "files/HeifRate.h"
 #include "files/Memory.h"
 #include "metadata/ExifBlock.h"
+#include "metadata/HeifLibrary.h"
 
 #include <algorithm>
 #include <array>

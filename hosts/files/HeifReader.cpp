@@ -2,10 +2,10 @@
 
 #include "files/ChildProcess.h"
 #include "files/HeifBoxes.h"
-#include "files/HeifLibrary.h"
 #include "files/HeifRate.h"
 #include "files/Memory.h"
 #include "files/Refusal.h"
+#include "metadata/HeifLibrary.h"
 
 #include <algorithm>
 #include <cstring>

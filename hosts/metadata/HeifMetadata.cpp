@@ -1,26 +1,15 @@
 #include "metadata/HeifMetadata.h"
 
-#include <libheif/heif.h>
+#include "metadata/HeifLibrary.h"
 
 #include <algorithm>
 #include <array>
-#include <memory>
 
 namespace orvela {
 
 namespace {
 
 using namespace std::string_view_literals;
-
-template <auto release>
-struct Release {
-    template <typename Object>
-    void operator()(Object* object) const {
-        release(object);
-    }
-};
-using Context = std::unique_ptr<heif_context, Release<heif_context_free>>;
-using Handle = std::unique_ptr<heif_image_handle, Release<heif_image_handle_release>>;
 
 constexpr std::size_t kItems = 64;
 using Items = std::array<heif_item_id, kItems>;
@@ -75,7 +64,7 @@ void takeThumbnail(const heif_image_handle* picture, Metadata& metadata) {
     if (heif_image_handle_get_list_of_thumbnail_IDs(picture, &id, 1) != 1 ||
         heif_image_handle_get_thumbnail(picture, id, &thumbnail).code != heif_error_Ok)
         return;
-    const Handle owner(thumbnail);
+    const HeifHandle owner(thumbnail);
     metadata.heifThumbnail =
         std::max(heif_image_handle_get_width(thumbnail), heif_image_handle_get_height(thumbnail));
 }
@@ -108,7 +97,7 @@ void nameOtherPictures(heif_context* context, const heif_image_handle* picture, 
         const heif_item_id id = ids.at(static_cast<std::size_t>(i));
         if (heif_image_handle_get_auxiliary_image_handle(picture, id, &auxiliary).code != heif_error_Ok)
             continue;
-        const Handle owner(auxiliary);
+        const HeifHandle owner(auxiliary);
         std::string name = "an auxiliary picture";
         if (heif_image_handle_get_auxiliary_type(auxiliary, &type).code == heif_error_Ok && type != nullptr) {
             name = nameOf(type);
@@ -129,14 +118,14 @@ void nameOtherPictures(heif_context* context, const heif_image_handle* picture, 
 Metadata readHeifMetadata(ByteView file) {
     Metadata metadata;
     metadata.format = FileFormat::Heif;
-    const Context context(heif_context_alloc());
+    const HeifContext context(heif_context_alloc());
     heif_image_handle* picture = nullptr;
     // What cannot be read here, the reader of the picture refuses.
     if (heif_context_read_from_memory_without_copy(context.get(), file.data(), file.size(), nullptr).code !=
             heif_error_Ok ||
         heif_context_get_primary_image_handle(context.get(), &picture).code != heif_error_Ok)
         return metadata;
-    const Handle owner(picture);
+    const HeifHandle owner(picture);
     Items ids{};
     const int items = heif_image_handle_get_list_of_metadata_block_IDs(picture, nullptr, ids.data(), kItems);
     for (int i = 0; i < items; ++i)

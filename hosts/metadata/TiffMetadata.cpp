@@ -19,10 +19,6 @@ bool isResolution(std::uint16_t tag) {
     return tag == tiff::XResolution || tag == tiff::YResolution || tag == tiff::ResolutionUnit;
 }
 
-bool isPointer(std::uint16_t tag) {
-    return tag == tiff::ExifIfd || tag == tiff::GpsIfd || tag == tiff::InteropIfd;
-}
-
 /// Lays out directories and their values around a maker note that has to stay where it is.
 class BlockBuilder {
 public:
@@ -88,14 +84,10 @@ private:
 
 // Numbers of eight bytes, which only a BigTIFF has, in four.
 TagField classic(const TiffView& view, const TagEntry& entry) {
-    constexpr std::uint16_t long8 = 16;
-    constexpr std::uint16_t slong8 = 17;
-    constexpr std::uint16_t ifd8 = 18;
-    constexpr std::uint16_t slong = 9;
-    TagField field{entry.tag, entry.type, static_cast<std::uint32_t>(entry.count), copyOf(entry.value)};
-    if (entry.type != long8 && entry.type != slong8 && entry.type != ifd8)
+    TagField field{entry.tag, narrowTagType(entry.type), static_cast<std::uint32_t>(entry.count),
+                   copyOf(entry.value)};
+    if (field.type == entry.type)
         return field;
-    field.type = entry.type == slong8 ? slong : static_cast<std::uint16_t>(tiff::Long);
     field.value.clear();
     for (std::size_t i = 0; i < entry.count; ++i)
         append(field.value, view.value(entry, i), 4, view.order());
@@ -106,7 +98,7 @@ TagField classic(const TiffView& view, const TagEntry& entry) {
 std::vector<TagField> fieldsOf(const TiffView& view, const TagDirectory& directory, bool first) {
     std::vector<TagField> fields;
     for (const TagEntry& entry : directory.entries)
-        if (!entry.value.empty() && !isPointer(entry.tag) && !(first && isTiffStructure(entry.tag)))
+        if (!entry.value.empty() && !leadsToExif(entry.tag) && !(first && isTiffStructure(entry.tag)))
             fields.push_back(classic(view, entry));
     return fields;
 }
