@@ -8,7 +8,7 @@
 #include "files/TiffFields.h"
 #include "files/TiffWriter.h"
 #include "metadata/MetadataWriter.h"
-#include "metadata/PngMetadata.h"
+#include "metadata/PngChunks.h"
 
 #include <algorithm>
 
@@ -134,7 +134,7 @@ void PhotographWriter::addEncoded(const Photograph& photograph, PreparedMetadata
     embedMetadata(metadata, encoded);
     // The library leaves out one that is damaged, or for other colours than the picture's.
     if (metadata.target == FileFormat::Png && !photograph.iccProfile.empty() && !hasPngChunk(encoded, "iCCP"))
-        metadata.lost.emplace_back("the ICC profile, which does not suit its colours or is damaged");
+        metadata.lost.emplace_back(kUnsuitedProfile);
     mFile = std::make_unique<TargetFile>(mTarget, mSource);
     mFile->write(encoded, mOptions.stop);
 }

@@ -104,11 +104,6 @@ bool isEncoders(const JpegSegment& segment) {
            (segment.marker == App14 && startsWith(segment.data, "Adobe"));
 }
 
-void nameOnce(std::vector<std::string>& names, const std::string& name) {
-    if (std::find(names.begin(), names.end(), name) == names.end())
-        names.push_back(name);
-}
-
 void take(const JpegSegment& segment, Metadata& metadata) {
     const ByteView data = segment.data;
     if (isEncoders(segment))
@@ -206,11 +201,11 @@ Metadata readJpegMetadata(ByteView file) {
     // As they are written.
     std::stable_partition(metadata.segments.begin(), metadata.segments.end(),
                           [](const Chunk& segment) { return segment.marker == App0; });
-    const std::size_t rest = behindJpeg(file).size();
-    const bool known = std::any_of(metadata.unheld.begin(), metadata.unheld.end(),
-                                   [](const std::string& name) { return name.ends_with("(MPF)"); });
-    if (rest > 0 && !known)
-        metadata.unheld.push_back(std::to_string(rest) + " bytes behind the picture");
+    const bool further = std::any_of(metadata.unheld.begin(), metadata.unheld.end(),
+                                     [](const std::string& name) { return name.ends_with("(MPF)"); });
+    const ByteView rest = behindJpeg(file);
+    if (!further || holdsFilm(rest))
+        nameRest(rest, metadata);
     return metadata;
 }
 

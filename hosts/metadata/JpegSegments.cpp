@@ -55,11 +55,7 @@ ByteView behindJpeg(ByteView file) {
             step = 2 + number(rest, 2, 2, ByteOrder::Big);
         rest = rest.subspan(std::min(step, rest.size()));
     }
-    rest = rest.subspan(std::min<std::size_t>(2, rest.size()));
-    const auto isFiller = [](std::uint8_t byte) { return byte == 0 || byte == 0xFF; };
-    while (!rest.empty() && isFiller(rest.back()))
-        rest = rest.first(rest.size() - 1);
-    return rest;
+    return rest.subspan(std::min<std::size_t>(2, rest.size()));
 }
 
 std::optional<JpegSize> jpegSize(ByteView file) {

@@ -25,7 +25,7 @@ std::vector<JpegSegment> jpegSegments(ByteView file);
 /// From the first scan on; empty when there is none.
 ByteView jpegScans(ByteView file);
 
-/// What stands behind the end marker; zeros and the like at its end are left out.
+/// What stands behind the end marker.
 ByteView behindJpeg(ByteView file);
 
 /// Edges of the picture; none when the bytes are no JPEG with a frame.

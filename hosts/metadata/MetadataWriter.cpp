@@ -5,12 +5,12 @@
 #include "metadata/JpegMetadata.h"
 #include "metadata/MetadataReader.h"
 #include "metadata/PngMetadata.h"
+#include "metadata/PngTexts.h"
 #include "metadata/TagLibrary.h"
 #include "metadata/Utf8.h"
 #include "metadata/WebPMetadata.h"
 
 #include <algorithm>
-#include <array>
 #include <regex>
 
 namespace orvela {
@@ -18,6 +18,8 @@ namespace orvela {
 namespace {
 
 using Names = std::vector<std::string>;
+
+constexpr std::size_t kLongestComment = 65533; // of a JPEG
 
 // A list that a line has room for.
 std::string joined(const Names& names, const char* between) {
@@ -29,18 +31,6 @@ std::string joined(const Names& names, const char* between) {
         text += (i == 0 ? "" : between) + names[i];
     }
     return text;
-}
-
-// Tags of the first Exif directory that mean the same as keywords of PNG.
-std::uint16_t tagOf(const std::string& keyword) {
-    constexpr std::array<std::pair<std::string_view, std::uint16_t>, 4> table = {
-        {{"Author", tiff::Artist},
-         {"Copyright", tiff::Copyright},
-         {"Description", tiff::ImageDescription},
-         {"Software", tiff::Software}}};
-    const auto found =
-        std::find_if(table.begin(), table.end(), [&](const auto& entry) { return entry.first == keyword; });
-    return found == table.end() ? 0 : found->second;
 }
 
 /// Makes the metadata of one format ready for another.
@@ -76,7 +66,7 @@ private:
     void dropSegments();
     void dropChunks();
     void moveTexts();
-    bool moveText(const Text& text);
+    bool moveText(Text text);
     void moveResources();
     void moveDensity();
     void moveColors();
@@ -84,7 +74,7 @@ private:
     void fitTiff();
 
     Metadata& metadata() { return mResult.metadata; }
-    void lose(const std::string& name) { mResult.lost.push_back(name); }
+    void lose(const std::string& name) { nameOnce(mResult.lost, name); }
 
     const Metadata& mSource;
     const PictureFacts& mPicture;
@@ -130,8 +120,7 @@ void Preparation::dropSegments() {
 void Preparation::dropChunks() {
     Names names;
     for (const Chunk& chunk : mSource.chunks) {
-        const bool text = chunk.name == "tEXt" || chunk.name == "zTXt" || chunk.name == "iTXt";
-        if (!text && !isPlainColour(chunk))
+        if (!isPngText(chunk.name) && !isPlainColour(chunk))
             names.push_back(chunk.name);
     }
     if (!names.empty())
@@ -139,16 +128,21 @@ void Preparation::dropChunks() {
     metadata().chunks.clear();
 }
 
-bool Preparation::moveText(const Text& text) {
-    const bool png = mResult.target == FileFormat::Png;
-    const bool comment = text.keyword == "Comment" && mResult.target == FileFormat::Jpeg;
-    if (png || (comment && text.text.size() <= 65533)) {
-        const bool bytes = comment && mSource.format == FileFormat::Jpeg;
-        metadata().texts.push_back({text.keyword, bytes ? text.text : toUtf8(text.text)});
+// Some cameras fill up a comment with zeros. Within a text few places hold one.
+bool Preparation::moveText(Text text) {
+    const bool bytes = text.keyword == kCommentKeyword && mResult.target == FileFormat::Jpeg;
+    if (!bytes) {
+        text.text.erase(text.text.find_last_not_of('\0') + 1);
+        if (text.text.find('\0') != std::string::npos)
+            return false;
+    }
+    if (mResult.target == FileFormat::Png || (bytes && text.text.size() <= kLongestComment)) {
+        const bool plain = bytes && mSource.format == FileFormat::Jpeg;
+        metadata().texts.push_back({text.keyword, plain ? text.text : toUtf8(text.text)});
         return true;
     }
-    const std::uint16_t tag = tagOf(text.keyword);
-    if (tag == 0 || mExif.isDamaged() || text.text.find('\0') != std::string::npos)
+    const std::uint16_t tag = tagOfKeyword(text.keyword);
+    if (tag == 0 || mExif.isDamaged())
         return false;
     if (const std::optional<std::string> there = mExif.text(tag))
         return *there == text.text;
@@ -267,11 +261,6 @@ PreparedMetadata prepareMetadata(const Metadata& source, FileFormat target, cons
 
 void embedMetadata(PreparedMetadata& prepared, Bytes& encoded) {
     const Metadata& metadata = prepared.metadata;
-    const auto lose = [&](const Names& names) {
-        for (const std::string& name : names)
-            if (std::find(prepared.lost.begin(), prepared.lost.end(), name) == prepared.lost.end())
-                prepared.lost.push_back(name);
-    };
     switch (prepared.target) {
     case FileFormat::Jpeg:
         embedIntoJpeg(metadata, encoded);
@@ -287,7 +276,8 @@ void embedMetadata(PreparedMetadata& prepared, Bytes& encoded) {
     case FileFormat::Psd:
         break;
     }
-    lose(differences(metadata, readMetadata(encoded, prepared.target)));
+    for (const std::string& name : differences(metadata, readMetadata(encoded, prepared.target)))
+        nameOnce(prepared.lost, name);
 }
 
 std::vector<std::string> metadataNotes(const PreparedMetadata& prepared) {
