@@ -116,7 +116,7 @@ void PhotographWriter::addPage(const Photograph& photograph, PreparedMetadata& p
             prepared.lost.emplace_back("what the maker note refers to by its place");
         }
         if (photograph.copied) {
-            mTiff->addCopy(photograph.tiffPage->blocks, copiedFields(*photograph.tiffPage));
+            mTiff->addCopy(photograph.tiffPage->blocks, copiedFields(*photograph.tiffPage, prepared.lost));
         } else {
             if (mOptions.compression.empty() && storage.compression != storedCompression(photograph, storage))
                 prepared.lost.push_back(std::string("its kind of compression (") +

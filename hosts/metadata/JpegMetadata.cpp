@@ -96,11 +96,14 @@ const char* unheldName(const JpegSegment& segment) {
     return nullptr;
 }
 
+bool isProfile(const JpegSegment& segment) {
+    return segment.marker == App2 && startsWith(segment.data, "ICC_PROFILE\0"sv);
+}
+
 // Whether the encoder of the result writes it itself.
 bool isEncoders(const JpegSegment& segment) {
     return segment.marker < App0 || segment.marker > Comment ||
-           (segment.marker > App15 && segment.marker < Comment) ||
-           (segment.marker == App2 && startsWith(segment.data, "ICC_PROFILE\0"sv)) ||
+           (segment.marker > App15 && segment.marker < Comment) || isProfile(segment) ||
            (segment.marker == App14 && startsWith(segment.data, "Adobe"));
 }
 
@@ -198,6 +201,11 @@ Metadata readJpegMetadata(ByteView file) {
     metadata.format = FileFormat::Jpeg;
     for (const JpegSegment& segment : jpegSegments(file))
         take(segment, metadata);
+    for (const JpegSegment& segment : laterJpegSegments(file))
+        if (isProfile(segment))
+            nameOnce(metadata.unheld, "an ICC profile behind the beginning of the picture");
+        else
+            take(segment, metadata);
     // As they are written.
     std::stable_partition(metadata.segments.begin(), metadata.segments.end(),
                           [](const Chunk& segment) { return segment.marker == App0; });

@@ -6,7 +6,7 @@
 
 namespace orvela {
 
-/// A marker segment in front of the first scan.
+/// A marker segment.
 struct JpegSegment {
     int marker = 0; ///< 0xC0 to 0xFE
     ByteView data;  ///< behind the length
@@ -24,6 +24,9 @@ std::vector<JpegSegment> jpegSegments(ByteView file);
 
 /// From the first scan on; empty when there is none.
 ByteView jpegScans(ByteView file);
+
+/// The segments behind that, between scans and behind the last one, as far as they are whole.
+std::vector<JpegSegment> laterJpegSegments(ByteView file);
 
 /// What stands behind the end marker.
 ByteView behindJpeg(ByteView file);

@@ -4,6 +4,7 @@
 #include "metadata/ImageResources.h"
 #include "metadata/JpegMetadata.h"
 #include "metadata/MetadataReader.h"
+#include "metadata/NotePreviews.h"
 #include "metadata/PngMetadata.h"
 #include "metadata/PngTexts.h"
 #include "metadata/TagLibrary.h"
@@ -11,6 +12,7 @@
 #include "metadata/WebPMetadata.h"
 
 #include <algorithm>
+#include <iterator>
 #include <regex>
 
 namespace orvela {
@@ -31,6 +33,24 @@ std::string joined(const Names& names, const char* between) {
         text += (i == 0 ? "" : between) + names[i];
     }
     return text;
+}
+
+// @return whether the packet showed the picture as it was
+bool eraseThumbnails(Bytes& packet) {
+    std::string text(asText(packet));
+    for (const std::string name : {"xmp:Thumbnails", "xap:Thumbnails"})
+        for (;;) {
+            const std::size_t begin = std::min(text.find("<" + name + ">"), text.find("<" + name + " "));
+            const std::string end = "</" + name + ">";
+            const std::size_t last = begin == std::string::npos ? begin : text.find(end, begin);
+            if (last == std::string::npos)
+                break;
+            text.erase(begin, last + end.size() - begin);
+        }
+    if (text.size() == packet.size())
+        return false;
+    packet = copyOf(asBytes(text));
+    return true;
 }
 
 /// Makes the metadata of one format ready for another.
@@ -63,6 +83,7 @@ public:
 
 private:
     void adaptToPicture();
+    void dropXmpThumbnails();
     void dropSegments();
     void dropChunks();
     void moveTexts();
@@ -99,20 +120,33 @@ void Preparation::adaptToPicture() {
     const bool inHeif = mSource.heifThumbnail == 0 || mResult.target == FileFormat::Heif;
     if (!inExif || !inResources || !inHeif)
         lose("the thumbnail");
+    Bytes block = mExif.bytes();
+    if (!renewNotePreviews(block, mPicture.makeThumbnail, turned))
+        lose("the preview in the maker note");
+    mExif = ExifBlock(std::move(block));
+    dropXmpThumbnails();
+}
+
+// A long packet of a JPEG has them in further segments.
+void Preparation::dropXmpThumbnails() {
+    std::optional<Bytes> whole = joinXmp(metadata().xmp, metadata().segments);
+    const bool parted = whole.has_value();
+    Bytes packet = whole ? std::move(*whole) : metadata().xmp;
+    if (!eraseThumbnails(packet))
+        return;
+    lose("the thumbnail");
+    metadata().xmp = std::move(packet);
+    if (parted)
+        std::erase_if(metadata().segments, [](const Chunk& one) { return one.name == kExtendedXmp; });
 }
 
 void Preparation::dropSegments() {
-    if (mSource.segments.empty())
-        return;
-    Names names;
-    const std::optional<Bytes> xmp = joinXmp(mSource.xmp, mSource.segments);
+    const std::optional<Bytes> xmp = joinXmp(metadata().xmp, metadata().segments);
     if (xmp)
         metadata().xmp = *xmp;
-    for (const Chunk& segment : mSource.segments)
-        if (!(xmp && segment.name == kExtendedXmp) &&
-            std::find(names.begin(), names.end(), segment.name) == names.end())
-            names.push_back(segment.name);
-    mResult.lost.insert(mResult.lost.end(), names.begin(), names.end());
+    for (const Chunk& segment : metadata().segments)
+        if (!xmp || segment.name != kExtendedXmp)
+            lose(segment.name);
     metadata().segments.clear();
 }
 
@@ -168,10 +202,13 @@ void Preparation::moveResources() {
     if (mResult.target != FileFormat::WebP && mResult.target != FileFormat::Heif)
         return;
     const ImageResources resources = imageResources(mSource.resources);
-    if (const ImageResource* iptc = resources.find(resource::Iptc)) {
-        const Names names = iptcNames(iptc->data);
+    Names names;
+    for (const ImageResource& one : resources.list)
+        if (one.id == resource::Iptc)
+            for (const std::string& name : iptcNames(one.data))
+                nameOnce(names, name);
+    if (resources.find(resource::Iptc) != nullptr)
         lose(names.empty() ? "IPTC" : "IPTC " + joined(names, ", "));
-    }
     const bool others = std::any_of(resources.list.begin(), resources.list.end(),
                                     [](const ImageResource& one) { return one.id != resource::Iptc; });
     if (others || !resources.rest.empty())
@@ -184,10 +221,12 @@ void Preparation::moveDensity() {
     if (!mSource.density || mResult.target == FileFormat::Jpeg || mResult.target == FileFormat::Png ||
         mResult.target == FileFormat::Tiff)
         return;
-    if (mSource.density->unit != DensityUnit::None)
-        mExif.setDensity(*mSource.density);
-    else if (mSource.density->x.value() != mSource.density->y.value())
+    if (mSource.density->unit != DensityUnit::None) {
+        if (!mExif.setDensity(*mSource.density))
+            lose("the density");
+    } else if (mSource.density->x.value() != mSource.density->y.value()) {
         lose("the shape of its pixels");
+    }
     metadata().density.reset();
 }
 
@@ -217,12 +256,13 @@ void Preparation::fitJpeg() {
         lose("the Exif data, of over 64 KiB");
         mExif = ExifBlock({});
     }
-    if (mSource.xmp.size() <= kJpegXmpLimit)
+    if (metadata().xmp.size() <= kJpegXmpLimit)
         return;
+    const Bytes packet = std::move(metadata().xmp);
     metadata().xmp.clear();
-    if (std::optional<PartedXmp> parted = partXmp(mSource.xmp)) {
+    if (std::optional<PartedXmp> parted = partXmp(packet)) {
         metadata().xmp = std::move(parted->main);
-        metadata().segments = std::move(parted->segments);
+        std::move(parted->segments.begin(), parted->segments.end(), std::back_inserter(metadata().segments));
     } else {
         lose("the XMP data");
     }

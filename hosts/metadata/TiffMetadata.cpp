@@ -2,6 +2,7 @@
 
 #include "metadata/ExifBlock.h"
 #include "metadata/ImageResources.h"
+#include "metadata/TagDensity.h"
 #include "metadata/TagLibrary.h"
 
 #include <algorithm>
@@ -167,13 +168,12 @@ ByteView withoutPadding(ByteView iptc) {
     return iptc;
 }
 
+// The tag goes before what Photoshop's list holds of the kind, often the same.
 void takeResources(const TagDirectory& page, Metadata& metadata) {
     const ByteView iptc = withoutPadding(valueOf(page, tiff::Iptc));
-    metadata.resources = copyOf(valueOf(page, tiff::Resources));
-    if (iptc.empty())
-        return;
-    metadata.resources = withoutResources(metadata.resources, {resource::Iptc});
-    appendResource(metadata.resources, resource::Iptc, iptc);
+    if (!iptc.empty())
+        appendResource(metadata.resources, resource::Iptc, iptc);
+    addResources(metadata.resources, valueOf(page, tiff::Resources));
 }
 
 } // namespace
@@ -212,12 +212,18 @@ std::vector<TagField> tiffFields(const Metadata& metadata, ByteOrder order) {
     };
     add(tiff::Xmp, tiff::Byte, metadata.xmp);
     const ImageResources resources = imageResources(metadata.resources);
-    if (const ImageResource* iptc = resources.find(resource::Iptc)) {
+    const ImageResource* iptc = resources.find(resource::Iptc);
+    if (iptc != nullptr) {
         Bytes padded = copyOf(iptc->data);
         padded.resize((padded.size() + 3) / 4 * 4);
         add(tiff::Iptc, tiff::Long, std::move(padded));
     }
-    add(tiff::Resources, tiff::Byte, withoutResources(metadata.resources, {resource::Iptc}));
+    Bytes others;
+    for (const ImageResource& one : resources.list)
+        if (&one != iptc)
+            append(others, one.whole);
+    append(others, resources.rest);
+    add(tiff::Resources, tiff::Byte, std::move(others));
     if (metadata.density)
         for (TagField& field : densityFields(*metadata.density, order))
             fields.push_back(std::move(field));
