@@ -12,26 +12,6 @@ namespace {
 
 using Items = std::vector<std::uint32_t>;
 
-// The items that an item is put together from, in order; none when it is coded itself.
-Items partsOf(ByteView meta, std::uint32_t item) {
-    for (const HeifBox& candidate : heifBoxes(meta)) {
-        if (candidate.type != "iref")
-            continue;
-        HeifFullBox box(candidate.content);
-        const bool wide = box.version > 0;
-        for (const HeifBox& reference : heifBoxes(box.content.rest())) {
-            Cursor cursor(reference.content);
-            if (reference.type != "dimg" || heifId(cursor, wide) != item)
-                continue;
-            Items parts(heifId(cursor, false));
-            for (std::uint32_t& part : parts)
-                part = heifId(cursor, wide);
-            return parts;
-        }
-    }
-    return {};
-}
-
 // The bytes that each item takes in the file.
 std::map<std::uint32_t, std::uint64_t> itemSizes(ByteView iloc) {
     HeifFullBox box(iloc);
@@ -103,7 +83,7 @@ HeifCoding codingOf(ByteView file) {
     Items items = {primary};
     // A picture of tiles may itself be turned or framed by another item.
     for (int depth = 0; depth < 3; ++depth) {
-        Items parts = partsOf(meta, items[0]);
+        Items parts = heifReferences(meta, "dimg", items[0]);
         if (parts.empty())
             break;
         items = std::move(parts);

@@ -38,4 +38,40 @@ std::uint32_t primaryHeifItem(ByteView meta) {
     return heifId(box.content, box.version > 0);
 }
 
+std::vector<HeifItem> heifItems(ByteView meta) {
+    HeifFullBox list(heifBoxIn(meta, "iinf"));
+    list.content.number(list.version == 0 ? 2 : 4); // how many
+    std::vector<HeifItem> items;
+    for (const HeifBox& box : heifBoxes(list.content.rest())) {
+        if (box.type != "infe")
+            continue;
+        HeifFullBox entry(box.content);
+        HeifItem& item = items.emplace_back();
+        item.id = heifId(entry.content, entry.version > 2);
+        entry.content.take(2); // protection
+        if (entry.version >= 2)
+            item.type = asText(entry.content.take(4));
+    }
+    return items;
+}
+
+std::vector<std::uint32_t> heifReferences(ByteView meta, std::string_view kind, std::uint32_t from) {
+    for (const HeifBox& candidate : heifBoxes(meta)) {
+        if (candidate.type != "iref")
+            continue;
+        HeifFullBox box(candidate.content);
+        const bool wide = box.version > 0;
+        for (const HeifBox& reference : heifBoxes(box.content.rest())) {
+            Cursor cursor(reference.content);
+            if (reference.type != kind || heifId(cursor, wide) != from)
+                continue;
+            std::vector<std::uint32_t> items(cursor.number(2));
+            for (std::uint32_t& item : items)
+                item = heifId(cursor, wide);
+            return items;
+        }
+    }
+    return {};
+}
+
 } // namespace orvela

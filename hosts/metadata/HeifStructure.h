@@ -44,4 +44,16 @@ ByteView heifMeta(ByteView file);
 /// The item that is the picture. @throws DamagedBytes where it is not told
 std::uint32_t primaryHeifItem(ByteView meta);
 
+struct HeifItem {
+    std::uint32_t id = 0;
+    std::string_view type; ///< four letters; empty where it has none
+};
+
+/// The items that are listed. @throws DamagedBytes without a whole list
+std::vector<HeifItem> heifItems(ByteView meta);
+
+/// The items that one refers to, in order, by a reference of that kind ("dimg": it is put together from them,
+/// "cdsc": it describes them). @throws DamagedBytes when references are not whole
+std::vector<std::uint32_t> heifReferences(ByteView meta, std::string_view kind, std::uint32_t from);
+
 } // namespace orvela
