@@ -1,5 +1,6 @@
 #include "files/HeifBoxes.h"
 
+#include "files/HevcParameters.h"
 #include "metadata/HeifStructure.h"
 
 #include <algorithm>
@@ -99,6 +100,7 @@ HeifCoding codingOf(ByteView file) {
         if (property.type == "hvcC" || property.type == "av1C") {
             coding.isAv1 = property.type == "av1C";
             coding.chroma = chromaOf(property);
+            coding.lossless = !coding.isAv1 && isLosslessHevc(property.content);
         }
     for (const HeifBox& property : chosen(all, propertiesOf(ipma, primary)))
         if (!isKnown(property))

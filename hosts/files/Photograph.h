@@ -88,7 +88,7 @@ struct HeifRate;
 /// How the source was encoded, so that the result can be written alike.
 struct Encoding {
     FileFormat format = FileFormat::Png;
-    bool lossless = false;        ///< WebP without loss
+    bool lossless = false;        ///< WebP or HEIF without loss
     bool progressive = false;     ///< interlaced or progressive
     std::string compression;      ///< by its library name: TIFF "lzw" and others, HEIF "hevc" or "av1"
     int quality = 0;              ///< TIFF with JPEG compression: 1 to 100; 0 when unknown

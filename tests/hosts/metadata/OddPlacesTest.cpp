@@ -121,6 +121,19 @@ TEST(OddPlaces, KeepEveryIptcOfATiff) {
     EXPECT_THAT(convert(folder, "t.tif", "t.webp"), ElementsAre(EndsWith("hold: IPTC City")));
 }
 
+TEST(OddPlaces, NameASecondBlockOfAPsd) {
+    Bytes list;
+    for (const char* data : {"one", "one", "two"})
+        appendResource(list, resource::Xmp, asBytes(std::string_view(data)));
+    appendResource(list, resource::Exif3, asBytes(std::string_view("II*")));
+    Bytes file(30); // header and an empty palette
+    append(file, list.size(), 4, ByteOrder::Big);
+    append(file, list);
+    append(file, 0, 4, ByteOrder::Big);
+    EXPECT_THAT(readMetadata(file, FileFormat::Psd).unheld,
+                ElementsAre("a second XMP packet", "a second Exif block"));
+}
+
 // A list that held a thumbnail alone does not come back with it.
 TEST(OddPlaces, LeaveOutOfATiffWhatWasDropped) {
     const TestFolder folder;
