@@ -81,13 +81,14 @@ bool isKnown(const HeifBox& property) {
 HeifCoding codingOf(ByteView file) {
     const ByteView meta = heifMeta(file);
     const std::uint32_t primary = primaryHeifItem(meta);
+    const auto derived = heifReferences(meta, "dimg");
     Items items = {primary};
     // A picture of tiles may itself be turned or framed by another item.
     for (int depth = 0; depth < 3; ++depth) {
-        Items parts = heifReferences(meta, "dimg", items[0]);
-        if (parts.empty())
+        const auto parts = derived.find(items[0]);
+        if (parts == derived.end() || parts->second.empty())
             break;
-        items = std::move(parts);
+        items = parts->second;
     }
     HeifCoding coding;
     auto sizes = itemSizes(heifBoxIn(meta, "iloc"));

@@ -125,10 +125,11 @@ bool isAmong(const std::array<std::string_view, count>& names, std::string_view 
 void nameStrayItems(ByteView meta, Metadata& metadata) {
     constexpr std::array pictures = {"hvc1"sv, "hev1"sv, "lhv1"sv, "av01"sv, "avc1"sv, "vvc1"sv, "jpeg"sv,
                                      "j2k1"sv, "unci"sv, "grid"sv, "iden"sv, "iovl"sv, "mski"sv};
+    const auto descriptions = heifReferences(meta, "cdsc");
     for (const HeifItem& item : heifItems(meta))
         if (item.type == "tmap")
             nameOnce(metadata.unheld, "the gain map");
-        else if (!isAmong(pictures, item.type) && heifReferences(meta, "cdsc", item.id).empty())
+        else if (!isAmong(pictures, item.type) && !descriptions.contains(item.id))
             nameOnce(metadata.unheld, "a HEIF item of the kind " + std::string(item.type));
 }
 

@@ -55,23 +55,23 @@ std::vector<HeifItem> heifItems(ByteView meta) {
     return items;
 }
 
-std::vector<std::uint32_t> heifReferences(ByteView meta, std::string_view kind, std::uint32_t from) {
+std::map<std::uint32_t, std::vector<std::uint32_t>> heifReferences(ByteView meta, std::string_view kind) {
+    std::map<std::uint32_t, std::vector<std::uint32_t>> found;
     for (const HeifBox& candidate : heifBoxes(meta)) {
         if (candidate.type != "iref")
             continue;
         HeifFullBox box(candidate.content);
         const bool wide = box.version > 0;
         for (const HeifBox& reference : heifBoxes(box.content.rest())) {
-            Cursor cursor(reference.content);
-            if (reference.type != kind || heifId(cursor, wide) != from)
+            if (reference.type != kind)
                 continue;
-            std::vector<std::uint32_t> items(cursor.number(2));
-            for (std::uint32_t& item : items)
-                item = heifId(cursor, wide);
-            return items;
+            Cursor cursor(reference.content);
+            std::vector<std::uint32_t>& items = found[heifId(cursor, wide)];
+            for (std::uint64_t count = cursor.number(2); count > 0; --count)
+                items.push_back(heifId(cursor, wide));
         }
     }
-    return {};
+    return found;
 }
 
 } // namespace orvela

@@ -2,6 +2,8 @@
 
 #include "metadata/Bytes.h"
 
+#include <map>
+
 // The boxes that a HEIF is made of.
 
 namespace orvela {
@@ -52,8 +54,8 @@ struct HeifItem {
 /// The items that are listed. @throws DamagedBytes without a whole list
 std::vector<HeifItem> heifItems(ByteView meta);
 
-/// The items that one refers to, in order, by a reference of that kind ("dimg": it is put together from them,
-/// "cdsc": it describes them). @throws DamagedBytes when references are not whole
-std::vector<std::uint32_t> heifReferences(ByteView meta, std::string_view kind, std::uint32_t from);
+/// By each item the ones, in order, that it refers to by a reference of that kind ("dimg": it is put together
+/// from them, "cdsc": it describes them). @throws DamagedBytes when references are not whole
+std::map<std::uint32_t, std::vector<std::uint32_t>> heifReferences(ByteView meta, std::string_view kind);
 
 } // namespace orvela

@@ -35,21 +35,27 @@ std::string joined(const Names& names, const char* between) {
     return text;
 }
 
+// The packet without what stands between these tags.
+std::string without(std::string_view open, std::string_view close, std::string_view packet) {
+    std::string kept;
+    std::size_t from = 0;
+    for (std::size_t at = packet.find(open); at != std::string_view::npos; at = packet.find(open, from)) {
+        const std::size_t last = packet.find(close, at);
+        if (last == std::string_view::npos)
+            break;
+        kept += packet.substr(from, at - from);
+        from = last + close.size();
+    }
+    return kept.append(packet.substr(from));
+}
+
 // @return whether the packet showed the picture as it was
 bool eraseThumbnails(Bytes& packet) {
-    std::string text(asText(packet));
-    for (const std::string name : {"xmp:Thumbnails", "xap:Thumbnails"})
-        for (;;) {
-            const std::size_t begin = std::min(text.find("<" + name + ">"), text.find("<" + name + " "));
-            const std::string end = "</" + name + ">";
-            const std::size_t last = begin == std::string::npos ? begin : text.find(end, begin);
-            if (last == std::string::npos)
-                break;
-            text.erase(begin, last + end.size() - begin);
-        }
-    if (text.size() == packet.size())
+    const std::string kept = without("<xmp:Thumbnails", "</xmp:Thumbnails>",
+                                     without("<xap:Thumbnails", "</xap:Thumbnails>", asText(packet)));
+    if (kept.size() == packet.size())
         return false;
-    packet = copyOf(asBytes(text));
+    packet = copyOf(asBytes(kept));
     return true;
 }
 
