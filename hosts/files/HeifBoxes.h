@@ -7,6 +7,7 @@ namespace orvela {
 /// How the primary picture of a HEIF is coded, its tiles together.
 struct HeifCoding {
     bool isAv1 = false;
+    bool lossless = false;                    ///< known of HEVC only
     Chroma chroma = Chroma::Half;             ///< of a grey picture Half too
     std::uint64_t bytes = 0;                  ///< that it takes, without metadata and other pictures
     std::vector<std::string> otherProperties; ///< of the primary picture, by their four letters: "clli"

@@ -2,10 +2,10 @@
 
 #include "files/ChildProcess.h"
 #include "files/HeifBoxes.h"
-#include "files/HeifLibrary.h"
 #include "files/HeifRate.h"
 #include "files/Memory.h"
 #include "files/Refusal.h"
+#include "metadata/HeifLibrary.h"
 
 #include <algorithm>
 #include <cstring>
@@ -115,6 +115,7 @@ void takeCoding(Photograph& photograph, ByteView file) {
     photograph.encoding.chroma = coding ? coding->chroma : Chroma::Half;
     if (!coding)
         return;
+    photograph.encoding.lossless = coding->lossless;
     for (const std::string& property : coding->otherProperties)
         photograph.unheld.push_back("the HEIF property " + property);
     const double pixels = static_cast<double>(photograph.width) * photograph.height;

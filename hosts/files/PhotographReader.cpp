@@ -10,7 +10,7 @@
 #include "files/TiffReader.h"
 #include "files/VipsPhotograph.h"
 #include "metadata/MetadataReader.h"
-#include "metadata/PngMetadata.h"
+#include "metadata/PngChunks.h"
 #include "metadata/WebPMetadata.h"
 
 #include <webp/decode.h>
@@ -144,6 +144,27 @@ void takeResolution(Photograph& photograph) {
     photograph.yResolution = density->y.value() / density->millimetres();
 }
 
+// A profile tells what colours it is for.
+bool suits(const Bytes& profile, ColorModel model) {
+    constexpr std::size_t head = 128;
+    const bool grey = model == ColorModel::Grey || model == ColorModel::GreyAlpha;
+    const std::string_view text = asText(profile);
+    return text.size() > head && text.substr(36, 4) == "acsp" &&
+           text.substr(16, 4) == (grey ? "GRAY" : "RGB ");
+}
+
+// One that stands in a PNG as a text counts where none stands in its place.
+void takeProfile(Photograph& photograph, const Bytes& profile) {
+    if (profile.empty() || profile == photograph.iccProfile)
+        return;
+    if (!photograph.iccProfile.empty())
+        photograph.unheld.emplace_back("a second ICC profile");
+    else if (suits(profile, photograph.model))
+        photograph.iccProfile = profile;
+    else
+        photograph.unheld.emplace_back(kUnsuitedProfile);
+}
+
 Photograph read(const Bytes& file, FileFormat format, const fs::path& path, const ReadLimits& limits) {
     switch (format) {
     case FileFormat::Jpeg:
@@ -202,6 +223,7 @@ Photograph PhotographReader::readOther() {
         photograph.unheld.push_back(frames > 2 ? "the other " + std::to_string(frames - 1) + " frames"
                                                : "the other frame");
     photograph.metadata = std::make_shared<const Metadata>(readMetadata(file, mFormat));
+    takeProfile(photograph, photograph.metadata->iccProfile);
     return photograph;
 }
 

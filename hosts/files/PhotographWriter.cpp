@@ -8,7 +8,7 @@
 #include "files/TiffFields.h"
 #include "files/TiffWriter.h"
 #include "metadata/MetadataWriter.h"
-#include "metadata/PngMetadata.h"
+#include "metadata/PngChunks.h"
 
 #include <algorithm>
 
@@ -116,7 +116,7 @@ void PhotographWriter::addPage(const Photograph& photograph, PreparedMetadata& p
             prepared.lost.emplace_back("what the maker note refers to by its place");
         }
         if (photograph.copied) {
-            mTiff->addCopy(photograph.tiffPage->blocks, copiedFields(*photograph.tiffPage));
+            mTiff->addCopy(photograph.tiffPage->blocks, copiedFields(*photograph.tiffPage, prepared.lost));
         } else {
             if (mOptions.compression.empty() && storage.compression != storedCompression(photograph, storage))
                 prepared.lost.push_back(std::string("its kind of compression (") +
@@ -134,7 +134,7 @@ void PhotographWriter::addEncoded(const Photograph& photograph, PreparedMetadata
     embedMetadata(metadata, encoded);
     // The library leaves out one that is damaged, or for other colours than the picture's.
     if (metadata.target == FileFormat::Png && !photograph.iccProfile.empty() && !hasPngChunk(encoded, "iCCP"))
-        metadata.lost.emplace_back("the ICC profile, which does not suit its colours or is damaged");
+        metadata.lost.emplace_back(kUnsuitedProfile);
     mFile = std::make_unique<TargetFile>(mTarget, mSource);
     mFile->write(encoded, mOptions.stop);
 }

@@ -30,6 +30,18 @@ ImageResource firstOf(ByteView list) {
     return resource;
 }
 
+// Some programs count the length of IPTC in fours, with zeros behind the last record.
+ByteView significant(const ImageResource& resource) {
+    ByteView data = resource.data;
+    while (resource.id == resource::Iptc && !data.empty() && data.back() == 0)
+        data = data.first(data.size() - 1);
+    return data;
+}
+
+bool sameData(const ImageResource& a, const ImageResource& b) {
+    return sameBytes(significant(a), significant(b));
+}
+
 Bytes thumbnailResource(const JpegSize& size, ByteView jpeg) {
     const auto width = static_cast<std::uint64_t>(size.width);
     const std::uint64_t row = (width * 24 + 31) / 32 * 4;
@@ -92,14 +104,37 @@ void appendResource(Bytes& list, std::uint16_t id, ByteView data) {
         list.push_back(0);
 }
 
+void addResources(Bytes& list, ByteView more) {
+    if (list.empty()) {
+        list = copyOf(more);
+        return;
+    }
+    const ImageResources added = imageResources(more);
+    Bytes missing;
+    {
+        const ImageResources there = imageResources(list);
+        const auto isThere = [&](const ImageResource& one) {
+            return std::any_of(there.list.begin(), there.list.end(), [&](const ImageResource& other) {
+                return other.id == one.id && sameData(other, one);
+            });
+        };
+        for (const ImageResource& one : added.list)
+            if (!isThere(one))
+                append(missing, one.whole);
+        if (!sameBytes(added.rest, there.rest))
+            append(missing, added.rest);
+        if (there.rest.empty())
+            padToEven(list);
+    }
+    append(list, missing);
+}
+
 bool sameResources(ByteView a, ByteView b) {
     const auto sorted = [](ByteView list) {
         std::vector<std::pair<std::uint16_t, std::string_view>> all;
         const ImageResources resources = imageResources(list);
         for (const ImageResource& one : resources.list) {
-            std::string_view text = asText(one.data);
-            if (one.id == resource::Iptc)
-                text = text.substr(0, text.find_last_not_of('\0') + 1);
+            const std::string_view text = asText(significant(one));
             if (one.id != resource::Iptc || !text.empty())
                 all.emplace_back(one.id, text);
         }

@@ -400,6 +400,11 @@ TEST(TiffPages, ThatAreAMaskStandForNoPicture) {
         EXPECT_THROW(checkTarget(page, folder / target, {}), PhotographError) << source << target;
     }
     EXPECT_THAT(rewrite(folder / "two.tif", folder / "t.tif"), IsEmpty());
+    std::vector<std::string> lost;
+    TiffPage page;
+    page.fields = {{TIFFTAG_IMAGEWIDTH, TIFF_SHORT, {9, 0}}, {TIFFTAG_EXIFIFD, TIFF_LONG, Bytes(4)}};
+    EXPECT_EQ(copiedFields(page, lost).size(), 1U);
+    EXPECT_THAT(lost, ElementsAre("what the tag 0x8769 leads to"));
 }
 
 TEST(TiffPages, OfSeparatePlanesKeepTheirColoursAsJpeg) {

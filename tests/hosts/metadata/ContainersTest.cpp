@@ -4,7 +4,7 @@
 #include "files/PhotographWriter.h"
 #include "files/TiffFields.h"
 #include "files/TiffWriter.h"
-#include "hosts/TestFiles.h"
+#include "hosts/ChangedFiles.h"
 #include "hosts/TestPhotograph.h"
 #include "metadata/ExtendedXmp.h"
 #include "metadata/ImageResources.h"
@@ -28,23 +28,6 @@ using testing::EndsWith;
 using testing::HasSubstr;
 using testing::IsEmpty;
 using testing::Not;
-
-// Puts `piece`, given as Python, behind the first `at` bytes of a file.
-std::string insert(const char* file, int at, const std::string& piece) {
-    return "python3 -c \"import struct, zlib\nb = open('" + std::string(file) + "', 'rb').read()\n" +
-           "def chunk(n, d): return struct.pack('>I', len(d)) + n + d + struct.pack('>I', zlib.crc32(n + "
-           "d))\n" +
-           "def segment(m, d): return bytes([255, m]) + struct.pack('>H', len(d) + 2) + d\n" + "open('" +
-           file + "', 'wb').write(b[:" + std::to_string(at) + "] + " + piece + " + b[" + std::to_string(at) +
-           ":])\"";
-}
-
-constexpr int kBehindPngHeader = 33;
-constexpr int kBehindJpegStart = 2;
-
-std::vector<std::string> convert(const TestFolder& folder, const char* from, const char* to) {
-    return writePhotograph(readPhotograph(folder / from), folder / to);
-}
 
 TEST(Containers, KeepTheirOwnDensityWhateverExifSays) {
     const TestFolder folder;
