@@ -29,15 +29,25 @@ void checkEdges(const DeclaredPicture& picture, const fs::path& path) {
         refuse(path, "is over 32767 pixels wide or high", "scale it down or cut it into parts");
 }
 
+// More than there is of anything stays that.
+std::uint64_t sum(std::uint64_t a, std::uint64_t b) {
+    return a > kUnlimited - std::min(b, kUnlimited) ? kUnlimited : a + b;
+}
+
+std::uint64_t product(std::uint64_t a, std::uint64_t b) {
+    return b != 0 && a > kUnlimited / b ? kUnlimited : a * b;
+}
+
 void checkMemory(const DeclaredPicture& picture, const fs::path& path, const ReadLimits& limits) {
     const auto pixels = static_cast<std::uint64_t>(picture.width * picture.height);
     const std::uint64_t letGo = picture.fileInView ? 0 : picture.fileBytes;
-    const std::uint64_t needed =
-        kBesideBytes + std::max(pixels * picture.sampleBytes + letGo,
-                                pixels * (limits.sampleCopies * picture.sampleBytes + limits.workBytes));
+    const std::uint64_t decoding = product(pixels, sum(picture.sampleBytes, picture.decoderBytes));
+    const std::uint64_t work =
+        product(pixels, sum(product(limits.sampleCopies, picture.sampleBytes), limits.workBytes));
+    const std::uint64_t needed = sum(kBesideBytes, std::max(sum(decoding, letGo), work));
     const std::uint64_t addresses = grantedAddresses();
     const std::uint64_t granted =
-        std::min(grantedMemory(), addresses - std::min(addresses, limits.mappedBytes)) + letGo;
+        sum(std::min(grantedMemory(), addresses - std::min(addresses, limits.mappedBytes)), letGo);
     if (needed > granted)
         throw MemoryError(path.string() + ": its " + sizeText(picture) + " need about " + amountOf(needed) +
                           " of memory, " + amountOf(granted) + " can be had; " + kMemoryAdvice);

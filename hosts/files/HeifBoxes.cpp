@@ -172,6 +172,7 @@ HeifCoding codingOf(ByteView file) {
         if (property.type == "hvcC" || property.type == "av1C") {
             coding.isAv1 = property.type == "av1C";
             coding.chroma = chromaOf(property);
+            coding.mostPixelsPerByte = coding.isAv1 ? bounds::kNone : bounds::kHevc;
         }
     for (const Box& property : chosen(all, propertiesOf(ipma, primary)))
         if (!isKnown(property))
