@@ -12,8 +12,8 @@ namespace {
 
 namespace fs = std::filesystem;
 
-std::string sizeText(const DeclaredPicture& picture) {
-    return std::to_string(picture.width) + " x " + std::to_string(picture.height) + " pixels";
+std::string sizeText(std::int64_t width, std::int64_t height) {
+    return std::to_string(width) + " x " + std::to_string(height) + " pixels";
 }
 
 std::string megapixels(double count) {
@@ -38,6 +38,12 @@ std::uint64_t product(std::uint64_t a, std::uint64_t b) {
     return b != 0 && a > kUnlimited / b ? kUnlimited : a * b;
 }
 
+// Addresses that are mapped later in any case do not count.
+std::uint64_t grantedBeside(const ReadLimits& limits) {
+    const std::uint64_t addresses = grantedAddresses();
+    return std::min(grantedMemory(), addresses - std::min(addresses, limits.mappedBytes));
+}
+
 void checkMemory(const DeclaredPicture& picture, const fs::path& path, const ReadLimits& limits) {
     const auto pixels = static_cast<std::uint64_t>(picture.width * picture.height);
     const std::uint64_t letGo = picture.fileInView ? 0 : picture.fileBytes;
@@ -45,12 +51,11 @@ void checkMemory(const DeclaredPicture& picture, const fs::path& path, const Rea
     const std::uint64_t work =
         product(pixels, sum(product(limits.sampleCopies, picture.sampleBytes), limits.workBytes));
     const std::uint64_t needed = sum(kBesideBytes, std::max(sum(decoding, letGo), work));
-    const std::uint64_t addresses = grantedAddresses();
-    const std::uint64_t granted =
-        sum(std::min(grantedMemory(), addresses - std::min(addresses, limits.mappedBytes)), letGo);
+    const std::uint64_t granted = sum(grantedBeside(limits), letGo);
     if (needed > granted)
-        throw MemoryError(path.string() + ": its " + sizeText(picture) + " need about " + amountOf(needed) +
-                          " of memory, " + amountOf(granted) + " can be had; " + kMemoryAdvice);
+        throw MemoryError(path.string() + ": its " + sizeText(picture.width, picture.height) +
+                          " need about " + amountOf(needed) + " of memory, " + amountOf(granted) +
+                          " can be had; " + kMemoryAdvice);
 }
 
 } // namespace
@@ -72,15 +77,24 @@ void checkPicture(const DeclaredPicture& picture, const fs::path& path, const Re
     const auto pixels = static_cast<double>(picture.width * picture.height);
     if (pixels / picture.mostPixelsPerByte > static_cast<double>(picture.fileBytes))
         refuse(path,
-               "is damaged or cut short: it claims " + sizeText(picture) + ", more than its " +
-                   std::to_string(picture.fileBytes) + " bytes can hold",
+               "is damaged or cut short: it claims " + sizeText(picture.width, picture.height) +
+                   ", more than its " + std::to_string(picture.fileBytes) + " bytes can hold",
                kCopyAgain);
     if (pixels > limits.megapixels * 1e6)
         refuse(path,
-               "has " + megapixels(pixels / 1e6) + " (" + sizeText(picture) + "), more than the " +
-                   megapixels(limits.megapixels) + " of --max-megapixels",
+               "has " + megapixels(pixels / 1e6) + " (" + sizeText(picture.width, picture.height) +
+                   "), more than the " + megapixels(limits.megapixels) + " of --max-megapixels",
                "raise it or scale the photograph down");
     checkMemory(picture, path, limits);
+}
+
+void checkEncoding(const Photograph& photograph, const std::string& kind, std::uint64_t bytes,
+                   const ReadLimits& limits) {
+    const std::uint64_t granted = grantedBeside(limits);
+    if (bytes > granted)
+        throw MemoryError(photograph.source.string() + ": to become a " + kind + " its " +
+                          sizeText(photograph.width, photograph.height) + " need about " + amountOf(bytes) +
+                          " of memory more, " + amountOf(granted) + " can be had; " + kMemoryAdvice);
 }
 
 } // namespace orvela

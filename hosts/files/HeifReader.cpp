@@ -140,8 +140,10 @@ Photograph receive(ChildProcess& child, ByteView file, const fs::path& path, con
         refuse(path, "has an unknown number of bits per sample", "save it with 8, 10 or 12 bits");
     photograph.depth = head.bits > 8 ? 16 : 8;
     photograph.model = head.hasAlpha != 0 ? ColorModel::RgbAlpha : ColorModel::Rgb;
+    // Measured with all kinds of chroma, HEVC and AV1.
+    const std::uint64_t decoderBytes = sampleBytes(photograph) * (photograph.depth == 16 ? 5 : 3);
     checkPicture({head.width, head.height, sampleBytes(photograph), file.size(),
-                  coding ? coding->mostPixelsPerByte : bounds::kNone, kDecoderBytesPerPixel},
+                  coding ? coding->mostPixelsPerByte : bounds::kNone, decoderBytes},
                  path, limits);
     photograph.encoding.format = FileFormat::Heif;
     photograph.encoding.bitDepth = head.bits;

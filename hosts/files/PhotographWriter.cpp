@@ -65,13 +65,15 @@ FileFormat writtenFormat(const fs::path& target) {
     return *format;
 }
 
-void checkTarget(const Photograph& photograph, const fs::path& target, const WriteOptions& options) {
+void checkTarget(const Photograph& photograph, const fs::path& target, const WriteOptions& options,
+                 const ReadLimits& limits) {
     const FileFormat format = targetFormat(photograph, target);
     if (photograph.copied && (photograph.pages == 1 || format != FileFormat::Tiff))
         throw PhotographError(photograph.source.string() +
                               ": holds a transparency mask where a picture is wanted; choose the photograph "
                               "that it belongs to, or a TIFF target for all its pages");
     checkTargetPath(target, photograph.source, options.overwrite);
+    checkEncoding(photograph, formatName(format), encoderBytes(photograph, format, target, options), limits);
 }
 
 PhotographWriter::PhotographWriter(fs::path target, const WriteOptions& options)

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "files/DeclaredPicture.h"
 #include "files/FileFormat.h"
 
 #include <atomic>
@@ -29,11 +30,12 @@ FileFormat writtenFormat(const std::filesystem::path& target);
 
 /// Whether writing the photograph there can succeed, as far as can be told without writing: the format can
 /// hold it, the target is not its source, not a folder and does not exist (unless it may be overwritten), and
-/// its folder exists and may be written to.
+/// its folder exists and may be written to, and the memory suffices to encode it.
 /// @throws PhotographError when the format is unknown or cannot hold the picture
+/// @throws MemoryError when the memory does not suffice
 /// @throws TargetError for everything else
 void checkTarget(const Photograph& photograph, const std::filesystem::path& target,
-                 const WriteOptions& options);
+                 const WriteOptions& options, const ReadLimits& limits);
 
 struct PreparedMetadata;
 class TargetFile;
