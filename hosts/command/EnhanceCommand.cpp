@@ -140,7 +140,7 @@ bool Batch::runPage(const Job& job, PhotographReader& reader, PhotographWriter& 
     // The temporary file of the first pages has to be removed, the log to be finished.
     mSignals.stay(writer.hasBegun() || mOptions.log);
     Photograph photograph = read(reader);
-    checkTarget(photograph, job.target, mOptions.writing, reading().limits);
+    checkTarget(photograph, job.target, mOptions.writing);
     if (!photograph.copied) {
         const std::optional<TraceOptions> trace = traceOf(job, photograph);
         std::optional<Photograph> result =

@@ -38,12 +38,6 @@ std::uint64_t product(std::uint64_t a, std::uint64_t b) {
     return b != 0 && a > kUnlimited / b ? kUnlimited : a * b;
 }
 
-// Addresses that are mapped later in any case do not count.
-std::uint64_t grantedBeside(const ReadLimits& limits) {
-    const std::uint64_t addresses = grantedAddresses();
-    return std::min(grantedMemory(), addresses - std::min(addresses, limits.mappedBytes));
-}
-
 void checkMemory(const DeclaredPicture& picture, const fs::path& path, const ReadLimits& limits) {
     const auto pixels = static_cast<std::uint64_t>(picture.width * picture.height);
     const std::uint64_t letGo = picture.fileInView ? 0 : picture.fileBytes;
@@ -51,7 +45,9 @@ void checkMemory(const DeclaredPicture& picture, const fs::path& path, const Rea
     const std::uint64_t work =
         product(pixels, sum(product(limits.sampleCopies, picture.sampleBytes), limits.workBytes));
     const std::uint64_t needed = sum(kBesideBytes, std::max(sum(decoding, letGo), work));
-    const std::uint64_t granted = sum(grantedBeside(limits), letGo);
+    const std::uint64_t addresses = grantedAddresses();
+    const std::uint64_t granted =
+        sum(std::min(grantedMemory(), addresses - std::min(addresses, limits.mappedBytes)), letGo);
     if (needed > granted)
         throw MemoryError(path.string() + ": its " + sizeText(picture.width, picture.height) +
                           " need about " + amountOf(needed) + " of memory, " + amountOf(granted) +
@@ -88,9 +84,8 @@ void checkPicture(const DeclaredPicture& picture, const fs::path& path, const Re
     checkMemory(picture, path, limits);
 }
 
-void checkEncoding(const Photograph& photograph, const std::string& kind, std::uint64_t bytes,
-                   const ReadLimits& limits) {
-    const std::uint64_t granted = grantedBeside(limits);
+void checkEncoding(const Photograph& photograph, const std::string& kind, std::uint64_t bytes) {
+    const std::uint64_t granted = obtainableMemory();
     if (bytes > granted)
         throw MemoryError(photograph.source.string() + ": to become a " + kind + " its " +
                           sizeText(photograph.width, photograph.height) + " need about " + amountOf(bytes) +

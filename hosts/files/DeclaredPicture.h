@@ -42,7 +42,6 @@ void checkPicture(const DeclaredPicture& picture, const std::filesystem::path& p
 
 /// Refuses a photograph before it is worked on when the memory does not suffice to encode the result, which
 /// takes so many bytes beside it. @param kind  of file, for the message @throws MemoryError
-void checkEncoding(const Photograph& photograph, const std::string& kind, std::uint64_t bytes,
-                   const ReadLimits& limits);
+void checkEncoding(const Photograph& photograph, const std::string& kind, std::uint64_t bytes);
 
 } // namespace orvela

@@ -191,7 +191,7 @@ std::uint64_t heifEncoderBytes(const Photograph& photograph, const fs::path& tar
     const bool av1 = isAv1(photograph, target);
     const std::uint64_t each = av1 ? 40 : 28;
     const std::uint64_t ahead = av1 ? std::min<std::uint64_t>(pixels * 20, 110'000'000) : 0;
-    return kBesideBytes + ahead + pixels * (photograph.depth == 16 ? each * 8 / 5 : each);
+    return ahead + pixels * (photograph.depth == 16 ? each * 8 / 5 : each);
 }
 
 Bytes encodeHeif(const Photograph& photograph, const fs::path& target, const WriteOptions& options,

@@ -98,13 +98,13 @@ std::uint64_t encoderBytes(const Photograph& photograph, FileFormat format, cons
     case FileFormat::Heif:
         return changed + heifEncoderBytes(photograph, target);
     case FileFormat::WebP:
-        return changed + kBesideBytes + pixels * (settingsFor(photograph, format, options).lossless ? 32 : 8);
+        return changed + pixels * (settingsFor(photograph, format, options).lossless ? 32 : 8);
     case FileFormat::Jpeg:
-        return changed + kBesideBytes + pixels * 8;
+        return changed + pixels * 8;
     case FileFormat::Png: // the bytes of the file are held several times, those of noise are many
-        return changed + kBesideBytes + samples * 4;
+        return changed + samples * 4;
     default:
-        return kBesideBytes; // a TIFF is written strip by strip
+        return changed; // a TIFF is written strip by strip
     }
 }
 

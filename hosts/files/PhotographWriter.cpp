@@ -1,6 +1,7 @@
 #include "files/PhotographWriter.h"
 
 #include "files/Conversion.h"
+#include "files/DeclaredPicture.h"
 #include "files/LibTiff.h"
 #include "files/PhotographEncoder.h"
 #include "files/TargetFile.h"
@@ -65,15 +66,14 @@ FileFormat writtenFormat(const fs::path& target) {
     return *format;
 }
 
-void checkTarget(const Photograph& photograph, const fs::path& target, const WriteOptions& options,
-                 const ReadLimits& limits) {
+void checkTarget(const Photograph& photograph, const fs::path& target, const WriteOptions& options) {
     const FileFormat format = targetFormat(photograph, target);
     if (photograph.copied && (photograph.pages == 1 || format != FileFormat::Tiff))
         throw PhotographError(photograph.source.string() +
                               ": holds a transparency mask where a picture is wanted; choose the photograph "
                               "that it belongs to, or a TIFF target for all its pages");
     checkTargetPath(target, photograph.source, options.overwrite);
-    checkEncoding(photograph, formatName(format), encoderBytes(photograph, format, target, options), limits);
+    checkEncoding(photograph, formatName(format), encoderBytes(photograph, format, target, options));
 }
 
 PhotographWriter::PhotographWriter(fs::path target, const WriteOptions& options)

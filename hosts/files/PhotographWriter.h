@@ -1,6 +1,5 @@
 #pragma once
 
-#include "files/DeclaredPicture.h"
 #include "files/FileFormat.h"
 
 #include <atomic>
@@ -35,7 +34,7 @@ FileFormat writtenFormat(const std::filesystem::path& target);
 /// @throws MemoryError when the memory does not suffice
 /// @throws TargetError for everything else
 void checkTarget(const Photograph& photograph, const std::filesystem::path& target,
-                 const WriteOptions& options, const ReadLimits& limits);
+                 const WriteOptions& options);
 
 struct PreparedMetadata;
 class TargetFile;

@@ -126,7 +126,7 @@ class Judge:
     def look(self, folder, files, status, lines, what):
         results = set(os.listdir(f"{folder}/out")) if os.path.isdir(f"{folder}/out") else set()
         for line in lines:
-            if len(line.encode()) > MAX_LINE or not any(name in line for name in files):
+            if len(line.encode()) > MAX_LINE or not any(os.path.splitext(name)[0] in line for name in files):
                 self.fail(f"{what}: a message is long or names no file: {line[:600]}")
         for name, data in files.items():
             path = f"{folder}/{name}"
@@ -135,7 +135,7 @@ class Judge:
                     self.fail(f"{what}: {name} was changed", path)
             base = os.path.splitext(name)[0]
             made = [each for each in results if os.path.splitext(each)[0] == base]
-            told = any(name in line for line in lines)
+            told = any(f"{base}." in line for line in lines) # itself or its result
             if not made and not told:
                 self.fail(f"{what}: {name} failed without a message", path)
             if len(made) > 1:

@@ -397,7 +397,7 @@ TEST(TiffPages, ThatAreAMaskStandForNoPicture) {
          {std::pair("m.tif", "t.tif"), {"m.tif", "t.jpg"}, {"two.tif", "t.png"}}) {
         PhotographReader reader(folder / source);
         const Photograph page = reader.next();
-        EXPECT_THROW(checkTarget(page, folder / target, {}, {}), PhotographError) << source << target;
+        EXPECT_THROW(checkTarget(page, folder / target, {}), PhotographError) << source << target;
     }
     EXPECT_THAT(rewrite(folder / "two.tif", folder / "t.tif"), IsEmpty());
 }
