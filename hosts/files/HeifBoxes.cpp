@@ -102,6 +102,7 @@ HeifCoding codingOf(ByteView file) {
             coding.isAv1 = property.type == "av1C";
             coding.chroma = chromaOf(property);
             coding.lossless = !coding.isAv1 && isLosslessHevc(property.content);
+            coding.mostPixelsPerByte = coding.isAv1 ? bounds::kNone : bounds::kHevc;
         }
     for (const HeifBox& property : chosen(all, propertiesOf(ipma, primary)))
         if (!isKnown(property))

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "files/FileFormat.h"
+#include "files/PixelBounds.h"
 
 namespace orvela {
 
@@ -10,6 +11,7 @@ struct HeifCoding {
     bool lossless = false;                    ///< known of HEVC only
     Chroma chroma = Chroma::Half;             ///< of a grey picture Half too
     std::uint64_t bytes = 0;                  ///< that it takes, without metadata and other pictures
+    double mostPixelsPerByte = bounds::kNone; ///< of the file
     std::vector<std::string> otherProperties; ///< of the primary picture, by their four letters: "clli"
 };
 

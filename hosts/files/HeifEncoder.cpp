@@ -40,12 +40,18 @@ struct Settings {
     std::optional<ColorCodes> colors;
 };
 
+bool isAv1(const Photograph& photograph, const fs::path& target) {
+    const Encoding& source = photograph.encoding;
+    const bool known = source.format == FileFormat::Heif;
+    return heifCodec(target).value_or(known ? source.compression : "hevc") == "av1";
+}
+
 Settings settingsFor(const Photograph& photograph, const fs::path& target, const WriteOptions& options,
                      const Metadata& metadata) {
     const Encoding& source = photograph.encoding;
     const bool known = source.format == FileFormat::Heif;
     Settings settings;
-    settings.isAv1 = heifCodec(target).value_or(known ? source.compression : "hevc") == "av1";
+    settings.isAv1 = isAv1(photograph, target);
     settings.orientation = ExifBlock(metadata.exif).orientation();
     settings.colors = metadata.colors;
     settings.chroma = known ? source.chroma : Chroma::Full;
@@ -183,6 +189,15 @@ int qualityFor(const Photograph& photograph, const Settings& settings) {
 }
 
 } // namespace
+
+std::uint64_t heifEncoderBytes(const Photograph& photograph, const fs::path& target) {
+    const auto pixels =
+        static_cast<std::uint64_t>(photograph.width) * static_cast<std::uint64_t>(photograph.height);
+    const bool av1 = isAv1(photograph, target);
+    const std::uint64_t each = av1 ? 40 : 28;
+    const std::uint64_t ahead = av1 ? std::min<std::uint64_t>(pixels * 20, 110'000'000) : 0;
+    return ahead + pixels * (photograph.depth == 16 ? each * 8 / 5 : each);
+}
 
 Bytes encodeHeif(const Photograph& photograph, const fs::path& target, const WriteOptions& options,
                  const Metadata& metadata) {

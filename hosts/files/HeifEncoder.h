@@ -17,4 +17,7 @@ namespace orvela {
 Bytes encodeHeif(const Photograph& photograph, const std::filesystem::path& target,
                  const WriteOptions& options, const Metadata& metadata);
 
+/// Bytes of memory that encoding takes at the most beside the photograph, in all processes.
+std::uint64_t heifEncoderBytes(const Photograph& photograph, const std::filesystem::path& target);
+
 } // namespace orvela

@@ -16,13 +16,14 @@
 #include <webp/decode.h>
 
 #include <algorithm>
-#include <limits>
 
 namespace orvela {
 
 namespace {
 
 namespace fs = std::filesystem;
+
+constexpr std::uint64_t kHeadBytes = 512; // that tell the kind of a file
 
 VipsImage* load(const Bytes& file, FileFormat format) {
     void* data = const_cast<std::uint8_t*>(file.data());
@@ -51,8 +52,9 @@ VipsImage* load(const Bytes& file, FileFormat format) {
 void checkWebp(const fs::path& path, const Bytes& file, const ReadLimits& limits) {
     WebPBitstreamFeatures features{};
     if (WebPGetFeatures(file.data(), file.size(), &features) == VP8_STATUS_OK)
-        checkPicture({features.width, features.height, features.has_alpha != 0 ? 4U : 3U, file.size()}, path,
-                     limits);
+        checkPicture({features.width, features.height, features.has_alpha != 0 ? 4U : 3U, file.size(),
+                      bounds::ofWebp(file)},
+                     path, limits);
 }
 
 VipsHandle open(const fs::path& path, const Bytes& file, FileFormat format, const ReadLimits& limits) {
@@ -87,11 +89,11 @@ void noteExpansion(Photograph& photograph, const Bytes& png) {
         photograph.notes.emplace_back(kBitsNote);
 }
 
-// Deflate makes at most 1032 bytes of one; the 25th byte tells the bits of a sample.
+// The 25th byte tells the bits of a sample. That of a WebP was looked at before.
 double mostPixelsPerByte(const Bytes& file, FileFormat format) {
     if (format == FileFormat::Png && file.size() > 24 && file[24] > 0)
-        return 1032.0 * 8 / file[24];
-    return std::numeric_limits<double>::infinity();
+        return bounds::kDeflate * 8 / file[24];
+    return bounds::kNone;
 }
 
 Photograph decodeFile(const Bytes& file, FileFormat format, const fs::path& path, const ReadLimits& limits) {
@@ -184,7 +186,7 @@ PhotographReader::PhotographReader(const fs::path& path, const ReadOptions& opti
     : mOptions(options), mFile(std::make_unique<SourceFile>(path)) {
     if (mFile->size() == 0)
         refuse(path, "the file is empty", kCopyAgain);
-    const Bytes head = mFile->read(0, std::min<std::uint64_t>(mFile->size(), 16));
+    const Bytes head = mFile->read(0, std::min(mFile->size(), kHeadBytes));
     if (isCameraRaw(head))
         refuseCameraRaw(path);
     const std::optional<FileFormat> format = formatOfContent(head);

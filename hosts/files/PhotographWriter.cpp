@@ -1,6 +1,7 @@
 #include "files/PhotographWriter.h"
 
 #include "files/Conversion.h"
+#include "files/DeclaredPicture.h"
 #include "files/LibTiff.h"
 #include "files/PhotographEncoder.h"
 #include "files/TargetFile.h"
@@ -72,6 +73,7 @@ void checkTarget(const Photograph& photograph, const fs::path& target, const Wri
                               ": holds a transparency mask where a picture is wanted; choose the photograph "
                               "that it belongs to, or a TIFF target for all its pages");
     checkTargetPath(target, photograph.source, options.overwrite);
+    checkEncoding(photograph, formatName(format), encoderBytes(photograph, format, target, options));
 }
 
 PhotographWriter::PhotographWriter(fs::path target, const WriteOptions& options)

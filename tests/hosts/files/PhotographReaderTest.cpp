@@ -72,6 +72,26 @@ TEST(PhotographReader, ReadsBitmapsAsGreyAndTheFirstPageOfSeveral) {
     EXPECT_EQ(first.height, 3);
 }
 
+// The first brand is a matter of who wrote the file; each that a reader may go by as well counts.
+TEST(PhotographReader, KnowsHeifByAnyOfItsBrands) {
+    const TestFolder folder;
+    folder.run("convert $S/coffee.png -resize 64x48! p.png && vips heifsave p.png heic && "
+               "vips heifsave p.png avif.avif --compression av1 --effort 0 && mv avif.avif avif");
+    for (const char* kind : {"heic", "avif"}) {
+        const std::string whole = folder.text(kind);
+        for (const char* first : {"miaf", "mif1", "msf1", "isom"}) {
+            folder.put("s.bin", std::string(whole).replace(8, 4, first));
+            EXPECT_EQ(readPhotograph(folder / "s.bin").width, 64) << kind << first;
+        }
+        const std::size_t end = static_cast<unsigned char>(whole[3]);
+        std::string film = std::string(whole).replace(8, 4, "isom");
+        for (std::size_t at = 16; at < end; at += 4)
+            film.replace(at, 4, "mp41");
+        folder.put("s.bin", film);
+        EXPECT_THAT(refusal(folder / "s.bin"), testing::HasSubstr("is not a picture of a known kind"));
+    }
+}
+
 // 10 bits of HEIF reach full scale.
 TEST(PhotographReader, TellsTheEncoding) {
     const TestFolder folder;

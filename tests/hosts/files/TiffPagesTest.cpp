@@ -466,6 +466,29 @@ END
                 ElementsAre(HasSubstr("the other pages")));
 }
 
+// Nobody walks along all pages for each of them: what is read of a file grows as its pages do.
+TEST(TiffPages, AreReadOnceEach) {
+    const TestFolder folder;
+    const Page page = {8, 8, 8, 1, PHOTOMETRIC_MINISBLACK};
+    const auto read = [] { // bytes by this process
+        std::ifstream file("/proc/self/io");
+        std::string name;
+        double bytes = 0;
+        file >> name >> bytes;
+        return bytes;
+    };
+    std::map<int, double> taken;
+    for (const int pages : {10, 50, 250}) {
+        writeTiff(folder / "s.tif", "wb", std::vector<Page>(static_cast<std::size_t>(pages), page));
+        const double before = read();
+        PhotographReader reader(folder / "s.tif");
+        for (int i = 0; i < pages; ++i)
+            EXPECT_EQ(reader.next().samples[1], (1 + i * 31) % 251);
+        taken[pages] = read() - before;
+    }
+    EXPECT_LT(taken[250] - taken[50], 5.5 * (taken[50] - taken[10]));
+}
+
 #if !defined(__SANITIZE_ADDRESS__) && !defined(__SANITIZE_THREAD__) // they keep what is freed
 // Eight pages of twelve megabytes take no more than one, but for what the heap keeps of earlier ones.
 TEST(TiffPages, TakeTheMemoryOfOne) {
