@@ -49,7 +49,7 @@ std::vector<std::string> commandsWith(const CLI::App& app, const std::string& op
 
 // The library's texts begin with the name of the option.
 std::string valueRefusal(const CLI::App& app, const CLI::ParseError& error) {
-    const std::string text = error.what();
+    std::string text = error.what();
     const std::string name = text.substr(0, text.find(':'));
     if (dynamic_cast<const CLI::ArgumentMismatch*>(&error)) {
         const CLI::Option* option = app.get_option_no_throw(name);

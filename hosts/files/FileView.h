@@ -31,7 +31,9 @@ public:
     bool lacksBytes() const { return mLacksBytes != 0; }
 
 private:
-    static void fill(int signal, siginfo_t* info, void*);
+    static void onMissingPage(int signal, siginfo_t* info, void*);
+    /// Turns a missing page and those behind it into pages of zeros; false where it is none of the file's.
+    bool fillFrom(const void* missing);
 
     void* mStart;
     std::size_t mSize;
