@@ -5,6 +5,7 @@
 
 #include <cerrno>
 #include <new>
+#include <system_error>
 
 namespace orvela {
 
@@ -41,8 +42,11 @@ bool FileView::fillFrom(const void* missing) {
 
 FileView::FileView(int handle, std::size_t size)
     : mStart(::mmap(nullptr, size, PROT_READ, MAP_PRIVATE, handle, 0)), mSize(size) {
-    if (mStart == MAP_FAILED)
+    if (mStart != MAP_FAILED)
+        return;
+    if (errno == ENOMEM || errno == EAGAIN)
         throw std::bad_alloc();
+    throw std::system_error(errno, std::generic_category());
 }
 
 FileView::~FileView() {

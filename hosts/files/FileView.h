@@ -9,7 +9,7 @@ namespace orvela {
 /// A file in the address space. Memory is taken by what is looked at only, and can be taken back.
 class FileView {
 public:
-    /// @throws std::bad_alloc
+    /// @throws std::bad_alloc, and std::system_error where the file system has no views
     FileView(int handle, std::size_t size);
     ~FileView();
     FileView(const FileView&) = delete;

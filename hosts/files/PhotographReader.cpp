@@ -41,7 +41,7 @@ VipsImage* load(const Bytes& file, FileFormat format) {
         break;
     case FileFormat::Jpeg: // these have readers of their own
     case FileFormat::Heif:
-    case FileFormat::Tiff: // see loadPage
+    case FileFormat::Tiff: // see TiffReader
     case FileFormat::Psd:  // see PsdFile
         break;
     }

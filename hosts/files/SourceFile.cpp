@@ -8,6 +8,7 @@
 
 #include <cerrno>
 #include <cstring>
+#include <system_error>
 
 namespace orvela {
 
@@ -73,8 +74,12 @@ Bytes SourceFile::read(std::uint64_t at, std::uint64_t size) const {
 }
 
 FileView& SourceFile::view() {
-    if (!mView)
-        mView = std::make_unique<FileView>(mHandle, mSize);
+    try {
+        if (!mView)
+            mView = std::make_unique<FileView>(mHandle, mSize);
+    } catch (const std::system_error& error) {
+        refuse(mPath, "cannot be read in place (" + error.code().message() + ")", "copy it to another disk");
+    }
     return *mView;
 }
 

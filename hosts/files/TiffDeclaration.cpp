@@ -81,7 +81,9 @@ DeclaredPicture declaredPicture(const TiffFile& tiff, const TiffPage& page, int 
     picture.height = static_cast<std::int64_t>(page.number(TIFFTAG_IMAGELENGTH, 0));
     picture.sampleBytes = palette ? 3 : samples * (bits > 8 ? 2 : 1);
     picture.fileBytes = fileBytes;
-    picture.mostPixelsPerByte = mostPixelsPerByte(tiff, page, index, bits);
+    // Colours of YCbCr may be stored for fewer pixels than their brightness.
+    const bool thinned = page.number(TIFFTAG_PHOTOMETRIC, PHOTOMETRIC_MINISBLACK) == PHOTOMETRIC_YCBCR;
+    picture.mostPixelsPerByte = mostPixelsPerByte(tiff, page, index, thinned ? bits : samples * bits);
     picture.fileInView = true;
     return picture;
 }

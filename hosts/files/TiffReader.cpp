@@ -54,6 +54,18 @@ Photograph decodeMask(const TiffFile& tiff, TiffPage& page, int index) {
     return photograph;
 }
 
+// The library tells what stopped the stream in its own words, and lazily: while samples are taken.
+Photograph takePage(const VipsStream& stream, const fs::path& name, VipsImage* image) {
+    Photograph photograph = describeImage(name, image);
+    try {
+        takeSamples(photograph, name, image);
+    } catch (...) {
+        stream.check();
+        throw;
+    }
+    return photograph;
+}
+
 Photograph decodeSamples(VipsStream& stream, const fs::path& name) {
     startVips();
     vips_error_clear();
@@ -64,9 +76,7 @@ Photograph decodeSamples(VipsStream& stream, const fs::path& name) {
     stream.check();
     if (!image)
         refuseUnread(name, takeVipsError());
-    Photograph photograph = describeImage(name, image.get());
-    takeSamples(photograph, name, image.get());
-    return photograph;
+    return takePage(stream, name, image.get());
 }
 
 Photograph decodeWithVips(const TiffFile& tiff, const TiffPage& page, int index) {

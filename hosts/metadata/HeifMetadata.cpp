@@ -133,7 +133,7 @@ void nameStrayItems(ByteView meta, Metadata& metadata) {
             nameOnce(metadata.unheld, "a HEIF item of the kind " + std::string(item.type));
 }
 
-bool holdsFilmTrack(ByteView moov) {
+bool holdsFilmTrack(ByteView moov) try {
     for (const HeifBox& track : heifBoxes(moov)) {
         if (track.type != "trak")
             continue;
@@ -142,6 +142,8 @@ bool holdsFilmTrack(ByteView moov) {
             return true;
     }
     return false;
+} catch (const DamagedBytes&) {
+    return true; // one that is not whole
 }
 
 // Returns what is no box of this picture any more: nothing, a film with boxes of its own, anything.
@@ -150,19 +152,21 @@ ByteView nameBoxes(ByteView file, Metadata& metadata) {
     Cursor cursor(file);
     while (!cursor.isAtEnd()) {
         const ByteView rest = cursor.rest();
+        HeifBox box;
         try {
-            const HeifBox box = nextHeifBox(cursor);
-            const bool named =
-                std::all_of(box.type.begin(), box.type.end(), [](char c) { return c >= ' ' && c <= '~'; });
-            if (!named || (box.type == "ftyp" && rest.size() < file.size()))
-                return rest;
-            if (box.type == "mpvd" || (box.type == "moov" && holdsFilmTrack(box.content)))
-                nameOnce(metadata.unheld, "the film beside the picture");
-            else if (box.type != "moov" && !isAmong(known, box.type))
-                nameOnce(metadata.unheld, "the HEIF box " + std::string(box.type));
+            box = nextHeifBox(cursor);
         } catch (const DamagedBytes&) {
-            return rest;
+            const bool cutShort = rest.size() >= 8 && isAmong(known, asText(rest.subspan(4, 4)));
+            return cutShort ? ByteView() : rest; // of the picture itself, which its reader judges
         }
+        const bool named =
+            std::all_of(box.type.begin(), box.type.end(), [](char c) { return c >= ' ' && c <= '~'; });
+        if (!named || (box.type == "ftyp" && rest.size() < file.size()))
+            return rest;
+        if (box.type == "mpvd" || (box.type == "moov" && holdsFilmTrack(box.content)))
+            nameOnce(metadata.unheld, "the film beside the picture");
+        else if (box.type != "moov" && !isAmong(known, box.type))
+            nameOnce(metadata.unheld, "the HEIF box " + std::string(box.type));
     }
     return {};
 }
@@ -171,7 +175,7 @@ void nameWhatIsBeside(ByteView file, Metadata& metadata) {
     try {
         nameStrayItems(heifMeta(file), metadata);
     } catch (const DamagedBytes&) {
-        nameOnce(metadata.damaged, "the list of its HEIF items");
+        nameOnce(metadata.unheld, "what its unreadable list of items tells of");
     }
     nameRest(nameBoxes(file, metadata), metadata);
 }

@@ -1,6 +1,8 @@
 #include "files/SourceFile.h"
 
 #include "files/Photograph.h"
+#include "files/TiffFile.h"
+#include "files/TiffReader.h"
 #include "hosts/TestFiles.h"
 
 #include <gmock/gmock.h>
@@ -60,6 +62,36 @@ TEST_F(SourceFileView, TellsThatTheFileWasWrittenAnew) {
     };
     EXPECT_THROW(file.look(rewrite), PhotographError);
     EXPECT_THROW(file.look([](ByteView) { return 0; }), PhotographError); // the view stays without its bytes
+}
+
+// Of a page the samples come last, in pieces, and the library tells only that it could not read.
+TEST_F(SourceFileView, TellsThatTheFileBecameShorterWhileSamplesWereRead) {
+    constexpr std::uint64_t edge = 2000;
+    std::string tiff("II*\0\x8\0\0\0\x9\0", 10);
+    const auto put = [&tiff](std::uint64_t value, int bytes) {
+        for (int i = 0; i < bytes; ++i)
+            tiff += static_cast<char>(value >> 8 * i);
+    };
+    constexpr std::pair<int, std::uint64_t> fields[] = {{256, edge}, {257, edge}, {258, 8},
+                                                        {259, 1},    {262, 1},    {273, 200},
+                                                        {277, 1},    {278, edge}, {279, edge * edge}};
+    for (const auto& [tag, value] : fields) {
+        put(static_cast<std::uint64_t>(tag), 2);
+        put(4, 2);
+        put(1, 4);
+        put(value, 4);
+    }
+    tiff.resize(200 + edge * edge);
+    mFolder.put("s.tif", tiff);
+    SourceFile file(path());
+    const TiffFile parsed(file);
+    fs::resize_file(path(), 1'000'000);
+    try {
+        readTiffPage(file, parsed, 0, {});
+        FAIL() << "There were not enough bytes.";
+    } catch (const PhotographError& error) {
+        EXPECT_THAT(error.what(), testing::HasSubstr("became shorter while it was read"));
+    }
 }
 
 // Of the cause that parsing tells and that of the file, the latter.

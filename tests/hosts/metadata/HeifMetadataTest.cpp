@@ -39,6 +39,8 @@ TEST(HeifMetadata, NamesBoxesBehindThePicture) {
                 ElementsAre("the film behind the picture"));
     EXPECT_THAT(named("no box at all"), ElementsAre("13 bytes behind the picture"));
     EXPECT_THAT(named(std::string(16, '\0')), IsEmpty());
+    EXPECT_THAT(named("\0\0\1\0mdatof the picture"s), IsEmpty()); // cut short
+    EXPECT_THAT(named("\0\0\0\x10moov\0\0\0\x50trak"s), ElementsAre("the film beside the picture"));
     folder.put("s.heic", plain + "\0\0\0\x0C"s + "mpvdfilm");
     EXPECT_THAT(convert(folder, "s.heic", "t.jpg"),
                 ElementsAre(EndsWith("hold: the film beside the picture")));
