@@ -150,10 +150,13 @@ std::optional<Density> resourceDensity(ByteView list) {
     const ImageResource* found = resources.find(resource::ResolutionInfo);
     if (found == nullptr || found->data.size() < 16)
         return std::nullopt;
-    // 16.16 pixels per inch, whatever unit is shown.
+    // 16.16 pixels per inch, whatever unit is shown. Some writers put the least there is where they know
+    // none.
     const auto value = [&](std::size_t at) {
         const auto fixed = static_cast<std::uint32_t>(number(found->data, at, 4, ByteOrder::Big));
-        return fixed % 65536 == 0 ? Rational{fixed / 65536, 1} : Rational{fixed, 65536};
+        return fixed <= 1           ? Rational{0, 1}
+               : fixed % 65536 == 0 ? Rational{fixed / 65536, 1}
+                                    : Rational{fixed, 65536};
     };
     const Density density{value(0), value(8), DensityUnit::Inch};
     return density.isMeant() ? std::optional(density) : std::nullopt;

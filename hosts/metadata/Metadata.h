@@ -2,7 +2,6 @@
 
 #include "metadata/Bytes.h"
 
-#include <algorithm>
 #include <optional>
 #include <string>
 #include <vector>
@@ -35,11 +34,8 @@ struct Density {
         constexpr double lengths[] = {0, 25.4, 10, 1000};
         return lengths[static_cast<int>(unit)];
     }
-    /// Whether it says anything: some writers put zeros, or next to none. At least a pixel per metre.
-    bool isMeant() const {
-        const double least = millimetres() / 1000;
-        return std::min(x.value(), y.value()) >= least && x.value() > 0 && y.value() > 0;
-    }
+    /// Whether it says anything: some writers put zeros.
+    bool isMeant() const { return x.value() > 0 && y.value() > 0; }
     bool operator==(const Density&) const = default;
 };
 

@@ -74,6 +74,11 @@ TEST(Containers, KeepTheirOwnDensityWhateverExifSays) {
     }
     EXPECT_NEAR(readPhotograph(folder / "e.jpg").xResolution, 300 / 25.4, 1e-9);
     EXPECT_NEAR(readPhotograph(folder / "h.jpg").xResolution, 240 / 25.4, 1e-9);
+    // Of the scan of a wall map, say.
+    folder.run("exiftool -q -overwrite_original -XResolution=0.005 -YResolution=0.005 s.tif");
+    EXPECT_THAT(convert(folder, "s.tif", "t.jpg"), IsEmpty());
+    EXPECT_EQ(folder.output("exiftool -s3 -IFD0:XResolution -IFD0:ResolutionUnit t.jpg | xargs"),
+              "0.005 cm\n");
     // Without a unit it is the shape of the pixels, for which not every format has a place.
     folder.run("exiftool -q -overwrite_original -JFIF:YResolution=2 n.jpg");
     EXPECT_THAT(convert(folder, "n.jpg", "t.png"), IsEmpty());
