@@ -74,6 +74,21 @@ ByteView behindJpeg(ByteView file) {
     return walkScans(file, [](int, ByteView) {});
 }
 
+std::size_t jpegLength(ByteView bytes) {
+    bool scanned = false;
+    for (std::size_t at = 2; at + 2 <= bytes.size();) {
+        const int marker = bytes[at] == 0xFF ? bytes[at + 1] : 0;
+        if (marker == kEnd)
+            return scanned ? at + 2 : 0;
+        if (startsWith(behind(bytes, at), "\xFF\xD8\xFF"))
+            return 0;
+        scanned = scanned || marker == kScan;
+        const bool skips = hasLength(marker) && at + 4 <= bytes.size();
+        at += skips ? 2 + number(bytes, at + 2, 2, ByteOrder::Big) : 1;
+    }
+    return 0;
+}
+
 std::optional<JpegSize> jpegSize(ByteView file) {
     if (!startsWith(file, "\xFF\xD8"))
         return std::nullopt;

@@ -31,6 +31,10 @@ std::vector<JpegSegment> laterJpegSegments(ByteView file);
 /// What stands behind the end marker.
 ByteView behindJpeg(ByteView file);
 
+/// Bytes of the JPEG that begins there, with its end marker; 0 when another one begins before that, or none
+/// of its parts is a scan.
+std::size_t jpegLength(ByteView bytes);
+
 /// Edges of the picture; none when the bytes are no JPEG with a frame.
 std::optional<JpegSize> jpegSize(ByteView file);
 

@@ -82,11 +82,12 @@ struct Metadata {
     std::vector<Text> texts;        ///< of a PNG; a JPEG's comments by the keyword Comment
     std::optional<Density> density; ///< what the container itself says; Exif's never overrules it
     std::optional<ColorCodes> colors;
-    Bytes iccProfile;                ///< of a PNG that holds it as a text; every other goes with the picture
-    int heifThumbnail = 0;           ///< longer edge of the thumbnail beside a HEIF's picture; 0 without one
-    std::vector<Chunk> chunks;       ///< ancillary chunks of a PNG without neutral meaning, and its texts
-    std::vector<Chunk> segments;     ///< APPn segments of a JPEG without neutral meaning
-    std::vector<std::string> unheld; ///< what cannot travel whatever the target: "the gain map"
+    Bytes iccProfile;            ///< of a PNG that holds it as a text; every other goes with the picture
+    int heifThumbnail = 0;       ///< longer edge of the thumbnail beside a HEIF's picture; 0 without one
+    std::vector<Chunk> chunks;   ///< ancillary chunks of a PNG without neutral meaning, and its texts
+    std::vector<Chunk> segments; ///< APPn segments of a JPEG without neutral meaning
+    std::vector<std::string> unreadTexts; ///< of a PNG, which travel in chunks only: "Comment (damaged)"
+    std::vector<std::string> unheld;      ///< what cannot travel whatever the target: "the gain map"
     std::vector<std::string>
         damaged; ///< what could not be understood and travels as it stands: "the Exif data"
 };

@@ -10,6 +10,7 @@
 #include "metadata/TagLibrary.h"
 #include "metadata/Utf8.h"
 #include "metadata/WebPMetadata.h"
+#include "metadata/XmpThumbnails.h"
 
 #include <algorithm>
 #include <iterator>
@@ -33,30 +34,6 @@ std::string joined(const Names& names, const char* between) {
         text += (i == 0 ? "" : between) + names[i];
     }
     return text;
-}
-
-// The packet without what stands between these tags.
-std::string without(std::string_view open, std::string_view close, std::string_view packet) {
-    std::string kept;
-    std::size_t from = 0;
-    for (std::size_t at = packet.find(open); at != std::string_view::npos; at = packet.find(open, from)) {
-        const std::size_t last = packet.find(close, at);
-        if (last == std::string_view::npos)
-            break;
-        kept += packet.substr(from, at - from);
-        from = last + close.size();
-    }
-    return kept.append(packet.substr(from));
-}
-
-// @return whether the packet showed the picture as it was
-bool eraseThumbnails(Bytes& packet) {
-    const std::string kept = without("<xmp:Thumbnails", "</xmp:Thumbnails>",
-                                     without("<xap:Thumbnails", "</xap:Thumbnails>", asText(packet)));
-    if (kept.size() == packet.size())
-        return false;
-    packet = copyOf(asBytes(kept));
-    return true;
 }
 
 /// Makes the metadata of one format ready for another.
@@ -138,7 +115,10 @@ void Preparation::dropXmpThumbnails() {
     std::optional<Bytes> whole = joinXmp(metadata().xmp, metadata().segments);
     const bool parted = whole.has_value();
     Bytes packet = whole ? std::move(*whole) : metadata().xmp;
-    if (!eraseThumbnails(packet))
+    const ThumbnailsOfXmp thumbnails = takeThumbnails(packet);
+    if (thumbnails == ThumbnailsOfXmp::Kept)
+        lose("the thumbnail in the XMP data");
+    if (thumbnails != ThumbnailsOfXmp::Taken)
         return;
     lose("the thumbnail");
     metadata().xmp = std::move(packet);
@@ -197,7 +177,9 @@ void Preparation::moveTexts() {
     metadata().texts.clear();
     for (const Text& text : mSource.texts)
         if (!moveText(text))
-            names.push_back(text.keyword);
+            names.push_back(shownKeyword(text.keyword));
+    names.insert(names.end(), mSource.unreadTexts.begin(), mSource.unreadTexts.end());
+    std::erase(metadata().damaged, kDamagedText); // none is carried over
     if (mSource.format == FileFormat::Png && !names.empty())
         lose("PNG texts " + joined(names, ", "));
     else if (!names.empty())

@@ -23,27 +23,43 @@ Range thumbnailOf(const TiffView& view, const TagDirectory& directory) {
     return {view.value(*at), view.value(*length)};
 }
 
-// What is no preview of the maker's: everything that the directories tell of but the note.
-std::vector<Range> otherRanges(const TiffView& view) {
+struct Layout {
+    std::vector<Range> notes;
+    std::vector<Range> others; ///< no preview of the maker's: all else that the directories tell of
+};
+
+Layout layoutOf(const TiffView& view) {
     std::vector<TagDirectory> directories = view.chain(kDirectories).list;
     for (auto& [pointer, directory] : exifDirectories(view, view.first()).list)
         directories.push_back(std::move(directory));
-    std::vector<Range> ranges = {{0, view.headerSize()}};
+    Layout layout{{}, {{0, view.headerSize()}}};
     for (const TagDirectory& directory : directories) {
-        ranges.push_back({directory.place, directory.size});
-        ranges.push_back(thumbnailOf(view, directory));
+        layout.others.push_back({directory.place, directory.size});
+        layout.others.push_back(thumbnailOf(view, directory));
         for (const TagEntry& entry : directory.entries)
-            if (entry.tag != tiff::MakerNote)
-                ranges.push_back({entry.valueAt, entry.value.size()});
+            (entry.tag == tiff::MakerNote ? layout.notes : layout.others)
+                .push_back({entry.valueAt, entry.value.size()});
     }
-    return ranges;
+    return layout;
 }
 
-// Bytes of the JPEG that begins there; 0 when it has no frame or no end.
-std::size_t jpegLength(ByteView bytes) {
-    const std::size_t length = bytes.size() - behindJpeg(bytes).size();
-    const bool ends = length >= 4 && bytes[length - 2] == 0xFF && bytes[length - 1] == 0xD9;
-    return ends && jpegSize(bytes) ? length : 0;
+// Where the range ends that the place is in; 0 when it is in none.
+std::size_t endAround(std::size_t at, const std::vector<Range>& ranges) {
+    std::size_t end = 0;
+    for (const Range& range : ranges)
+        if (range.at <= at && at < range.at + range.size)
+            end = std::max(end, range.at + range.size);
+    return end;
+}
+
+// A preview ends within its note, and before anything else begins.
+std::size_t furthestEnd(std::size_t at, const Layout& layout, std::size_t end) {
+    if (const std::size_t note = endAround(at, layout.notes))
+        end = std::min(end, note);
+    for (const Range& other : layout.others)
+        if (other.size > 0 && other.at > at)
+            end = std::min(end, other.at);
+    return end;
 }
 
 bool renew(Bytes& block, const Range& place, const ThumbnailMaker& make, bool turned) {
@@ -61,20 +77,22 @@ bool renew(Bytes& block, const Range& place, const ThumbnailMaker& make, bool tu
 bool renewNotePreviews(Bytes& block, const ThumbnailMaker& make, bool turned) {
     if (ExifBlock(block).isDamaged() || block.empty())
         return true;
-    const std::vector<Range> others = otherRanges(TiffView(block));
-    const auto isFree = [&](const Range& place) {
-        return std::none_of(others.begin(), others.end(), [&](const Range& other) {
-            return place.at < other.at + other.size && other.at < place.at + place.size;
-        });
-    };
+    const Layout layout = layoutOf(TiffView(block));
     bool all = true;
     int places = 0;
     const auto next = [&](std::size_t from) { return asText(block).find("\xFF\xD8\xFF", from); };
     for (std::size_t at = next(0); at != std::string_view::npos && places < kMostPlaces; ++places) {
-        const Range place{at, jpegLength(ByteView(block).subspan(at))};
-        if (place.size > 0 && isFree(place))
-            all = renew(block, place, make, turned) && all;
-        at = next(at + std::max<std::size_t>(1, place.size));
+        if (const std::size_t other = endAround(at, layout.others)) {
+            at = next(other);
+            continue;
+        }
+        const ByteView room = slice(block, at, furthestEnd(at, layout, block.size()) - at);
+        const std::size_t size = jpegSize(room) ? jpegLength(room) : 0;
+        if (size > 0)
+            all = renew(block, {at, size}, make, turned) && all;
+        else if (jpegSize(room))
+            all = false; // what belongs to it cannot be told from what follows
+        at = next(at + std::max<std::size_t>(1, size));
     }
     return all;
 }

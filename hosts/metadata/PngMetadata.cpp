@@ -2,6 +2,7 @@
 
 #include "metadata/ImageResources.h"
 #include "metadata/PngTexts.h"
+#include "metadata/Utf8.h"
 
 #include <algorithm>
 #include <array>
@@ -36,18 +37,25 @@ bool isExif(ByteView block) {
     return startsWith(block, "II*\0"sv) || startsWith(block, "MM\0*"sv);
 }
 
+bool isResources(ByteView profile) {
+    constexpr auto iptcRecord = "\x1C"sv;
+    return startsWith(profile, "8BIM") || startsWith(profile, iptcRecord);
+}
+
 // Whether the text is a block in disguise.
 bool takeProfile(const Text& text, Metadata& metadata) {
     if (!text.keyword.starts_with(kProfileKeyword))
         return false;
     const std::string kind = text.keyword.substr(kProfileKeyword.size());
     const Bytes profile = rawProfile(text.text);
+    if (profile.empty())
+        return false;
     constexpr auto xmp = "http://ns.adobe.com/xap/1.0/\0"sv;
     if ((kind == "exif" || kind == "APP1") && isExif(profile))
         takeExif(profile, metadata);
     else if (kind == "xmp" || (kind == "APP1" && startsWith(profile, xmp)))
         takeXmp(kind == "xmp" ? ByteView(profile) : behind(profile, xmp.size()), metadata);
-    else if (kind == "iptc" || kind == "8bim")
+    else if ((kind == "iptc" || kind == "8bim") && isResources(profile))
         takeResources(profile, metadata);
     else if (kind == "icc" || kind == "icm")
         takeOnce(metadata.iccProfile, profile, "a second ICC profile", metadata);
@@ -56,7 +64,11 @@ bool takeProfile(const Text& text, Metadata& metadata) {
     return true;
 }
 
-void takeText(const PngChunk& chunk, std::size_t& room, Metadata& metadata) {
+std::string keywordOf(const PngChunk& chunk) {
+    return shownKeyword(latinToUtf8(asBytes(pngKeyword(chunk))));
+}
+
+void takeText(const PngChunk& chunk, TextRoom& room, Metadata& metadata) {
     try {
         Text text = pngText(chunk, room);
         if (text.keyword == kXmpKeyword) {
@@ -67,7 +79,11 @@ void takeText(const PngChunk& chunk, std::size_t& room, Metadata& metadata) {
             return;
         metadata.texts.push_back(std::move(text));
     } catch (const DamagedBytes&) {
-        nameOnce(metadata.damaged, "a PNG text");
+        nameOnce(metadata.damaged, kDamagedText);
+        metadata.unreadTexts.push_back(keywordOf(chunk) + " (damaged)");
+    } catch (const LongText&) {
+        metadata.unreadTexts.push_back(keywordOf(chunk) + " (beyond " + std::to_string(kMostText >> 20) +
+                                       " MiB of texts)");
     }
     metadata.chunks.push_back({std::string(chunk.name), copyOf(chunk.data)});
 }
@@ -126,7 +142,7 @@ void takeSignificance(ByteView bits, ByteView header, Metadata& metadata) {
         metadata.unheld.emplace_back("the PNG chunk sBIT");
 }
 
-void takeOther(const PngChunk& chunk, ByteView header, std::size_t& room, Metadata& metadata) {
+void takeOther(const PngChunk& chunk, ByteView header, TextRoom& room, Metadata& metadata) {
     if (isPngText(chunk.name))
         takeText(chunk, room, metadata);
     else if (chunk.name == "pHYs")
@@ -191,7 +207,7 @@ Metadata readPngMetadata(ByteView file) {
     if (chunks.empty() || chunks.front().data.size() < kHeaderSize)
         return metadata; // which the reader of the picture refuses
     const ByteView header = chunks.front().data;
-    std::size_t room = kMostText;
+    TextRoom room;
     // What has a chunk of its own goes before a text that holds it as digits.
     const auto isOwn = [](const PngChunk& chunk) {
         return chunk.name == "eXIf" || (isPngText(chunk.name) && pngKeyword(chunk) == kXmpKeyword);

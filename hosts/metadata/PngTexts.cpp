@@ -19,7 +19,8 @@ using namespace std::string_view_literals;
 constexpr std::size_t kLongestKeyword = 79;
 
 // A small chunk may claim to hold any amount.
-Bytes inflated(ByteView packed, std::size_t& room) {
+Bytes inflated(ByteView packed, TextRoom& room) {
+    const std::size_t most = std::min(room.kept, room.tried);
     z_stream stream{};
     if (inflateInit(&stream) != Z_OK)
         throw DamagedBytes("it cannot be unpacked");
@@ -27,7 +28,7 @@ Bytes inflated(ByteView packed, std::size_t& room) {
     stream.next_in = const_cast<Bytef*>(packed.data());
     stream.avail_in = static_cast<uInt>(packed.size());
     int state = Z_OK;
-    while (state == Z_OK && plain.size() <= room) {
+    while (state == Z_OK && plain.size() <= most) {
         std::array<std::uint8_t, 16384> piece{};
         stream.next_out = piece.data();
         stream.avail_out = piece.size();
@@ -35,10 +36,12 @@ Bytes inflated(ByteView packed, std::size_t& room) {
         append(plain, ByteView(piece).first(piece.size() - stream.avail_out));
     }
     inflateEnd(&stream);
-    const bool fits = plain.size() <= room;
-    room -= std::min(room, plain.size());
-    if (state != Z_STREAM_END || !fits)
+    room.tried -= std::min(room.tried, plain.size());
+    if (plain.size() > most)
+        throw LongText("there is no room for it");
+    if (state != Z_STREAM_END)
         throw DamagedBytes("it cannot be unpacked");
+    room.kept -= plain.size();
     return plain;
 }
 
@@ -82,7 +85,11 @@ std::string_view pngKeyword(const PngChunk& chunk) {
     return end == std::string_view::npos ? std::string_view() : asText(chunk.data).substr(0, end);
 }
 
-Text pngText(const PngChunk& chunk, std::size_t& room) {
+std::string shownKeyword(const std::string& keyword) {
+    return keyword.empty() ? "without a keyword" : keyword;
+}
+
+Text pngText(const PngChunk& chunk, TextRoom& room) {
     ByteView data = chunk.data;
     Text text{latinToUtf8(asBytes(word(data))), {}};
     if (!isUnderstood(text.keyword))

@@ -175,6 +175,38 @@ TEST(ExifBlock, MakesPreviewsOfMakerNotesAnew) {
     EXPECT_EQ(at(renewed, 148, 30), at(block, 148, 30));
 }
 
+// The note from 38 on: a preview without its last two bytes, a tag, a whole preview or the end of another.
+TEST(ExifBlock, LeavesPreviewsWithoutAnEndAlone) {
+    const ThumbnailMaker maker = [](int, int, int) { return Bytes(20, 1); };
+    Bytes preview = jpegOf(4, 3, 24);
+    append(preview, 0xFFDA0002FFD9, 6, ByteOrder::Big);
+    const ByteView endless = ByteView(preview).first(28);
+    const auto block = [](ByteView first, ByteView second, std::uint64_t noteSize) {
+        Bytes bytes = header();
+        addDirectory(bytes, {{tiff::ExifIfd, tiff::Long, 26}}, 0);
+        addDirectory(bytes, {{tiff::MakerNote, tiff::Undefined, 44}}, 0);
+        store(bytes, 32, noteSize, 4, ByteOrder::Little);
+        append(bytes, first);
+        append(bytes, " TAG ");
+        append(bytes, second);
+        append(bytes, "\xFF\xD9");
+        return bytes;
+    };
+    Bytes two = block(endless, preview, 65);
+    Bytes expected = two;
+    std::fill_n(expected.begin() + 44 + 33, 30, 0);
+    std::fill_n(expected.begin() + 44 + 33, 20, 1);
+    EXPECT_FALSE(renewNotePreviews(two, maker, false));
+    EXPECT_EQ(two, expected);
+    const Bytes beyond = block(endless, {}, 33); // an end mark stands behind the note
+    const Bytes noScan = block(jpegOf(4, 3, 24), {}, 31);
+    for (const Bytes& before : {beyond, noScan}) {
+        Bytes after = before;
+        EXPECT_FALSE(renewNotePreviews(after, maker, false));
+        EXPECT_EQ(after, before);
+    }
+}
+
 TEST(ExifBlock, AddsTagsWithoutMovingAnything) {
     const Bytes before = cameraBlock("canon-eos-300d.jpg");
     ExifBlock block(before);

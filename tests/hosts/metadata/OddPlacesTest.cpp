@@ -4,6 +4,7 @@
 #include "metadata/ExtendedXmp.h"
 #include "metadata/ImageResources.h"
 #include "metadata/MetadataReader.h"
+#include "metadata/XmpThumbnails.h"
 
 #include <gmock/gmock.h>
 
@@ -102,6 +103,39 @@ TEST(OddPlaces, DropThumbnailsInXmp) {
                                     " | head -c 5 && rm " + target),
                       metadata.segments.empty() ? "short" : "lllll");
         }
+    }
+}
+
+// By whatever prefix; an empty element shows nothing. Behind a text of many bytes a letter.
+TEST(OddPlaces, TakeOnlyThumbnailsOutOfXmp) {
+    const std::string image = "<rdf:Alt><rdf:li g:image='AAAA'/></rdf:Alt>";
+    const auto packet = [](const std::string& inner) {
+        std::string letters;
+        for (int i = 0; i < 9000; ++i)
+            letters += "\u00e9\r\n\U0001F600&amp;";
+        return "<?xpacket begin='\uFEFF'?><x:xmpmeta xmlns:x='adobe:ns:meta/'><rdf:RDF "
+               "xmlns:rdf='http://www.w3.org/1999/02/22-rdf-syntax-ns#'><rdf:Description rdf:about='' "
+               "xmlns:dc='http://purl.org/dc/elements/1.1/' xmlns:g='http://ns.adobe.com/xap/1.0/g/img/' "
+               "xmlns:xmp='http://ns.adobe.com/xap/1.0/' xmlns:o='http://example.org/'><dc:format>" +
+               letters + "</dc:format>" + inner + "</rdf:Description></rdf:RDF></x:xmpmeta>";
+    };
+    const auto full = [&](const std::string& name) { return "<" + name + ">" + image + "</" + name + ">"; };
+    const std::string other =
+        "<n:Thumbnails xmlns:n='http://ns.adobe.com/xap/1.0/'>" + image + "</n:Thumbnails >";
+    const std::string empty = "<xmp:Thumbnails/><xmp:Rating>5</xmp:Rating>";
+    const struct {
+        std::string before, after;
+        ThumbnailsOfXmp state;
+    } cases[] = {
+        {empty + full("xmp:Thumbnails") + " " + other, empty + " ", ThumbnailsOfXmp::Taken},
+        {empty, empty, ThumbnailsOfXmp::None},
+        {full("o:Thumbnails"), full("o:Thumbnails"), ThumbnailsOfXmp::None},
+        {full("xmp:Thumbnails") + "<cut", full("xmp:Thumbnails") + "<cut", ThumbnailsOfXmp::Kept},
+    };
+    for (const auto& one : cases) {
+        Bytes bytes = copyOf(asBytes(packet(one.before)));
+        EXPECT_EQ(takeThumbnails(bytes), one.state);
+        EXPECT_TRUE(asText(bytes) == packet(one.after)) << one.before << one.after;
     }
 }
 
