@@ -1,5 +1,5 @@
-// Writes pictures of every control, or of every pane, to a folder:
-//     gui_screenshots controls|panes FOLDER SUFFIX [dark]
+// Writes pictures of every control, pane or small window to a folder:
+//     gui_screenshots controls|panes|windows FOLDER SUFFIX [dark]
 // The scale is that of the environment variable QT_SCALE_FACTOR; the suffix tells the variants apart.
 
 #include "GUI/Controls/Artwork.h"
@@ -7,6 +7,7 @@
 #include "Utility/CARGBPlane.h"
 
 #include <QApplication>
+#include <QTemporaryDir>
 
 #include <cstdio>
 
@@ -23,6 +24,12 @@ QPalette darkPalette() {
     return dark;
 }
 
+std::vector<Shot> shotsOf(const QString& group, CARGBPlane& plane) {
+    if (group == QLatin1String("panes"))
+        return paneShots();
+    return group == QLatin1String("windows") ? windowShots() : controlShots(plane);
+}
+
 bool save(QWidget& widget, const QString& path) {
     widget.show();
     widget.activateWindow();
@@ -36,10 +43,12 @@ bool save(QWidget& widget, const QString& path) {
 } // namespace
 
 int main(int argc, char** argv) {
+    const QTemporaryDir settings; // nobody's own settings are touched
+    qputenv("XDG_CONFIG_HOME", settings.path().toLocal8Bit());
     QApplication application(argc, argv);
     const QStringList arguments = QCoreApplication::arguments();
     if (arguments.size() < 4) {
-        std::fputs("usage: gui_screenshots controls|panes FOLDER SUFFIX [dark]\n", stderr);
+        std::fputs("usage: gui_screenshots controls|panes|windows FOLDER SUFFIX [dark]\n", stderr);
         return 2;
     }
     if (arguments.value(4) == QLatin1String("dark"))
@@ -47,9 +56,8 @@ int main(int argc, char** argv) {
     QApplication::setStyle(QStringLiteral("Fusion"));
     initArtwork();
     CARGBPlane plane(240, 160, QStringLiteral("preview"));
-    const bool panes = arguments[1] == QLatin1String("panes");
     bool saved = true;
-    for (auto& [name, widget] : panes ? paneShots() : controlShots(plane)) {
+    for (auto& [name, widget] : shotsOf(arguments[1], plane)) {
         const QString file = QString::fromStdString(name) + QLatin1Char('-') + arguments[3];
         saved = save(*widget, QStringLiteral("%1/%2.png").arg(arguments[2], file)) && saved;
     }

@@ -1,6 +1,7 @@
 #include "Core/CThreadedCore.h"
 
 #include "Core/Snapshot.h"
+#include "Filters/MeasurementTape.h"
 #include "Settings/PresetTree.h"
 #include "Settings/SettingsStore.h"
 #include "Utility/CGenericEx.h"
@@ -17,6 +18,10 @@ namespace {
 // be felt at once, seldom enough to cost a pass nothing.
 constexpr qint64 kServiceMilliseconds = 8;
 
+bool isMeasurement(const PipelineTask& task, const TaskBase& made) {
+    return task.kind == TaskKind::Histogram || made.onlyMeasures();
+}
+
 } // namespace
 
 CThreadedCore::CThreadedCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* parent)
@@ -31,6 +36,7 @@ void CThreadedCore::setParams(const CUserParamsPhotoshop& params) {
 void CThreadedCore::run() {
     const LogDepth ownDepth;
     mContext.dumpsPictures =
+        !mContext.excerpt &&
         openSettings().value(PresetTree::guiKey(QStringLiteral("dumpImageAfterFile"))).toInt() != 0;
     mTotalSteps = 0;
     mCurrentStep = 0;
@@ -39,6 +45,7 @@ void CThreadedCore::run() {
     mParams.mProgressCallback = [this](int percent) { reportProgress(percent); };
     mLastProcessingDone = false;
     mReports.clear();
+    mTaskNumber = 0;
     mFailure = {};
 
     announce(0, 1, "Duplicating Input Plane", "Copying the picture");
@@ -85,6 +92,11 @@ std::unique_ptr<CARGBPlane> CThreadedCore::snapshot(const QRect& area, int reduc
     return takeSnapshot(*mInPlane, area, reduction);
 }
 
+void CThreadedCore::setExcerpt(const Excerpt& excerpt, MeasurementTape* tape) {
+    mContext.excerpt = excerpt;
+    mContext.tape = tape;
+}
+
 void CThreadedCore::stop() {
     mParams.mCancelRequested = true;
     mSemaphore.release();
@@ -119,6 +131,8 @@ void CThreadedCore::announce(int step, int total, const char* name, const char* 
 }
 
 void CThreadedCore::runTask(const PipelineTask& task) {
+    if (mContext.tape)
+        mContext.tape->moveTo(mTaskNumber++, task.name);
     if (!task.condition || task.condition(mParams)) {
         QElapsedTimer timer;
         timer.start();
@@ -130,15 +144,26 @@ void CThreadedCore::runTask(const PipelineTask& task) {
                 mObserver(mReports.back());
         };
         try {
-            made->Apply();
+            if (!playsInstead(task, *made))
+                made->Apply();
         } catch (...) { // an analyzer's failure ends the run
             report();
             throw;
         }
+        record(task, *made);
         report();
     }
     if (task.afterwards)
         task.afterwards(mParams);
+}
+
+bool CThreadedCore::playsInstead(const PipelineTask& task, const TaskBase& made) {
+    return mContext.tape && mContext.excerpt && isMeasurement(task, made) && mContext.tape->play(mParams);
+}
+
+void CThreadedCore::record(const PipelineTask& task, const TaskBase& made) {
+    if (mContext.tape && !mContext.excerpt && isMeasurement(task, made))
+        mContext.tape->record(mParams);
 }
 
 // Called for every row, from any thread. Only the thread of the run processes events and emits; the others

@@ -51,6 +51,12 @@ public:
     /// proxy.
     void setProxy(const CARGBPlaneProxy* proxy) { mContext.proxy = proxy; }
 
+    /// Has the next runs record what they measure; null ends it.
+    void setTape(orvela::MeasurementTape* tape) { mContext.tape = tape; }
+    /// Makes the next runs drafts: the planes hold a part or a reduced copy of the picture that the tape was
+    /// recorded of.
+    void setExcerpt(const orvela::Excerpt& excerpt, orvela::MeasurementTape* tape);
+
     /// Runs the pipeline; the result is told by lastProcessingDone() and the last announcement, "All Done" or
     /// "Failed". A stopped run walks on through its announcements and ends with "All Done".
     void run();
@@ -114,6 +120,8 @@ private:
     bool runPipeline();
     bool guarded(const std::function<bool()>& action);
     void reportProgress(int percent);
+    bool playsInstead(const orvela::PipelineTask& task, const TaskBase& made);
+    void record(const orvela::PipelineTask& task, const TaskBase& made);
 
     QSemaphore mSemaphore;
     const char* mStepTitle = "";
@@ -123,6 +131,7 @@ private:
     QThread* mRunThread = nullptr;
     QElapsedTimer mSinceService;
     orvela::RunContext mContext;
+    int mTaskNumber = 0;
     std::function<void(const orvela::TaskReport&)> mObserver;
     std::vector<orvela::TaskReport> mReports;
     orvela::Failure mFailure;

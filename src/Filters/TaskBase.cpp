@@ -1,5 +1,6 @@
 #include "Filters/TaskBase.h"
 
+#include "Filters/MeasurementTape.h"
 #include "Utility/Assertion.h"
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
@@ -45,6 +46,19 @@ void logText(const char* text) {
 TaskBase::TaskBase(const RunContext& context, CUserParams* params, CARGBPlane* inPlane)
     : mContext(context), mParams(params), mInPlane(inPlane),
       mVertEnd(inPlane ? static_cast<std::uint32_t>(inPlane->height()) : 0) {}
+
+void TaskBase::measured(const std::function<void()>& measure) {
+    MeasurementTape* tape = mContext.tape;
+    if (tape && mContext.excerpt && tape->play(*mParams))
+        return;
+    measure();
+    if (tape && !mContext.excerpt)
+        tape->record(*mParams);
+}
+
+std::int32_t TaskBase::picturePixels() const {
+    return mContext.excerpt ? mContext.excerpt->picturePixels : mInPlane->pixelCount();
+}
 
 bool TaskBase::Apply() {
     guarded([this] { return runPhases() ? TaskOutcome::Applied : TaskOutcome::Skipped; });

@@ -62,6 +62,9 @@ QStringList names(EGUIMode mode);
 /// The same without the reserved one: what the user is offered.
 QStringList offeredNames(EGUIMode mode);
 
+/// True when the mode has a preset of that name, also the reserved one. Asks for it alone.
+bool exists(EGUIMode mode, const QString& name);
+
 /// True when there is a preset of any mode, also a reserved one.
 bool hasPresets();
 

@@ -28,12 +28,15 @@ bool isSettingsText(const QByteArray& text) {
     if (text.contains('\0'))
         return false;
     bool continued = false;
-    for (const QByteArray& each : text.split('\n')) {
-        const QByteArray line = each.trimmed();
+    for (qsizetype start = 0; start < text.size();) {
+        const qsizetype end = text.indexOf('\n', start);
+        const qsizetype length = (end < 0 ? text.size() : end) - start;
+        const QByteArray line = QByteArray::fromRawData(text.constData() + start, length).trimmed();
         const bool isSection = line.startsWith('[') && line.endsWith(']');
         if (!continued && !line.isEmpty() && !isSection && line.indexOf('=') < 1)
             return false;
         continued = line.endsWith('\\');
+        start += length + 1;
     }
     return true;
 }
@@ -75,20 +78,26 @@ void checkRoom(const QString& path, const Changes& changes) {
         fail(kUnwritten, path, __LINE__);
 }
 
+// Every key at and below `key`.
+QStringList keysBelow(QSettings& settings, const QString& key) {
+    settings.beginGroup(key);
+    QStringList keys = settings.allKeys();
+    settings.endGroup();
+    for (QString& each : keys)
+        each.prepend(key + QLatin1Char('/'));
+    if (settings.contains(key))
+        keys.append(key);
+    return keys;
+}
+
 // What undoes the changes.
-Changes valuesBefore(const QSettings& settings, const Changes& changes) {
-    const QStringList keys = settings.allKeys();
+Changes valuesBefore(QSettings& settings, const Changes& changes) {
     Changes before;
     for (const auto& [key, value] : changes) {
-        if (value) {
-            before.push_back(
-                {key, settings.contains(key) ? std::optional(settings.value(key)) : std::nullopt});
-            continue;
-        }
-        const QString below = key + QLatin1Char('/');
+        const QStringList keys = value ? QStringList(key) : keysBelow(settings, key);
         for (const QString& each : keys)
-            if (each == key || each.startsWith(below))
-                before.push_back({each, settings.value(each)});
+            before.push_back(
+                {each, settings.contains(each) ? std::optional(settings.value(each)) : std::nullopt});
     }
     return before;
 }
@@ -101,9 +110,10 @@ void apply(QSettings& settings, const Changes& changes) {
 } // namespace
 
 void SettingsEdit::commit() const {
-    // Reading everything once has every complaint about the file made to this object, so that the status of
-    // the other tells of the writing alone.
-    const QSettings reader = openSettings();
+    // Asking at the root has the whole file understood, and every complaint about it made to this object, so
+    // that the status of the other tells of the writing alone.
+    QSettings reader = openSettings();
+    reader.childKeys();
     keepForeignFile(reader.fileName());
     checkRoom(reader.fileName(), mChanges);
     const Changes before = valuesBefore(reader, mChanges);

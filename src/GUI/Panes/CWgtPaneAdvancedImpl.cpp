@@ -4,6 +4,8 @@
 #include "Settings/FactoryPresets.h"
 #include "Utility/Logger.h"
 
+#include <QMouseEvent>
+
 using namespace orvela;
 
 CWgtPaneAdvancedImpl::CWgtPaneAdvancedImpl(QWidget* owner, EGUIMode mode) : IWgtPane(owner, mode) {
@@ -11,7 +13,9 @@ CWgtPaneAdvancedImpl::CWgtPaneAdvancedImpl(QWidget* owner, EGUIMode mode) : IWgt
     setupUi(this);
     sldrAutoContrast->hide();
     setUpSliders(PaneTable::sliders(Mode_Advanced), CSliderParams());
-    setUpColorPicker(colrPickAutoColor, sldrColorFilter);
+    setUpColorPicker(colrPickAutoColor, PaneTable::colors(Mode_Advanced).front(), sldrColorFilter);
+    lblExtendedSettings->installEventFilter(this);
+    lblExtendedSettings->setCursor(Qt::PointingHandCursor);
     extendSettings(false);
 }
 
@@ -48,9 +52,21 @@ void CWgtPaneAdvancedImpl::on_btnCollapseSettings_clicked() {
     extendSettings(false);
 }
 
+// A click on the text does what one on the button before it does.
+bool CWgtPaneAdvancedImpl::eventFilter(QObject* watched, QEvent* event) {
+    if (watched == lblExtendedSettings && event->type() == QEvent::MouseButtonPress && isEnabled() &&
+        static_cast<QMouseEvent*>(event)->button() == Qt::LeftButton)
+        extendSettings(btnCollapseSettings->isHidden());
+    return IWgtPane::eventFilter(watched, event);
+}
+
 void CWgtPaneAdvancedImpl::extendSettings(bool extended) {
-    btnExtendSettings->setVisible(!extended);
-    btnCollapseSettings->setVisible(extended);
+    QToolButton* const gone = extended ? btnExtendSettings : btnCollapseSettings;
+    QToolButton* const shown = extended ? btnCollapseSettings : btnExtendSettings;
+    shown->show();
+    if (gone->hasFocus())
+        shown->setFocus(Qt::OtherFocusReason);
+    gone->hide();
     for (QGroupBox* group : {grpBxPerceptualAbsolute, grpBxArtefacts, grpBxColor})
         group->setVisible(extended);
 }

@@ -21,6 +21,7 @@ public Q_SLOTS:
 
 protected:
     void doSetSliders(const QString& presetName) override;
+    bool eventFilter(QObject* watched, QEvent* event) override;
 
 private:
     void extendSettings(bool extended);

@@ -16,7 +16,7 @@ public:
     CThreadedCore* createCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* owner) override;
 
 private:
-    void addColorPicker(const char* object);
+    void addColorPicker(const orvela::PaneColor& color);
 
     const orvela::PaneSlider* mSlider;
     std::span<const orvela::PaneColor> mColors; ///< none without a slider

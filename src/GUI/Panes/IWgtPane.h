@@ -10,6 +10,7 @@ class CColorPicker;
 class COrvelaSliderBlockImpl;
 class CThreadedCore;
 class QComboBox;
+class QLayout;
 
 /// The controls of one family of modes: knows how they are labelled and scaled, which setting each of them
 /// drives and which core works with them.
@@ -30,7 +31,8 @@ public:
     /// Whether the pane goes on from the processed image rather than from the original.
     bool takesProcessedImage() const { return mTakesProcessedImage; }
 
-    /// Writes what the controls show into the fields of `params` that they drive.
+    /// Writes the states, colours and exact positions of the controls into the fields of `params` that they
+    /// drive.
     virtual void applyGUIParams(CUserParams& params) = 0;
 
     /// Makes the core of the pane's modes, a child of `owner`. The planes are not owned.
@@ -59,12 +61,14 @@ protected:
     void setUpSlider(const orvela::PaneSlider& slider, bool on, double position);
     /// Sets up every slider with the states and positions of `settings`.
     void setUpSliders(std::span<const orvela::PaneSlider> sliders, const CSliderParams& settings);
-    /// Tells the owner of the picker's changes and shows it while its slider is on.
-    void setUpColorPicker(CColorPicker* picker, COrvelaSliderBlockImpl* slider);
+    /// Tells the owner of the changes of a picker of that colour, and shows it below the track of its slider
+    /// while that is on.
+    void setUpColorPicker(CColorPicker* picker, const orvela::PaneColor& color,
+                          COrvelaSliderBlockImpl* slider);
     /// Gives every picker the colour that it has in `settings`.
     void showColors(std::span<const orvela::PaneColor> colors, const CSliderParams& settings);
 
-    /// Writes position and state of every slider into the fields that it drives.
+    /// Writes exact position and state of every slider into the fields that it drives.
     void writeSliders(std::span<const orvela::PaneSlider> sliders, CSliderParams& settings) const;
     /// Writes the colour of every picker into its fields.
     void writeColors(std::span<const orvela::PaneColor> colors, CSliderParams& settings) const;
@@ -72,15 +76,19 @@ protected:
     /// Disables `button` when a run of `core` starts and enables it again when it was completed.
     void enableAfterRuns(QWidget* button, CThreadedCore* core);
 
+    bool event(QEvent* event) override;
+
     bool mShowsPresets = false;
     bool mAutoRefresh = false;
     bool mTakesProcessedImage = false;
 
 private:
     void resetSliders();
+    void alignColumns();
     COrvelaSliderBlockImpl* block(const orvela::PaneSlider& slider) const;
     CColorPicker* picker(const orvela::PaneColor& color) const;
 
     QWidget* mOwner;
     EGUIMode mMode;
+    QList<std::pair<QLayout*, const COrvelaSliderBlockImpl*>> mPickerRows; ///< each below its slider
 };

@@ -1,5 +1,6 @@
 #include "GUI/Presets/CBatchMode.h"
 
+#include "GUI/Presets/StoreWriting.h"
 #include "Platform/Keyboard.h"
 #include "Settings/PresetTree.h"
 #include "Settings/SettingsStore.h"
@@ -19,7 +20,7 @@ const QString kMode = QStringLiteral("batchMode");
 void write(const QString& name, const QVariant& value) {
     SettingsEdit edit;
     edit.set(PresetTree::guiKey(name), value);
-    edit.commit();
+    StoreWriting::commit(edit, StoreWriting::Cause::Program);
 }
 
 } // namespace

@@ -2,6 +2,8 @@
 
 #include "GUI/Controls/CColorPicker.h"
 #include "GUI/Controls/COrvelaSliderBlockImpl.h"
+#include "GUI/Presets/StoreWriting.h"
+#include "Settings/SettingsStore.h"
 #include "Utility/DebugBoxes.h"
 #include "Utility/Logger.h"
 
@@ -56,7 +58,7 @@ QList<Control*> namedControls(const QWidget* parent) {
 PresetContent contentOf(const QWidget* parent) {
     PresetContent content;
     for (const auto* block : namedControls<COrvelaSliderBlockImpl>(parent))
-        content.sliders.append({block->objectName(), block->value(), block->isEnabled()});
+        content.sliders.append({block->objectName(), block->exactValue(), block->isEnabled()});
     for (const auto* picker : namedControls<CColorPicker>(parent)) {
         const QColor color = picker->color();
         content.colors.append({picker->objectName(), color.red(), color.green(), color.blue()});
@@ -85,17 +87,17 @@ QStringList listPresets(EGUIMode mode, bool excludeBatch) {
 }
 
 bool presetExists(EGUIMode mode, const QString& name) {
-    return listPresets(mode, true).contains(name);
+    return name != batchPresetName() && PresetTree::exists(mode, name);
 }
 
 bool hasPresets() {
     return PresetTree::hasPresets();
 }
 
-void removePreset(EGUIMode mode, const QString& name) {
+bool removePreset(EGUIMode mode, const QString& name) {
     SettingsEdit edit;
     PresetTree::remove(edit, mode, name);
-    edit.commit();
+    return StoreWriting::commit(edit, StoreWriting::Cause::User);
 }
 
 void loadPreset(QWidget* parent, EGUIMode mode, const QString& name) {
@@ -120,22 +122,23 @@ void savePreset(QWidget* parent, EGUIMode mode, const QString& name, bool& saved
     const bool asks = askOverwrite && presetExists(mode, name);
     if (asks && !mayOverwrite())
         return;
-    isNew = !asks;
     SettingsEdit edit;
     PresetTree::write(edit, mode, name, contentOf(parent));
-    edit.commit();
-    saved = true;
+    saved = StoreWriting::commit(edit, name == batchPresetName() ? StoreWriting::Cause::Program
+                                                                 : StoreWriting::Cause::User);
+    isNew = saved && !asks;
 }
 
 void ensureFactoryPresets(QWidget*) {
-    const QStringList stored = listPresets(Mode_Advanced, true);
+    const QSettings kept = openSettings(); // so that the file is read once
     const QStringList names = FactoryPresets::names();
-    if (std::all_of(names.begin(), names.end(), [&](const QString& name) { return stored.contains(name); }))
+    if (std::all_of(names.begin(), names.end(),
+                    [](const QString& name) { return presetExists(Mode_Advanced, name); }))
         return;
     SettingsEdit edit;
     for (const QString& name : names)
         PresetTree::write(edit, Mode_Advanced, name, FactoryPresets::contentOf(name));
-    edit.commit();
+    StoreWriting::commit(edit, StoreWriting::Cause::Program);
 }
 
 } // namespace CPresetStore

@@ -1,0 +1,150 @@
+#pragma once
+
+#include "GUI/forms/ui_CDlgSettings.h"
+#include "Settings/EGUIMode.h"
+
+#include <QDialog>
+#include <QTimer>
+
+#include <exception>
+#include <functional>
+#include <memory>
+#include <optional>
+
+class CARGBPlane;
+class CThreadedCore;
+class IWgtPane;
+
+namespace orvela {
+class DraftRunner;
+class MeasurementTape;
+class Previews;
+} // namespace orvela
+
+/// The window in which a mode runs: the sliders of the mode, previews of the original and the processed
+/// picture, presets, progress. Automatic modes, custom presets and batch replays run in it too, as progress
+/// and a stop button that close by themselves.
+///
+/// Runs are made on this thread and serve its events, so every slot may be called in the middle of one. A
+/// core never gets a second run meanwhile: who asks for one stops the first, and the second starts when it
+/// has returned.
+class CDlgSettingsImpl : public QDialog, private Ui::CDlgSettings {
+    Q_OBJECT
+
+public:
+    /// @param inPlane, outPlane  not owned; the original picture is the one that the plane proxy holds
+    CDlgSettingsImpl(EGUIMode mode, CARGBPlane* inPlane, CARGBPlane* outPlane, QWidget* parent = nullptr,
+                     Qt::WindowFlags flags = {});
+    ~CDlgSettingsImpl() override;
+
+    /// What opens a topic of the manual.
+    void setHelp(const std::function<void(const QString& topic)>& openPage) { mOpenPage = openPage; }
+
+    /// Runs the mode, or replays the last operation in batch mode. Returns when the window was closed, or a
+    /// run without dialogue ended.
+    /// @throws CGenericEx what kept the mode from running
+    void run();
+
+    /// After run(): whether the output plane holds a result that is to be used.
+    bool appliesOnFinish() const { return mApplyOnFinish; }
+
+    /// Loads the preset into the pane.
+    void on_lstBxPreset_currentIndexChanged(const QString& name);
+
+public Q_SLOTS:
+    void onMy_slider_valueChanged(double value);
+    void onMy_slider_stateChanged(bool on);
+    void onMy_colorPicker_colorChanged(QColor color);
+    void changeMode(EGUIMode mode);
+    void enableProfiling(bool enabled);
+    void previewWindowSizeChanged(QRect geometry);
+    void setSplitView(bool split);
+    void restoreWindowsStates();
+    void on_btnSplitPreviews_clicked();
+    void on_btnGluePreviews_clicked();
+    void on_btnRevertPreset_clicked();
+    void on_btnSavePreset_clicked();
+    void on_btnDeletePreset_clicked();
+    void onMy_grphVwOriginal_scrolled(int x, int y);
+    void onMy_grphVwProcessed_scrolled(int x, int y);
+    void on_btnZoomIn_clicked();
+    void on_btnZoomOut_clicked();
+    void on_btnRefresh_clicked();
+    void on_chkBxAutoRefresh_clicked(bool checked);
+    void on_btnStopProcessing_clicked();
+    void on_btnTurnAllOn_clicked();
+    void on_btnTurnAllOff_clicked();
+    void on_btnOK_clicked();
+    void on_btnCancel_clicked();
+    void on_btnHelp_clicked();
+    void onMy_thrdCore_percentDone(int percent);
+    void onMy_thrdCore_stepDone(int step, int total, const QString& name);
+    void onMy_thrdCore_stepDone(int step, int total);
+    void onMy_thrdCore_started();
+    void onMy_thrdCore_finished();
+    void onMy_this_finished(int result);
+
+    /// Records the settings for a batch replay and closes.
+    void accept() override;
+    /// Stops a run, whose result is not used, and closes.
+    void reject() override;
+
+private:
+    // CDlgSettingsImpl.cpp: the window and its modes
+    void runPreset(EGUIMode mode);
+    void runBatch(EGUIMode mode);
+    void runInteractive(EGUIMode mode);
+    void runWithoutDialogue();
+    void makePreviews();
+    void makePane(EGUIMode mode);
+    void makeCore();
+    void prepareInput();
+    void connectSource(QWidget* source);
+    void addShortcuts();
+    void turnAll(bool on);
+
+    // CDlgSettingsPresets.cpp
+    void fillPresets();
+    void selectPreset(const QString& name);
+    bool savePresetAs(const QString& name, bool asks, bool& isNew);
+
+    // CDlgSettingsRuns.cpp
+    void settingsChanged();
+    void sliderMoves();
+    void requestDraft();
+    void startTimer();
+    void runCore();
+    void runEnded();
+    void applyNonIteractiveMode();
+    void tellFailures();
+    void guarded(const std::function<void()>& action);
+    void showing(const std::function<void()>& action);
+    const CARGBPlane& original() const;
+
+    EGUIMode mMode;
+    CARGBPlane* mInPlane;
+    CARGBPlane* mOutPlane;
+    IWgtPane* mPane = nullptr;
+    CThreadedCore* mCore = nullptr;
+    std::unique_ptr<orvela::Previews> mPreviews; ///< none without dialogue
+    std::unique_ptr<orvela::DraftRunner> mDrafts;
+    std::shared_ptr<const CARGBPlane> mOriginalCopy;     ///< for drafts
+    std::shared_ptr<orvela::MeasurementTape> mTape;      ///< of the run under way
+    std::shared_ptr<orvela::MeasurementTape> mWholeTape; ///< of the last whole run
+    QTimer mRefreshTimer;
+    std::function<void(const QString&)> mOpenPage;
+
+    bool mUpToDate = false;
+    bool mApplyOnFinish = false;
+    bool mRunInNonInteractiveMode = false;
+
+    bool mRunning = false;
+    bool mRefreshWanted = false;         ///< once the run that is being stopped has returned
+    std::optional<EGUIMode> mModeWanted; ///< likewise
+    bool mStoppedByUser = false;         ///< the last run; its result is not the whole one
+    bool mStatesRestored = false;
+    std::exception_ptr mFailure; ///< for the caller of run()
+
+    int mAdvancedPreset = -1; ///< kept while in Final Touch
+    bool mAdvancedAutoRefresh = false;
+};

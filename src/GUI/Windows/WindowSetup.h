@@ -1,0 +1,31 @@
+#pragma once
+
+#include <initializer_list>
+
+class QPoint;
+class QWidget;
+
+namespace orvela {
+
+class SettingsEdit;
+
+/// Takes the relief from buttons: the shading roles of their palette become the brush of the window.
+void flatten(std::initializer_list<QWidget*> buttons);
+
+/// Moves a window that has not been shown to where the settings store says that one of its class was last. It
+/// stays where it is when there is none, or when no screen shows its title there.
+void restorePosition(QWidget& window);
+
+/// Whether enough of the title of a window so wide would show at `position` to take hold of it.
+bool isReachable(const QPoint& position, int width);
+
+/// Writes where the window is. A store that cannot be written is logged and does not stop it.
+void storePosition(const QWidget& window);
+
+/// Puts where the window is into `edit`.
+void addPosition(SettingsEdit& edit, const QWidget& window);
+
+/// Makes a change that only says how windows stand: a store that cannot be written is logged.
+void storeLayout(const SettingsEdit& edit);
+
+} // namespace orvela

@@ -1,0 +1,67 @@
+#include "GUI/Preview/PreviewScene.h"
+
+#include "support/TestPlanes.h"
+
+#include <QGraphicsItem>
+#include <QGraphicsScene>
+#include <QPainter>
+
+#include <gtest/gtest.h>
+
+using namespace orvela;
+
+namespace {
+
+/// A plane whose samples tell their place.
+std::unique_ptr<CARGBPlane> places(int width, int height) {
+    return testplanes::make(width, height, [](int x, int y) {
+        return testplanes::Pixel{std::uint8_t(10 * x), std::uint8_t(10 * y), std::uint8_t(x + y)};
+    });
+}
+
+QImage rendered(QGraphicsScene& scene) {
+    QImage image(scene.sceneRect().size().toSize(), QImage::Format_RGB32);
+    image.fill(Qt::magenta);
+    QPainter painter(&image);
+    scene.render(&painter);
+    return image;
+}
+
+QString cellsOf(const QGraphicsScene& scene) {
+    QStringList cells;
+    for (const QGraphicsItem* item : scene.items(Qt::AscendingOrder)) {
+        const QRectF at = item->sceneBoundingRect();
+        cells += QString::asprintf("%g:%g,%g,%gx%g", item->zValue(), at.x(), at.y(), at.width(), at.height());
+    }
+    return cells.join(QLatin1Char(' '));
+}
+
+TEST(PreviewScene, TilesThePlaneAndShowsEveryPixel) {
+    const auto plane = places(7, 5);
+    QGraphicsScene scene;
+    scene.addRect(0, 0, 900, 900);
+    PreviewScene::show(scene, *plane, {4, 3});
+    EXPECT_EQ(scene.sceneRect(), QRectF(0, 0, 7, 5));
+    EXPECT_EQ(cellsOf(scene).toStdString(), "1:0,0,4x3 1:4,0,3x3 1:0,3,4x2 1:4,3,3x2");
+    const QImage image = rendered(scene);
+    for (int y = 0; y < 5; ++y)
+        for (int x = 0; x < 7; ++x)
+            ASSERT_EQ(image.pixel(x, y), qRgb(10 * x, 10 * y, x + y)) << x << "," << y;
+}
+
+TEST(PreviewScene, OneCellReadsThePlaneWhenFirstPainted) {
+    const auto plane = places(3, 2);
+    plane->setColorMode(CARGBPlane::Grayscale);
+    QGraphicsScene scene;
+    PreviewScene::show(scene, *plane);
+    EXPECT_EQ(cellsOf(scene).toStdString(), "1:0,0,3x2");
+    plane->row(1)[0][2] = 77;
+    EXPECT_EQ(rendered(scene).pixel(2, 1), qRgb(77, 77, 77));
+    plane->row(1)[0][2] = 1;
+    EXPECT_EQ(rendered(scene).pixel(2, 1), qRgb(77, 77, 77)) << "kept until shown anew";
+    const CARGBPlane empty(0, 0, QStringLiteral("empty"));
+    PreviewScene::show(scene, empty);
+    EXPECT_TRUE(scene.items().isEmpty());
+}
+
+} // namespace

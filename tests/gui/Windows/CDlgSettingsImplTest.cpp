@@ -1,0 +1,361 @@
+#include "GUI/Windows/CDlgSettingsImpl.h"
+
+#include "GUI/Controls/COrvelaSliderBlockImpl.h"
+#include "GUI/Controls/CThinHorizontalSlider.h"
+#include "GUI/Presets/CPresetStore.h"
+#include "GUI/Preview/CSignaledGraphicsView.h"
+#include "GUI/Windows/CDlgSinglePreviewImpl.h"
+#include "Settings/ModeTable.h"
+#include "gui/Windows/ProcessingWindow.h"
+#include "support/BoxAnswer.h"
+#include "support/ModalDialog.h"
+
+#include <QComboBox>
+#include <QInputDialog>
+#include <QLabel>
+#include <QScrollBar>
+#include <QSet>
+
+#include <gtest/gtest.h>
+
+#include <random>
+
+using namespace orvela;
+
+namespace {
+
+std::unique_ptr<CARGBPlane> picture() {
+    return testplanes::make(96, 64, [](int x, int y) {
+        return testplanes::Pixel{std::uint8_t(40 + x), std::uint8_t(30 + x + y), std::uint8_t(20 + 2 * y)};
+    });
+}
+
+TEST(CDlgSettingsImpl, EveryAutomaticModeAppliesWhatTheEngineMakes) {
+    for (const ModeDescription& mode : ModeTable::all()) {
+        if (!CPresetStore::isFactoryMode(mode.mode))
+            continue;
+        SCOPED_TRACE(mode.displayName);
+        ProcessingWindow opened(mode.mode, picture());
+        opened.run();
+        EXPECT_TRUE(opened.window.appliesOnFinish());
+        EXPECT_EQ(opened.window.result(), QDialog::Accepted);
+        EXPECT_EQ(testplanes::bytes(opened.output), opened.engineResult(CUserParamsPhotoshop(mode.mode)));
+    }
+}
+
+TEST(CDlgSettingsImpl, ASingleFilterAppliesWhatItsSliderSays) {
+    for (const EGUIMode mode :
+         {Mode_SmartSharpness, Mode_AddDigitalFlash, Mode_Temperature, Mode_SmartGamma}) {
+        SCOPED_TRACE(mode);
+        ProcessingWindow opened(mode, picture());
+        double position = 0;
+        opened.run([&] {
+            auto* slider = opened.find<COrvelaSliderBlockImpl>("sldrGeneric");
+            slider->txtValue->setText(SliderScales::textOf(slider->value() > 500 ? 1.0 : 3000.0));
+            position = slider->exactValue();
+            opened.click("btnOK");
+        });
+        CUserParamsPhotoshop params(mode);
+        params.mSliderParams.*params.mGenericSlider.field = static_cast<float>(position);
+        EXPECT_TRUE(opened.window.appliesOnFinish());
+        EXPECT_EQ(testplanes::bytes(opened.output), opened.engineResult(params));
+    }
+}
+
+TEST(CDlgSettingsImpl, OkAfterARefreshAcceptsWithoutAnotherRun) {
+    ProcessingWindow opened(Mode_Advanced, picture());
+    int runs = 0;
+    opened.run([&] {
+        QObject::connect(opened.core(), &CThreadedCore::started, [&runs] { ++runs; });
+        opened.click("btnRefresh");
+        EXPECT_EQ(opened.window.windowTitle(), "Advanced");
+        opened.click("btnOK");
+    });
+    EXPECT_TRUE(opened.window.appliesOnFinish());
+    EXPECT_EQ(runs, 1);
+}
+
+TEST(CDlgSettingsImpl, AStoppedRunIsNotTakenForTheResult) {
+    ProcessingWindow opened(Mode_Advanced, picture());
+    int runs = 0;
+    opened.run([&] {
+        QObject::connect(opened.core(), &CThreadedCore::started, [&runs] { ++runs; });
+        const auto stop =
+            QObject::connect(opened.core(), &CThreadedCore::stepDone, &opened.window,
+                             [&](int step) { step == 3 ? opened.click("btnStopProcessing") : void(); });
+        opened.click("btnRefresh");
+        QObject::disconnect(stop);
+        EXPECT_TRUE(opened.find("btnRefresh")->isVisible());
+        opened.click("btnOK");
+    });
+    EXPECT_EQ(runs, 2);
+    EXPECT_EQ(testplanes::bytes(opened.output), opened.engineResult(CUserParamsPhotoshop(Mode_Automatic)));
+}
+
+TEST(CDlgSettingsImpl, CancelInTheMiddleOfARunAppliesNothing) {
+    ProcessingWindow opened(Mode_Advanced, picture());
+    bool hidden = false;
+    opened.run([&] {
+        QObject::connect(opened.core(), &CThreadedCore::stepDone, &opened.window, [&](int step) {
+            if (step != 5)
+                return;
+            opened.click("btnCancel");
+            hidden = !opened.window.isVisible(); // at once
+        });
+        opened.click("btnRefresh");
+    });
+    EXPECT_TRUE(hidden);
+    EXPECT_FALSE(opened.window.appliesOnFinish());
+    EXPECT_EQ(opened.window.result(), QDialog::Rejected);
+}
+
+TEST(CDlgSettingsImpl, OkInTheMiddleOfARunStartsItAnewAndAcceptsTheWholeOne) {
+    ProcessingWindow opened(Mode_Advanced, picture());
+    QStringList heard;
+    opened.run([&] {
+        QObject::connect(opened.core(), &CThreadedCore::started, [&] { heard += QStringLiteral("started"); });
+        QObject::connect(opened.core(), &CThreadedCore::finished,
+                         [&] { heard += QStringLiteral("finished"); });
+        bool pressed = false;
+        QObject::connect(opened.core(), &CThreadedCore::stepDone, &opened.window, [&](int step) {
+            if (step == 4 && !std::exchange(pressed, true))
+                opened.click("btnOK");
+        });
+        opened.click("btnRefresh");
+    });
+    EXPECT_EQ(heard.join(' '), "started finished started finished");
+    EXPECT_TRUE(opened.window.appliesOnFinish());
+    EXPECT_EQ(testplanes::bytes(opened.output), opened.engineResult(CUserParamsPhotoshop(Mode_Automatic)));
+}
+
+TEST(CDlgSettingsImpl, ThreeChangesWithinASecondMakeOneRun) {
+    ProcessingWindow opened(Mode_Advanced, picture());
+    int runs = 0;
+    opened.run([&] {
+        QObject::connect(opened.core(), &CThreadedCore::started, [&runs] { ++runs; });
+        opened.click("chkBxAutoRefresh");
+        for (const double position : {200.0, 400.0, 600.0}) {
+            opened.find<COrvelaSliderBlockImpl>("sldrSaturation")->sldrValue->moveTo(position);
+            QTest::qWait(100);
+            EXPECT_EQ(runs, 0);
+        }
+        EXPECT_TRUE(QTest::qWaitFor([&] { return runs > 0; }, 5000));
+        QTest::qWait(1500);
+        opened.click("btnCancel");
+    });
+    EXPECT_EQ(runs, 1);
+}
+
+TEST(CDlgSettingsImpl, FinalTouchGoesOnFromTheResultAndComesBackToThePreset) {
+    ProcessingWindow opened(Mode_Advanced, picture());
+    opened.run([&] {
+        auto* presets = opened.find<QComboBox>("lstBxPreset");
+        presets->setCurrentText(QStringLiteral("Landscape"));
+        opened.click("btnRefresh");
+        const std::vector<std::uint8_t> landscape = testplanes::bytes(opened.output);
+        opened.click("btnFinalTouch");
+        EXPECT_EQ(opened.window.windowTitle(), "Final Touch");
+        EXPECT_FALSE(opened.find("frmPresets")->isVisible());
+        EXPECT_TRUE(opened.find<QAbstractButton>("chkBxAutoRefresh")->isChecked());
+        EXPECT_EQ(testplanes::bytes(*opened.input), landscape);
+        EXPECT_TRUE(QTest::qWaitFor([&] { return opened.find("btnBack")->isEnabled(); }, 5000));
+        opened.click("btnBack");
+        EXPECT_EQ(presets->currentText(), "Landscape");
+        EXPECT_EQ(testplanes::bytes(*opened.input), testplanes::bytes(opened.proxy.plane()));
+        opened.click("btnCancel");
+    });
+}
+
+TEST(CDlgSettingsImpl, PresetsAreSavedOverwrittenRevertedAndDeleted) {
+    ProcessingWindow opened(Mode_Adjustments, picture());
+    opened.run([&] {
+        EXPECT_FALSE(opened.find("frmPresets")->isVisible());
+        opened.click("btnCancel");
+    });
+    ProcessingWindow advanced(Mode_Advanced, picture());
+    advanced.run([&] {
+        auto* presets = advanced.find<QComboBox>("lstBxPreset");
+        auto* saturation = advanced.find<COrvelaSliderBlockImpl>("sldrSaturation");
+        const auto named = [](const QString& name) {
+            return [name](QDialog& dialog) {
+                if (auto* input = qobject_cast<QInputDialog*>(&dialog)) {
+                    EXPECT_EQ(input->windowTitle(), "Save Preset");
+                    input->setTextValue(name);
+                    return input->accept();
+                }
+            };
+        };
+        {
+            const ModalDialogs hand(named(QStringLiteral("Mine")));
+            saturation->sldrValue->moveTo(300);
+            advanced.click("btnSavePreset");
+        }
+        EXPECT_EQ(presets->currentText(), "Mine");
+        saturation->sldrValue->moveTo(800);
+        QString said;
+        answerBox(QMessageBox::Yes, said);
+        advanced.click("btnRevertPreset");
+        EXPECT_EQ(said.section('|', 0, 0), "Warning");
+        EXPECT_EQ(saturation->value(), 300);
+        answerBox(QMessageBox::Yes, said);
+        advanced.click("btnDeletePreset");
+        EXPECT_EQ(presets->findText(QStringLiteral("Mine")), -1);
+        presets->setCurrentText(QStringLiteral("Macro"));
+        answerBox(QMessageBox::Ok, said);
+        advanced.click("btnDeletePreset");
+        EXPECT_EQ(said,
+                  "Warning|The current preset cannot be deleted, since it's one of the factory presets.");
+        EXPECT_EQ(presets->currentText(), "Macro");
+        advanced.click("btnCancel");
+    });
+    EXPECT_FALSE(CPresetStore::presetExists(Mode_Advanced, QStringLiteral("Mine")));
+}
+
+TEST(CDlgSettingsImpl, SplitPreviewsAreFoundAgainWhereTheyWere) {
+    const QRect place(60, 70, 300, 240);
+    {
+        ProcessingWindow opened(Mode_Advanced, picture());
+        opened.run([&] {
+            opened.click("btnSplitPreviews");
+            EXPECT_FALSE(opened.find("CDlgDualPreview")->isVisible());
+            for (auto* single : opened.window.findChildren<CDlgSinglePreviewImpl*>())
+                EXPECT_TRUE(single->isVisible());
+            opened.window.findChildren<CDlgSinglePreviewImpl*>().first()->setGeometry(place);
+            opened.click("btnCancel");
+        });
+    }
+    ProcessingWindow opened(Mode_Advanced, picture());
+    opened.run([&] {
+        const auto* first = opened.window.findChildren<CDlgSinglePreviewImpl*>().first();
+        EXPECT_TRUE(first->isVisible());
+        EXPECT_EQ(first->geometry(), place);
+        opened.click("btnGluePreviews");
+        EXPECT_TRUE(opened.find("CDlgDualPreview")->isVisible());
+        opened.click("btnCancel");
+    });
+}
+
+TEST(CDlgSettingsImpl, ZoomsByItsTableAndBothViewsKeepTogether) {
+    ProcessingWindow opened(Mode_Advanced, picture());
+    opened.run([&] {
+        const auto views = opened.window.findChildren<CSignaledGraphicsView*>();
+        ASSERT_EQ(views.size(), 2);
+        auto* label = opened.find<QLabel>("lblZoomLevel");
+        const double fitted = views[0]->transform().m11();
+        EXPECT_NEAR(fitted * 96, views[0]->width(), 1);
+        for (int i = 0; i < 20; ++i)
+            opened.click("btnZoomIn");
+        EXPECT_EQ(label->text(), "5000%");
+        EXPECT_NEAR(views[1]->transform().m11(), 50 * fitted, 1e-3);
+        views[0]->horizontalScrollBar()->setValue(500);
+        Q_EMIT views[0]->scrolledBy(500, 40);
+        EXPECT_EQ(views[1]->horizontalScrollBar()->value(), 500);
+        for (int i = 0; i < 40; ++i)
+            opened.click("btnZoomOut");
+        EXPECT_EQ(label->text(), "1%");
+        opened.find("CDlgDualPreview")->resize(900, 500);
+        QTest::qWait(50);
+        EXPECT_EQ(label->text(), "1%");
+        EXPECT_NEAR(views[0]->transform().m11() * 96, views[0]->width(), 1) << "fitted anew";
+        opened.click("btnCancel");
+    });
+}
+
+// Every few events something is clicked, moved, closed: whatever comes, no run starts inside another one, and
+// what is applied is what the settings ask for.
+class Monkey : public QObject {
+public:
+    Monkey(ProcessingWindow& opened, std::mt19937& random) : mOpened(opened), mRandom(random) {
+        mTimer.setInterval(0);
+        connect(&mTimer, &QTimer::timeout, this, &Monkey::act);
+        mTimer.start();
+    }
+
+    int actions() const { return mActions; }
+
+private:
+    void act() {
+        if (mRandom() % 3 != 0)
+            return;
+        ++mActions;
+        if (mActions > 60)
+            return mOpened.window.reject();
+        watch();
+        switch (mRandom() % 16) {
+        case 0:
+            return pick("btnOK");
+        case 1:
+            return pick("btnStopProcessing");
+        case 2:
+            return mRandom() % 4 == 0 ? pick("btnCancel") : void();
+        case 3:
+        case 4:
+        case 5:
+            return pick("btnRefresh");
+        case 6:
+            return pick("btnFinalTouch");
+        case 7:
+            return pick("btnBack");
+        case 8:
+            return mRandom() % 8 == 0 ? void(mOpened.window.close()) : void();
+        case 9:
+            return pick("chkBxAutoRefresh");
+        case 10:
+            return pick("btnSplitPreviews");
+        case 11:
+            return pick("btnGluePreviews");
+        case 12:
+            return mOpened.window.on_btnRefresh_clicked(); // what the timer does
+        default:
+            return moveSlider();
+        }
+    }
+
+    void pick(const char* button) {
+        auto* found = mOpened.window.findChild<QAbstractButton*>(QLatin1String(button));
+        if (found && found->isVisible() && found->isEnabled())
+            QTest::mouseClick(found, Qt::LeftButton);
+    }
+
+    void moveSlider() {
+        const auto blocks = mOpened.window.findChildren<COrvelaSliderBlockImpl*>();
+        COrvelaSliderBlockImpl* block = blocks[int(mRandom() % unsigned(blocks.size()))];
+        if (!block->isVisible() || !static_cast<QWidget*>(block)->isEnabled())
+            return;
+        block->setEnabled(true);
+        QTest::mouseClick(block, Qt::LeftButton, {},
+                          QPoint(int(mRandom() % unsigned(block->width())), block->height() / 2));
+    }
+
+    void watch() {
+        for (CThreadedCore* core : mOpened.window.findChildren<CThreadedCore*>()) {
+            if (mWatched.contains(core))
+                continue;
+            mWatched.insert(core);
+            connect(core, &CThreadedCore::started, this, [this] { EXPECT_EQ(++mRuns, 1); });
+            connect(core, &CThreadedCore::finished, this, [this] { EXPECT_EQ(--mRuns, 0); });
+        }
+    }
+
+    ProcessingWindow& mOpened;
+    std::mt19937& mRandom;
+    QTimer mTimer;
+    QSet<CThreadedCore*> mWatched;
+    int mActions = 0;
+    int mRuns = 0;
+};
+
+TEST(CDlgSettingsImpl, SurvivesWhateverIsClickedWheneverItIs) {
+    std::mt19937 random(20261123);
+    int actions = 0;
+    for (int i = 0; i < 25; ++i) {
+        ProcessingWindow opened(i % 2 ? Mode_Advanced : Mode_Adjustments, picture());
+        Monkey monkey(opened, random);
+        opened.window.run();
+        actions += monkey.actions();
+        EXPECT_FALSE(opened.window.isVisible());
+    }
+    EXPECT_GT(actions, 200);
+}
+
+} // namespace
