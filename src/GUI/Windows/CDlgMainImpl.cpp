@@ -223,8 +223,9 @@ void CDlgMainImpl::on_btnIndivFilters_clicked() {
             menu->addSeparator();
             continue;
         }
-        QAction* action =
-            menu->addAction(QIcon(QLatin1String(entry.icon)), Translations::modeName(entry.mode));
+        QAction* action = menu->addAction(
+            QIcon(QLatin1String(entry.icon)),
+            Translations::modeName(entry.mode).replace(QLatin1Char('&'), QLatin1String("&&")));
         action->setData(int(entry.mode));
         connect(action, &QAction::triggered, this, &CDlgMainImpl::indivFilterActionClicked);
     }
