@@ -94,7 +94,7 @@ void CDlgSettingsImpl::runCore() {
     if (mDrafts)
         mDrafts->cancel();
     mTape = std::make_shared<MeasurementTape>();
-    mCore->setTape(mPreviews ? mTape.get() : nullptr);
+    mCore->recordTape(mPreviews ? mTape.get() : nullptr);
     const QScopedValueRollback<bool> running(mRunning, true);
     Q_EMIT mCore->started();
     mCore->run();
