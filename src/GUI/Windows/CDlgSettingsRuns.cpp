@@ -4,6 +4,7 @@
 #include "GUI/Presets/CPresetStore.h"
 #include "GUI/Preview/DraftRunner.h"
 #include "GUI/Windows/CDlgSettingsImpl.h"
+#include "GUI/Windows/PaneHistory.h"
 #include "GUI/Windows/Previews.h"
 #include "Utility/CGenericEx.h"
 #include "Utility/DebugBoxes.h"
@@ -12,31 +13,6 @@
 #include <QScopedValueRollback>
 
 using namespace orvela;
-
-void CDlgSettingsImpl::onMy_slider_valueChanged(double) {
-    settingsChanged();
-}
-
-void CDlgSettingsImpl::onMy_slider_stateChanged(bool) {
-    settingsChanged();
-}
-
-void CDlgSettingsImpl::onMy_colorPicker_colorChanged(QColor) {
-    settingsChanged();
-}
-
-void CDlgSettingsImpl::settingsChanged() {
-    mUpToDate = false;
-    startTimer();
-    requestDraft();
-}
-
-// The refresh waits for the end of the movement.
-void CDlgSettingsImpl::sliderMoves() {
-    if (mRefreshTimer.isActive())
-        mRefreshTimer.start();
-    requestDraft();
-}
 
 void CDlgSettingsImpl::requestDraft() {
     if (!mPreviews || mRunning || !isVisible())
@@ -101,15 +77,21 @@ void CDlgSettingsImpl::runCore() {
     Q_EMIT mCore->finished();
 }
 
+// What cannot be done beside the run that is under way comes after it.
+void CDlgSettingsImpl::stopFor(const std::function<void()>& action) {
+    mActionWanted = action;
+    mCore->stop();
+}
+
 // What was asked for meanwhile. Not at once: this may be called from within a slot of the pane.
 void CDlgSettingsImpl::runEnded() {
     const bool again = std::exchange(mRefreshWanted, false);
-    const std::optional<EGUIMode> mode = std::exchange(mModeWanted, std::nullopt);
+    const std::function<void()> action = std::exchange(mActionWanted, nullptr);
     if (!isVisible())
         return; // closed by what happened meanwhile
     tellFailures();
-    if (mode)
-        QTimer::singleShot(0, this, [this, mode] { changeMode(*mode); });
+    if (action)
+        QTimer::singleShot(0, this, action);
     else if (again)
         QTimer::singleShot(0, this, &CDlgSettingsImpl::on_btnRefresh_clicked);
 }
@@ -121,6 +103,7 @@ void CDlgSettingsImpl::onMy_thrdCore_started() {
     btnRefresh->hide();
     btnStopProcessing->show();
     mPane->setEnabled(false);
+    mHistory->setUsable(false);
     if (!mPane->takesProcessedImage())
         mInPlane->copyFrom(original());
 }
@@ -146,6 +129,7 @@ void CDlgSettingsImpl::onMy_thrdCore_finished() {
     btnRefresh->setVisible(!chkBxAutoRefresh->isChecked());
     btnOK->setEnabled(true);
     mPane->setEnabled(true);
+    mHistory->setUsable(true);
     // A stopped run ends like any other, but its picture is not the one that was asked for.
     mUpToDate = !mRefreshWanted && !mStoppedByUser;
     if (mUpToDate && mCore->lastProcessingDone())
@@ -188,7 +172,7 @@ void CDlgSettingsImpl::accept() {
 void CDlgSettingsImpl::reject() {
     mApplyOnFinish = false;
     mRefreshWanted = false;
-    mModeWanted.reset();
+    mActionWanted = nullptr;
     if (mCore)
         mCore->stop();
     QDialog::reject();
