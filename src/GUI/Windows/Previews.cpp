@@ -10,6 +10,7 @@
 #include "Settings/PresetTree.h"
 #include "Settings/SettingsEdit.h"
 
+#include <QAction>
 #include <QKeyEvent>
 #include <QScreen>
 #include <QScrollBar>
@@ -54,12 +55,28 @@ Previews::Previews(QWidget* owner)
     connect(mBar, &PreviewBar::fitRequested, this, [this] { zoomTo(ZoomTable::kFit); });
     connect(mBar, &PreviewBar::pixelsRequested, this, &Previews::zoomToPixels);
     connect(mBar, &PreviewBar::comparingChanged, this, &Previews::setComparing);
+    addKey(Qt::Key_0, Qt::ControlModifier, [this] { zoomTo(ZoomTable::kFit); });
+    addKey(Qt::Key_1, Qt::ControlModifier, [this] { zoomToPixels(); });
+    addKey(Qt::Key_F3, {}, [this] { setComparing(!isComparing()); });
+    for (QWidget* window : windows())
+        window->installEventFilter(this);
 }
 
 // The views would outlive their scenes: the windows belong to the owner.
 Previews::~Previews() {
     mOriginalView->setScene(nullptr);
     mProcessedView->setScene(nullptr);
+}
+
+void Previews::addKey(Qt::Key key, Qt::KeyboardModifiers modifiers, const std::function<void()>& action) {
+    auto* keyAction = new QAction(this);
+    keyAction->setShortcut(QKeyCombination(modifiers, key));
+    connect(keyAction, &QAction::triggered, this, action);
+    mKeys.append(keyAction);
+}
+
+QList<QWidget*> Previews::windows() const {
+    return {mJoined, mOrig, mProc};
 }
 
 CSignaledGraphicsView* Previews::makeView(PreviewPicture& picture) {
@@ -146,8 +163,7 @@ void Previews::setSplit(bool split) {
 }
 
 void Previews::hide() {
-    for (QWidget* window :
-         {static_cast<QWidget*>(mJoined), static_cast<QWidget*>(mOrig), static_cast<QWidget*>(mProc)})
+    for (QWidget* window : windows())
         window->hide();
 }
 
@@ -205,13 +221,14 @@ void Previews::setComparing(bool comparing) {
 bool Previews::eventFilter(QObject* watched, QEvent* event) {
     if (event->type() == QEvent::KeyPress || event->type() == QEvent::KeyRelease) {
         const auto* key = static_cast<QKeyEvent*>(event);
-        if (key->key() == Qt::Key_Space) {
+        const bool inPicture = watched == mOriginalView || watched == mProcessedView;
+        if (key->key() == Qt::Key_F2 || (inPicture && key->key() == Qt::Key_Space)) {
             if (!key->isAutoRepeat())
                 setHeld(event->type() == QEvent::KeyPress);
             return true;
         }
     }
-    if (event->type() == QEvent::FocusOut)
+    if (event->type() == QEvent::FocusOut || event->type() == QEvent::WindowDeactivate)
         setHeld(false); // the release goes elsewhere
     return QObject::eventFilter(watched, event);
 }
