@@ -4,6 +4,7 @@
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
 
+#include <QCoreApplication>
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
@@ -17,11 +18,11 @@ namespace {
 
 using Changes = std::vector<SettingsEdit::Change>;
 
-const QString kUnwritten = QStringLiteral("The settings could not be written to %1.");
-
-[[noreturn]] void fail(const QString& text, const QString& store, int line) {
-    throw CGenericEx(text.arg(store), "SettingsEdit.cpp", line);
+[[noreturn]] void fail(const char* text, const QString& store, int line) {
+    throw CGenericEx(QCoreApplication::translate("SettingsEdit", text).arg(store), "SettingsEdit.cpp", line);
 }
+
+constexpr char kUnwritten[] = QT_TRANSLATE_NOOP("SettingsEdit", "The settings could not be written to %1.");
 
 // Whether the store's parser would keep every line. It drops what it does not understand.
 bool isSettingsText(const QByteArray& text) {
@@ -50,7 +51,8 @@ void keepForeignFile(const QString& path) {
     for (int number = 2; QFileInfo::exists(copy); ++number)
         copy = first + QString::number(number);
     if (!QFile::copy(path, copy))
-        fail(QStringLiteral("The settings file %1 holds something else, and no copy of it could be made."),
+        fail(QT_TRANSLATE_NOOP("SettingsEdit",
+                               "The settings file %1 holds something else, and no copy of it could be made."),
              path, __LINE__);
     Log::log(LogLevel::Warning, "The settings file held something else; it is kept as %s.",
              copy.toUtf8().constData());

@@ -13,7 +13,8 @@ QTextEdit* messageOf(const QString& text) {
     auto* message = new QTextEdit;
     message->setPlainText(text); // what came from the server is no markup
     message->setReadOnly(true);
-    message->setFocusPolicy(Qt::NoFocus);
+    message->setTabChangesFocus(true);
+    message->setAccessibleName(UpdateMessage::tr("Message"));
     message->setStyleSheet(QStringLiteral("border:0px;"));
     message->viewport()->setAutoFillBackground(false); // it is no place to type
     message->setFixedHeight(50);

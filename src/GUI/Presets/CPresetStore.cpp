@@ -17,8 +17,13 @@ using namespace orvela;
 
 namespace {
 
-QString text(const char* source) {
-    return QCoreApplication::translate("CPresetStore", source);
+// What the store says to the user, in its own context.
+class Texts {
+    Q_DECLARE_TR_FUNCTIONS(CPresetStore)
+};
+
+void warn(const QString& text) {
+    DebugBoxes::warningBox(DebugBoxes::mainWindow(), Texts::tr("Warning"), text);
 }
 
 void warnOfMissing(const QString& object, const QString& what) {
@@ -56,8 +61,8 @@ QList<Control*> namedControls(const QWidget* parent) {
 }
 
 bool mayOverwrite() {
-    return QMessageBox::question(static_cast<QWidget*>(DebugBoxes::mainWindow()), text("Warning"),
-                                 text("This preset already exists. Do you want to overwrite it?"),
+    return QMessageBox::question(static_cast<QWidget*>(DebugBoxes::mainWindow()), Texts::tr("Warning"),
+                                 Texts::tr("This preset already exists. Do you want to overwrite it?"),
                                  QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes;
 }
 
@@ -117,10 +122,8 @@ void loadPreset(QWidget* parent, EGUIMode mode, const QString& name) {
 void savePreset(QWidget* parent, EGUIMode mode, const QString& name, bool& saved, bool& isNew,
                 bool askOverwrite) {
     saved = isNew = false;
-    if (name.isEmpty()) {
-        DebugBoxes::warningBox(DebugBoxes::mainWindow(), text("Warning"), text("A preset needs a name."));
-        return;
-    }
+    if (name.isEmpty())
+        return warn(Texts::tr("A preset needs a name."));
     const bool asks = askOverwrite && presetExists(mode, name);
     if (asks && !mayOverwrite())
         return;

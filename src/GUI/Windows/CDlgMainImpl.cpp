@@ -19,6 +19,7 @@
 
 #include <QMenu>
 #include <QMessageBox>
+#include <QPointer>
 
 using namespace orvela;
 
@@ -56,6 +57,14 @@ constexpr FilterEntry kFilterMenu[] = {
     {Mode_ColorFilter, ":/All Filters/Filter_24x24.png"},
     kSeparator,
 };
+
+template <typename Dialog>
+void runDialog(QWidget* parent) {
+    const QPointer<Dialog> dialog = new Dialog(parent);
+    dialog->exec();
+    if (dialog) // its parent may have gone, and it with it
+        dialog->deleteLater();
+}
 
 } // namespace
 
@@ -252,9 +261,7 @@ void CDlgMainImpl::on_btnAbout_clicked() {
 }
 
 void CDlgMainImpl::doAbout(QDialog* parent) {
-    auto* dialog = new CDlgAboutImpl(parent);
-    dialog->exec();
-    dialog->deleteLater();
+    runDialog<CDlgAboutImpl>(parent);
 }
 
 void CDlgMainImpl::doAbout() {
@@ -262,9 +269,7 @@ void CDlgMainImpl::doAbout() {
 }
 
 void CDlgMainImpl::doProgramInfos(QDialog* parent) {
-    auto* dialog = new CDlgProgramInfosImpl(parent);
-    dialog->exec();
-    dialog->deleteLater();
+    runDialog<CDlgProgramInfosImpl>(parent);
 }
 
 void CDlgMainImpl::doProgramInfos() {

@@ -180,14 +180,7 @@ void CDlgSettingsImpl::changeMode(EGUIMode mode) {
             mAdvancedPreset = lstBxPreset->currentIndex();
             mAdvancedAutoRefresh = chkBxAutoRefresh->isChecked();
         }
-<<<<<<< HEAD
         setWindowTitle(Translations::modeName(mode));
-        makePane(mode);
-        makeCore();
-        fillPresets();
-        on_lstBxPreset_currentIndexChanged(lstBxPreset->currentText());
-=======
-        setWindowTitle(tr(getModeAsString(mode).toUtf8()));
         {
             const QScopedValueRollback<bool> together(mTogether, true);
             makePane(mode);
@@ -196,7 +189,6 @@ void CDlgSettingsImpl::changeMode(EGUIMode mode) {
             on_lstBxPreset_currentIndexChanged(lstBxPreset->currentText());
         }
         startTimer();
->>>>>>> windows
         QTimer::singleShot(0, this, &CDlgSettingsImpl::restoreWindowsStates);
         layout()->setSizeConstraint(QLayout::SetFixedSize);
         mUpToDate = false;

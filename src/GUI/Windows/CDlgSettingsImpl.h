@@ -105,7 +105,6 @@ private:
     void makePane(EGUIMode mode);
     void makeCore();
     void prepareInput();
-    void connectSource(QWidget* source);
     void turnAll(bool on);
 
     // CDlgSettingsKeys.cpp

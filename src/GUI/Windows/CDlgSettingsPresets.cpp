@@ -71,8 +71,15 @@ void CDlgSettingsImpl::on_btnSavePreset_clicked() {
     const QString name =
         QInputDialog::getText(this, tr("Save Preset"), tr("Enter a name for the preset to be saved as."),
                               QLineEdit::Normal, lstBxPreset->currentText(), &accepted);
+    if (!accepted)
+        return;
+    if (name == CPresetStore::batchPresetName()) {
+        DebugBoxes::warningBox(static_cast<QWidget*>(this), tr("Warning"),
+                               tr("This name is kept for the last operation. Choose another one."));
+        return;
+    }
     bool isNew = false;
-    if (!accepted || !savePresetAs(name, true, isNew))
+    if (!savePresetAs(name, true, isNew))
         return;
     if (isNew)
         lstBxPreset->addItem(QIcon(QLatin1String(kUserIcon)), name);

@@ -182,7 +182,7 @@ void CDlgSettingsImpl::reject() {
 
 void CDlgSettingsImpl::applyNonIteractiveMode() {
     if (!mRunInNonInteractiveMode)
-        DebugBoxes::warningBox(this, tr("Warning"),
+        DebugBoxes::warningBox(static_cast<QWidget*>(this), tr("Warning"),
                                tr("Calling applyNonIteractiveMode when mRunInNonInteractiveMode is false."));
     for (QWidget* hidden : {frmPresets, frmCentralContainer, frmBottomContainer})
         hidden->hide();
@@ -209,7 +209,7 @@ void CDlgSettingsImpl::tellFailures() {
             text = tr("A step of the processing failed and was left out: %1 (%2)")
                        .arg(report.failure.cause, QLatin1String(report.name));
     if (!text.isEmpty())
-        DebugBoxes::warningBox(this, tr("Warning"), text);
+        DebugBoxes::warningBox(static_cast<QWidget*>(this), tr("Warning"), text);
 }
 
 // Nothing may be thrown through the event loop. What keeps the mode from going on ends the dialogue and is

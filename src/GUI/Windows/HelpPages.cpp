@@ -59,10 +59,6 @@ void appendHeadings(const QString& topic, QList<HelpPages::Heading>& headings) {
 
 namespace HelpPages {
 
-bool exist() {
-    return QFile::exists(fileOf(QLatin1String(kTopics[0])));
-}
-
 QUrl pageOf(const QString& topic) {
     const bool known = std::find(std::begin(kTopics), std::end(kTopics), topic) != std::end(kTopics);
     return addressOf(known ? topic : QLatin1String(kTopics[0]));

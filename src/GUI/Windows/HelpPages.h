@@ -16,9 +16,6 @@ struct Heading {
     int level;    ///< 1 for a page, more for what lies below the heading before
 };
 
-/// True when the program was built with the manual.
-bool exist();
-
 /// The page of a topic such as "welcome.htm"; the first page for a topic that the manual does not have.
 QUrl pageOf(const QString& topic);
 

@@ -1,6 +1,7 @@
 #include "GUI/Windows/HelpWindow.h"
 
 #include "GUI/Controls/Artwork.h"
+#include "GUI/Presets/StoreWriting.h"
 #include "GUI/Windows/HelpBrowser.h"
 #include "GUI/Windows/HelpPages.h"
 #include "Platform/HelpViewer.h"
@@ -199,7 +200,9 @@ bool HelpWindow::eventFilter(QObject* watched, QEvent* event) {
 }
 
 void HelpWindow::closeEvent(QCloseEvent* event) {
-    openSettings().setValue(placeKey(), saveGeometry());
+    SettingsEdit edit;
+    edit.set(placeKey(), saveGeometry());
+    StoreWriting::commit(edit, StoreWriting::Cause::Program);
     QWidget::closeEvent(event);
 }
 
@@ -246,12 +249,10 @@ void HelpWindow::leaveSearch() {
 void openHelp(const QString& topic, QWidget* owner) {
     static QPointer<HelpWindow> window;
     const QString compiled = HelpViewer::compiledManual();
-    if (QFile::exists(compiled) && HelpViewer::show(owner->winId(), compiled + QStringLiteral("::/") + topic))
-        return;
-    if (!HelpPages::exist()) {
+    if (!QFile::exists(compiled))
         DebugBoxes::debugWarning(QStringLiteral("Help file missing:") + compiled, QStringLiteral("Warning"));
+    else if (HelpViewer::show(owner->winId(), compiled + QStringLiteral("::/") + topic))
         return;
-    }
     // A window over which a modal one stands is out of reach, and so would its help be.
     QWidget* reachable = QApplication::activeModalWidget() ? QApplication::activeModalWidget() : owner;
     if (!window)

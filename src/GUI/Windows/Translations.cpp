@@ -18,7 +18,7 @@ namespace Translations {
 
 namespace {
 
-const QString kFolder = QStringLiteral(":/translations");
+const QString kFolder = QStringLiteral(":/orvela/translations");
 
 // The toolkit's own texts, such as the buttons of message boxes, come from its own catalogue.
 struct Catalogues {
@@ -57,7 +57,7 @@ QString install(const QLocale& locale) {
 QStringList languages() {
     initResource();
     QStringList languages;
-    for (const QString& file : QDir(kFolder).entryList())
+    for (const QString& file : QDir(kFolder).entryList({QStringLiteral("orvela_*.qm")}))
         languages.append(file.section(QLatin1Char('_'), 1).section(QLatin1Char('.'), 0, 0));
     return languages;
 }

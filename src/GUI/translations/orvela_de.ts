@@ -382,6 +382,46 @@ Ihre Änderungen verloren. Fortfahren?</translation>
         <source>A step of the processing failed and was left out: %1 (%2)</source>
         <translation>Ein Schritt der Bearbeitung ist fehlgeschlagen und wurde ausgelassen: %1 (%2)</translation>
     </message>
+    <message>
+        <source>all sliders on</source>
+        <translation>alle Regler an</translation>
+    </message>
+    <message>
+        <source>all sliders off</source>
+        <translation>alle Regler aus</translation>
+    </message>
+    <message>
+        <source>%1 on</source>
+        <translation>%1 an</translation>
+    </message>
+    <message>
+        <source>%1 off</source>
+        <translation>%1 aus</translation>
+    </message>
+    <message>
+        <source>Color</source>
+        <translation>Farbe</translation>
+    </message>
+    <message>
+        <source>Information</source>
+        <translation>Hinweis</translation>
+    </message>
+    <message>
+        <source>%1 was loaded without what this window has no slider for: %2</source>
+        <translation>%1 wurde geladen, ausgenommen das, wofür dieses Fenster keinen Regler hat: %2</translation>
+    </message>
+    <message>
+        <source>preset %1</source>
+        <translation>Vorgabe %1</translation>
+    </message>
+    <message>
+        <source>reverting %1</source>
+        <translation>Zurücksetzen von %1</translation>
+    </message>
+    <message>
+        <source>This name is kept for the last operation. Choose another one.</source>
+        <translation>Dieser Name ist für den letzten Vorgang reserviert. Wählen Sie einen anderen.</translation>
+    </message>
 </context>
 <context>
     <name>CDlgSinglePreview</name>
@@ -448,6 +488,14 @@ Ihre Änderungen verloren. Fortfahren?</translation>
     <message>
         <source>Unknown preset:%1</source>
         <translation>Unbekannte Vorgabe: %1</translation>
+    </message>
+    <message>
+        <source>This preset already exists. Do you want to overwrite it?</source>
+        <translation>Diese Vorgabe gibt es schon. Möchten Sie sie überschreiben?</translation>
+    </message>
+    <message>
+        <source>A preset needs a name.</source>
+        <translation>Eine Vorgabe braucht einen Namen.</translation>
     </message>
 </context>
 <context>
@@ -851,6 +899,17 @@ Ihre Änderungen verloren. Fortfahren?</translation>
     </message>
 </context>
 <context>
+    <name>SettingsEdit</name>
+    <message>
+        <source>The settings could not be written to %1.</source>
+        <translation>Die Einstellungen konnten nicht in %1 geschrieben werden.</translation>
+    </message>
+    <message>
+        <source>The settings file %1 holds something else, and no copy of it could be made.</source>
+        <translation>Die Einstellungsdatei %1 enthält etwas anderes, und von ihr konnte keine Kopie angelegt werden.</translation>
+    </message>
+</context>
+<context>
     <name>SliderTable</name>
     <message>
         <source>Temperature</source>
@@ -1192,6 +1251,22 @@ Ihre Änderungen verloren. Fortfahren?</translation>
     </message>
 </context>
 <context>
+    <name>orvela::PaneHistory</name>
+    <message>
+        <source>%1: %2</source>
+        <comment>undo or redo: what</comment>
+        <translation>%1: %2</translation>
+    </message>
+    <message>
+        <source>Undo</source>
+        <translation>Rückgängig</translation>
+    </message>
+    <message>
+        <source>Redo</source>
+        <translation>Wiederholen</translation>
+    </message>
+</context>
+<context>
     <name>orvela::PreviewBar</name>
     <message>
         <source>Fit</source>
@@ -1262,6 +1337,10 @@ Ihre Änderungen verloren. Fortfahren?</translation>
     <message>
         <source>Ok</source>
         <translation>OK</translation>
+    </message>
+    <message>
+        <source>Message</source>
+        <translation>Mitteilung</translation>
     </message>
 </context>
 </TS>

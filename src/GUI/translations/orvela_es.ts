@@ -382,6 +382,46 @@ los cambios realizados. ¿Continuar?</translation>
         <source>A step of the processing failed and was left out: %1 (%2)</source>
         <translation>Falló un paso del procesamiento y se omitió: %1 (%2)</translation>
     </message>
+    <message>
+        <source>all sliders on</source>
+        <translation>todos los controles activados</translation>
+    </message>
+    <message>
+        <source>all sliders off</source>
+        <translation>todos los controles desactivados</translation>
+    </message>
+    <message>
+        <source>%1 on</source>
+        <translation>%1 activado</translation>
+    </message>
+    <message>
+        <source>%1 off</source>
+        <translation>%1 desactivado</translation>
+    </message>
+    <message>
+        <source>Color</source>
+        <translation>Color</translation>
+    </message>
+    <message>
+        <source>Information</source>
+        <translation>Información</translation>
+    </message>
+    <message>
+        <source>%1 was loaded without what this window has no slider for: %2</source>
+        <translation>%1 se ha cargado sin aquello para lo que esta ventana no tiene control: %2</translation>
+    </message>
+    <message>
+        <source>preset %1</source>
+        <translation>preajuste %1</translation>
+    </message>
+    <message>
+        <source>reverting %1</source>
+        <translation>restablecer %1</translation>
+    </message>
+    <message>
+        <source>This name is kept for the last operation. Choose another one.</source>
+        <translation>Este nombre está reservado para la última operación. Elija otro.</translation>
+    </message>
 </context>
 <context>
     <name>CDlgSinglePreview</name>
@@ -448,6 +488,14 @@ los cambios realizados. ¿Continuar?</translation>
     <message>
         <source>Unknown preset:%1</source>
         <translation>Preajuste desconocido: %1</translation>
+    </message>
+    <message>
+        <source>This preset already exists. Do you want to overwrite it?</source>
+        <translation>Este preajuste ya existe. ¿Desea sobrescribirlo?</translation>
+    </message>
+    <message>
+        <source>A preset needs a name.</source>
+        <translation>Un preajuste necesita un nombre.</translation>
     </message>
 </context>
 <context>
@@ -851,6 +899,17 @@ los cambios realizados. ¿Continuar?</translation>
     </message>
 </context>
 <context>
+    <name>SettingsEdit</name>
+    <message>
+        <source>The settings could not be written to %1.</source>
+        <translation>No se pudieron guardar los ajustes en %1.</translation>
+    </message>
+    <message>
+        <source>The settings file %1 holds something else, and no copy of it could be made.</source>
+        <translation>El archivo de ajustes %1 contiene otra cosa y no se pudo hacer una copia de él.</translation>
+    </message>
+</context>
+<context>
     <name>SliderTable</name>
     <message>
         <source>Temperature</source>
@@ -1192,6 +1251,22 @@ los cambios realizados. ¿Continuar?</translation>
     </message>
 </context>
 <context>
+    <name>orvela::PaneHistory</name>
+    <message>
+        <source>%1: %2</source>
+        <comment>undo or redo: what</comment>
+        <translation>%1: %2</translation>
+    </message>
+    <message>
+        <source>Undo</source>
+        <translation>Deshacer</translation>
+    </message>
+    <message>
+        <source>Redo</source>
+        <translation>Rehacer</translation>
+    </message>
+</context>
+<context>
     <name>orvela::PreviewBar</name>
     <message>
         <source>Fit</source>
@@ -1262,6 +1337,10 @@ los cambios realizados. ¿Continuar?</translation>
     <message>
         <source>Ok</source>
         <translation>Aceptar</translation>
+    </message>
+    <message>
+        <source>Message</source>
+        <translation>Mensaje</translation>
     </message>
 </context>
 </TS>

@@ -7,7 +7,9 @@
 #include "support/ModalDialog.h"
 #include "support/TestPlanes.h"
 
+#include <QLabel>
 #include <QMenu>
+#include <QPointer>
 #include <QTest>
 
 #include <gtest/gtest.h>
@@ -135,6 +137,19 @@ TEST_F(CDlgMainImplTest, AnUpdateThatWasFoundIsLinked) {
     EXPECT_FALSE(label->isHidden());
     EXPECT_EQ(label->text(),
               "<a href=\"http://kestrand.example/update2.5&quot;&gt;&lt;b&gt;.html\">Update Available</>");
+    EXPECT_TRUE(label->focusPolicy() & Qt::TabFocus); // for those without a mouse
+    EXPECT_TRUE(label->openExternalLinks());
+}
+
+TEST_F(CDlgMainImplTest, AboutAndInformationsMayLoseTheirParent) {
+    for (const auto show : {static_cast<void (CDlgMainImpl::*)(QDialog*)>(&CDlgMainImpl::doAbout),
+                            &CDlgMainImpl::doProgramInfos}) {
+        const QPointer<QDialog> parent = new QDialog;
+        const ModalDialogs user([&](QDialog&) { delete parent; });
+        ((*mWindow).*show)(parent);
+        EXPECT_FALSE(parent);
+        EXPECT_EQ(user.count, 1);
+    }
 }
 
 } // namespace

@@ -8,6 +8,7 @@
 #include "Settings/ModeTable.h"
 #include "gui/Windows/ProcessingWindow.h"
 #include "support/BoxAnswer.h"
+#include "support/BoxRecorder.h"
 #include "support/ModalDialog.h"
 
 #include <QComboBox>
@@ -191,6 +192,13 @@ TEST(CDlgSettingsImpl, PresetsAreSavedOverwrittenRevertedAndDeleted) {
             advanced.click("btnSavePreset");
         }
         EXPECT_EQ(presets->currentText(), "Mine");
+        {
+            const ModalDialogs hand(named(CPresetStore::batchPresetName()));
+            const QStringList told = boxes([&] { advanced.click("btnSavePreset"); });
+            EXPECT_EQ(told, QStringList("Warning|This name is kept for the last operation. "
+                                        "Choose another one."));
+            EXPECT_EQ(presets->findText(CPresetStore::batchPresetName()), -1);
+        }
         saturation->sldrValue->moveTo(800);
         QString said;
         answerBox(QMessageBox::Yes, said);

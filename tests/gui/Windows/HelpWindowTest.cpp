@@ -1,11 +1,14 @@
 #include "GUI/Windows/HelpWindow.h"
 
 #include "Platform/HelpViewer.h"
+#include "Settings/SettingsStore.h"
 #include "support/BoxRecorder.h"
 
 #include <QApplication>
 #include <QDesktopServices>
 #include <QDialog>
+#include <QDir>
+#include <QFile>
 #include <QLabel>
 #include <QLineEdit>
 #include <QMessageBox>
@@ -21,15 +24,6 @@
 #include <memory>
 
 using namespace orvela;
-
-// The macros declare functions of the namespace that they stand in, and the resource's are in none.
-static void initManual() {
-    Q_INIT_RESOURCE(manual);
-}
-
-static void dropManual() {
-    Q_CLEANUP_RESOURCE(manual);
-}
 
 namespace {
 
@@ -188,6 +182,15 @@ TEST_F(HelpWindowTest, RemembersItsPlace) {
     owner->show();
     open("welcome.htm");
     EXPECT_EQ(shownHelp()->geometry(), QRect(40, 50, 700, 500));
+    const QString store = openSettings().fileName();
+    QFile::remove(store);
+    ASSERT_TRUE(QDir().mkpath(store)); // which keeps it from being written
+    const QStringList told = boxes([] { shownHelp()->close(); });
+    ASSERT_EQ(told.size(), 1);
+    EXPECT_TRUE(told.first().contains(store));
+    ASSERT_TRUE(QDir().rmdir(store));
+    open("welcome.htm");
+    EXPECT_TRUE(boxes([] { shownHelp()->close(); }).isEmpty());
 }
 
 TEST_F(HelpWindowTest, TakesTheColoursOfThePalette) {
@@ -218,16 +221,14 @@ TEST_F(HelpWindowTest, HandsLinksToTheOutsideToTheDesktop) {
     EXPECT_EQ(desktop.asked, QUrl(QStringLiteral("https://kestrand.example/news")));
 }
 
-TEST_F(HelpWindowTest, WarnsWhereThereIsNoManualAtAll) {
+TEST_F(HelpWindowTest, ShowsItsOwnPagesWhereTheCompiledManualIsMissing) {
     shownHelp()->close();
-    dropManual();
     qputenv("ORVELA_DEBUG_MBOX", "1");
     const QStringList shown = boxes([&] { openHelp(QStringLiteral("welcome.htm"), owner.get()); });
     qunsetenv("ORVELA_DEBUG_MBOX");
     EXPECT_EQ(shown,
               QStringList(QStringLiteral("Warning|Help file missing:") + HelpViewer::compiledManual()));
-    EXPECT_FALSE(shownHelp());
-    initManual();
+    EXPECT_TRUE(shownHelp());
     EXPECT_FALSE(HelpViewer::show(owner->winId(), QStringLiteral("OrvelaManual.chm::/welcome.htm")));
 }
 
