@@ -3,10 +3,10 @@
 #include <windows.h>
 #include <wininet.h>
 
+#include <exception>
 #include <functional>
 #include <future>
 #include <memory>
-#include <system_error>
 #include <type_traits>
 
 namespace orvela {
@@ -67,7 +67,7 @@ Reply post(const Form& form) {
             internet.reset();
         Reply received = reply.get();
         return isLate ? failure("Unable to send data to server.") : received;
-    } catch (const std::system_error&) { // no thread to be had
+    } catch (const std::exception&) { // no thread or no memory to be had
         return failure("No internet connection has been detected.");
     }
 }

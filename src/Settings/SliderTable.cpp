@@ -121,7 +121,8 @@ constexpr SliderDescription kSliders[] = {
     {&P::mFade_Value, &P::mFade_Enabled, QT_TRANSLATE_NOOP("SliderTable", "Fade"), &Tenth, S::Main, Z::Fade,
      QT_TRANSLATE_NOOP(
          "SliderTable",
-         "Brings the original back after sharpness and digital flash: none of it at 0, most at 100.")},
+         "Brings the original back where sharpness or digital flash is on: none of it at 0, most at 100. Its "
+         "number counts even while it is off.")},
     {&P::mColor_Effect_Intensity_Value, &P::mColor_Effect_Intensity_Enabled,
      QT_TRANSLATE_NOOP("SliderTable", "Color Filter"), &Tenth, S::Main, Z::Neutral,
      QT_TRANSLATE_NOOP("SliderTable",
@@ -222,22 +223,20 @@ constexpr SliderDescription kSliders[] = {
     {&P::mMiddle_Touch_Value_R, &P::mMiddle_Touch_R_Enabled, QT_TRANSLATE_NOOP("SliderTable", "Middle"),
      &Gamma, S::FinalTouch, Z::NeutralLight,
      QT_TRANSLATE_NOOP("SliderTable",
-                       "Lightens the midtones of red above 1 and darkens them below, whatever the picture.")},
+                       "Multiplies the tones of red: lighter above 1, darker below, white included.")},
     {&P::mMiddle_Touch_Value_G, &P::mMiddle_Touch_G_Enabled, QT_TRANSLATE_NOOP("SliderTable", "Middle"),
      &Gamma, S::FinalTouch, Z::NeutralLight,
-     QT_TRANSLATE_NOOP(
-         "SliderTable",
-         "Lightens the midtones of green above 1 and darkens them below, whatever the picture.")},
+     QT_TRANSLATE_NOOP("SliderTable",
+                       "Multiplies the tones of green: lighter above 1, darker below, white included.")},
     {&P::mMiddle_Touch_Value_B, &P::mMiddle_Touch_B_Enabled, QT_TRANSLATE_NOOP("SliderTable", "Middle"),
      &Gamma, S::FinalTouch, Z::NeutralLight,
-     QT_TRANSLATE_NOOP(
-         "SliderTable",
-         "Lightens the midtones of blue above 1 and darkens them below, whatever the picture.")},
+     QT_TRANSLATE_NOOP("SliderTable",
+                       "Multiplies the tones of blue: lighter above 1, darker below, white included.")},
     {&P::mMiddle_Touch_Value_RGB, &P::mMiddle_Touch_RGB_Enabled, QT_TRANSLATE_NOOP("SliderTable", "Middle"),
      &Gamma, S::FinalTouch, Z::NeutralLight,
      QT_TRANSLATE_NOOP(
          "SliderTable",
-         "Lightens the midtones of all colours above 1 and darkens them below, whatever the picture.")},
+         "Multiplies the tones of all colours: lighter above 1, darker below, white included.")},
     {&P::mLight_Touch_Value_R, &P::mLight_Touch_R_Enabled, QT_TRANSLATE_NOOP("SliderTable", "Highlights"),
      &Highlights, S::FinalTouch, Z::Neutral,
      QT_TRANSLATE_NOOP(

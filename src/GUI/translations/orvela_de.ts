@@ -1084,10 +1084,6 @@ Ihre Änderungen verloren. Fortfahren?</translation>
         <translation>Abschwächen</translation>
     </message>
     <message>
-        <source>Brings the original back after sharpness and digital flash: none of it at 0, most at 100.</source>
-        <translation>Holt nach Schärfe und Digitalblitz das Original zurück: bei 0 gar nicht, bei 100 am meisten.</translation>
-    </message>
-    <message>
         <source>Color Filter</source>
         <translation>Farbfilter</translation>
     </message>
@@ -1164,22 +1160,6 @@ Ihre Änderungen verloren. Fortfahren?</translation>
         <translation>Vertieft die Schatten aller Farben, gleich bei welchem Bild: bei 0 gar nicht, bei 255 am meisten.</translation>
     </message>
     <message>
-        <source>Lightens the midtones of red above 1 and darkens them below, whatever the picture.</source>
-        <translation>Hellt die Mitteltöne von Rot über 1 auf und dunkelt sie darunter ab, gleich bei welchem Bild.</translation>
-    </message>
-    <message>
-        <source>Lightens the midtones of green above 1 and darkens them below, whatever the picture.</source>
-        <translation>Hellt die Mitteltöne von Grün über 1 auf und dunkelt sie darunter ab, gleich bei welchem Bild.</translation>
-    </message>
-    <message>
-        <source>Lightens the midtones of blue above 1 and darkens them below, whatever the picture.</source>
-        <translation>Hellt die Mitteltöne von Blau über 1 auf und dunkelt sie darunter ab, gleich bei welchem Bild.</translation>
-    </message>
-    <message>
-        <source>Lightens the midtones of all colours above 1 and darkens them below, whatever the picture.</source>
-        <translation>Hellt die Mitteltöne aller Farben über 1 auf und dunkelt sie darunter ab, gleich bei welchem Bild.</translation>
-    </message>
-    <message>
         <source>Brightens the highlights of red, whatever the picture: not at all at 255, most at 0.</source>
         <translation>Hellt die Lichter von Rot auf, gleich bei welchem Bild: bei 255 gar nicht, bei 0 am meisten.</translation>
     </message>
@@ -1202,6 +1182,26 @@ Ihre Änderungen verloren. Fortfahren?</translation>
     <message>
         <source>The colour of the glass that Color Filter lays over the finished picture.</source>
         <translation>Die Farbe des Glases, das der Farbfilter über das fertige Bild legt.</translation>
+    </message>
+    <message>
+        <source>Brings the original back where sharpness or digital flash is on: none of it at 0, most at 100. Its number counts even while it is off.</source>
+        <translation>Holt das Original zurück, wo Schärfe oder Digitalblitz an ist: bei 0 gar nicht, bei 100 am meisten. Die Zahl zählt auch, während er aus ist.</translation>
+    </message>
+    <message>
+        <source>Multiplies the tones of red: lighter above 1, darker below, white included.</source>
+        <translation>Vervielfacht die Töne von Rot: heller über 1, dunkler darunter, auch Weiß.</translation>
+    </message>
+    <message>
+        <source>Multiplies the tones of green: lighter above 1, darker below, white included.</source>
+        <translation>Vervielfacht die Töne von Grün: heller über 1, dunkler darunter, auch Weiß.</translation>
+    </message>
+    <message>
+        <source>Multiplies the tones of blue: lighter above 1, darker below, white included.</source>
+        <translation>Vervielfacht die Töne von Blau: heller über 1, dunkler darunter, auch Weiß.</translation>
+    </message>
+    <message>
+        <source>Multiplies the tones of all colours: lighter above 1, darker below, white included.</source>
+        <translation>Vervielfacht die Töne aller Farben: heller über 1, dunkler darunter, auch Weiß.</translation>
     </message>
 </context>
 <context>

@@ -1084,10 +1084,6 @@ los cambios realizados. ¿Continuar?</translation>
         <translation>Atenuar</translation>
     </message>
     <message>
-        <source>Brings the original back after sharpness and digital flash: none of it at 0, most at 100.</source>
-        <translation>Recupera el original tras la nitidez y el flash digital: nada con 0, lo máximo con 100.</translation>
-    </message>
-    <message>
         <source>Color Filter</source>
         <translation>Filtro de color</translation>
     </message>
@@ -1164,22 +1160,6 @@ los cambios realizados. ¿Continuar?</translation>
         <translation>Oscurece las sombras de todos los colores, sea cual sea la imagen: nada con 0, lo máximo con 255.</translation>
     </message>
     <message>
-        <source>Lightens the midtones of red above 1 and darkens them below, whatever the picture.</source>
-        <translation>Aclara los tonos medios del rojo por encima de 1 y los oscurece por debajo, sea cual sea la imagen.</translation>
-    </message>
-    <message>
-        <source>Lightens the midtones of green above 1 and darkens them below, whatever the picture.</source>
-        <translation>Aclara los tonos medios del verde por encima de 1 y los oscurece por debajo, sea cual sea la imagen.</translation>
-    </message>
-    <message>
-        <source>Lightens the midtones of blue above 1 and darkens them below, whatever the picture.</source>
-        <translation>Aclara los tonos medios del azul por encima de 1 y los oscurece por debajo, sea cual sea la imagen.</translation>
-    </message>
-    <message>
-        <source>Lightens the midtones of all colours above 1 and darkens them below, whatever the picture.</source>
-        <translation>Aclara los tonos medios de todos los colores por encima de 1 y los oscurece por debajo, sea cual sea la imagen.</translation>
-    </message>
-    <message>
         <source>Brightens the highlights of red, whatever the picture: not at all at 255, most at 0.</source>
         <translation>Aclara las luces del rojo, sea cual sea la imagen: nada con 255, lo máximo con 0.</translation>
     </message>
@@ -1202,6 +1182,26 @@ los cambios realizados. ¿Continuar?</translation>
     <message>
         <source>The colour of the glass that Color Filter lays over the finished picture.</source>
         <translation>El color del cristal que el filtro de color coloca sobre la imagen terminada.</translation>
+    </message>
+    <message>
+        <source>Brings the original back where sharpness or digital flash is on: none of it at 0, most at 100. Its number counts even while it is off.</source>
+        <translation>Recupera el original donde la nitidez o el flash digital están activados: nada con 0, lo máximo con 100. Su número cuenta también cuando está desactivado.</translation>
+    </message>
+    <message>
+        <source>Multiplies the tones of red: lighter above 1, darker below, white included.</source>
+        <translation>Multiplica los tonos del rojo: más claros por encima de 1, más oscuros por debajo, también el blanco.</translation>
+    </message>
+    <message>
+        <source>Multiplies the tones of green: lighter above 1, darker below, white included.</source>
+        <translation>Multiplica los tonos del verde: más claros por encima de 1, más oscuros por debajo, también el blanco.</translation>
+    </message>
+    <message>
+        <source>Multiplies the tones of blue: lighter above 1, darker below, white included.</source>
+        <translation>Multiplica los tonos del azul: más claros por encima de 1, más oscuros por debajo, también el blanco.</translation>
+    </message>
+    <message>
+        <source>Multiplies the tones of all colours: lighter above 1, darker below, white included.</source>
+        <translation>Multiplica los tonos de todos los colores: más claros por encima de 1, más oscuros por debajo, también el blanco.</translation>
     </message>
 </context>
 <context>
