@@ -36,7 +36,7 @@ void CThreadedCore::setParams(const CUserParamsPhotoshop& params) {
 void CThreadedCore::run() {
     const LogDepth ownDepth;
     mContext.dumpsPictures =
-        !mContext.excerpt &&
+        !mContext.playsTape &&
         openSettings().value(PresetTree::guiKey(QStringLiteral("dumpImageAfterFile"))).toInt() != 0;
     mTotalSteps = 0;
     mCurrentStep = 0;
@@ -47,6 +47,8 @@ void CThreadedCore::run() {
     mReports.clear();
     mTaskNumber = 0;
     mFailure = {};
+    if (mContext.tape && !mContext.playsTape)
+        *mContext.tape = MeasurementTape(mInPlane->pixelCount());
 
     announce(0, 1, "Duplicating Input Plane", "Copying the picture");
     emitPercentDone(0);
@@ -92,9 +94,14 @@ std::unique_ptr<CARGBPlane> CThreadedCore::snapshot(const QRect& area, int reduc
     return takeSnapshot(*mInPlane, area, reduction);
 }
 
-void CThreadedCore::setExcerpt(const Excerpt& excerpt, MeasurementTape* tape) {
-    mContext.excerpt = excerpt;
+void CThreadedCore::recordTape(MeasurementTape* tape) {
     mContext.tape = tape;
+    mContext.playsTape = false;
+}
+
+void CThreadedCore::playTape(MeasurementTape& tape) {
+    mContext.tape = &tape;
+    mContext.playsTape = true;
 }
 
 void CThreadedCore::stop() {
@@ -158,11 +165,11 @@ void CThreadedCore::runTask(const PipelineTask& task) {
 }
 
 bool CThreadedCore::playsInstead(const PipelineTask& task, const TaskBase& made) {
-    return mContext.tape && mContext.excerpt && isMeasurement(task, made) && mContext.tape->play(mParams);
+    return mContext.playsTape && isMeasurement(task, made) && mContext.tape->play(mParams);
 }
 
 void CThreadedCore::record(const PipelineTask& task, const TaskBase& made) {
-    if (mContext.tape && !mContext.excerpt && isMeasurement(task, made))
+    if (mContext.tape && !mContext.playsTape && isMeasurement(task, made))
         mContext.tape->record(mParams);
 }
 

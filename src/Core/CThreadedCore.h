@@ -51,11 +51,11 @@ public:
     /// proxy.
     void setProxy(const CARGBPlaneProxy* proxy) { mContext.proxy = proxy; }
 
-    /// Has the next runs record what they measure; null ends it.
-    void setTape(orvela::MeasurementTape* tape) { mContext.tape = tape; }
+    /// Has the next runs record what they measure, each over what was recorded before; null ends it.
+    void recordTape(orvela::MeasurementTape* tape);
     /// Makes the next runs drafts: the planes hold a part or a reduced copy of the picture that the tape was
     /// recorded of.
-    void setExcerpt(const orvela::Excerpt& excerpt, orvela::MeasurementTape* tape);
+    void playTape(orvela::MeasurementTape& tape);
 
     /// Runs the pipeline; the result is told by lastProcessingDone() and the last announcement, "All Done" or
     /// "Failed". A stopped run walks on through its announcements and ends with "All Done".

@@ -2,6 +2,8 @@
 
 #include <QList>
 
+#include <algorithm>
+
 namespace orvela {
 
 namespace {
@@ -27,8 +29,10 @@ void MeasurementTape::record(const CUserParams& found) {
 
 bool MeasurementTape::play(CUserParams& params) {
     const auto found = mFound.find(mPlace);
-    if (found == mFound.end())
+    if (found == mFound.end()) {
+        mMissed = true;
         return false;
+    }
     ++mPlace.second;
     params.pHisto_Luma = found->second.pHisto_Luma;
     params.pHisto_Red = found->second.pHisto_Red;
@@ -37,6 +41,22 @@ bool MeasurementTape::play(CUserParams& params) {
     for (const StatisticField& field : statisticFields())
         if (writes(mTask, field))
             field.setIn(params, field.valueIn(found->second));
+    return true;
+}
+
+void MeasurementTape::record(std::span<const float> numbers) {
+    mNumbers.insert_or_assign(mPlace, std::vector(numbers.begin(), numbers.end()));
+    ++mPlace.second;
+}
+
+bool MeasurementTape::play(std::span<float> numbers) {
+    const auto found = mNumbers.find(mPlace);
+    if (found == mNumbers.end()) {
+        mMissed = true;
+        return false;
+    }
+    ++mPlace.second;
+    std::copy(found->second.begin(), found->second.end(), numbers.begin());
     return true;
 }
 

@@ -49,15 +49,24 @@ TaskBase::TaskBase(const RunContext& context, CUserParams* params, CARGBPlane* i
 
 void TaskBase::measured(const std::function<void()>& measure) {
     MeasurementTape* tape = mContext.tape;
-    if (tape && mContext.excerpt && tape->play(*mParams))
+    if (mContext.playsTape && tape->play(*mParams))
         return;
     measure();
-    if (tape && !mContext.excerpt)
+    if (tape && !mContext.playsTape)
         tape->record(*mParams);
 }
 
+bool TaskBase::measured(std::span<float> numbers) {
+    MeasurementTape* tape = mContext.tape;
+    if (mContext.playsTape)
+        return tape->play(numbers);
+    if (tape)
+        tape->record(numbers);
+    return true;
+}
+
 std::int32_t TaskBase::picturePixels() const {
-    return mContext.excerpt ? mContext.excerpt->picturePixels : mInPlane->pixelCount();
+    return mContext.playsTape ? mContext.tape->picturePixels() : mInPlane->pixelCount();
 }
 
 bool TaskBase::Apply() {

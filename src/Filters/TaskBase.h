@@ -8,6 +8,7 @@
 #include <cstdint>
 #include <experimental/propagate_const>
 #include <functional>
+#include <span>
 
 class TaskBase;
 
@@ -130,6 +131,9 @@ protected:
     bool DoApplyParallel();
     /// Does a measurement that leaves histograms in the parameters, or takes what it found from the tape.
     void measured(const std::function<void()>& measure);
+    /// The same for numbers that only this task knows: in an excerpt those of the whole picture take their
+    /// place. False when these are not known.
+    bool measured(std::span<float> numbers);
     /// Number of pixels of the whole picture, which thresholds grow with.
     std::int32_t picturePixels() const;
     /// The index after the last one of the pass.

@@ -55,19 +55,6 @@ QList<Control*> namedControls(const QWidget* parent) {
     return controls;
 }
 
-PresetContent contentOf(const QWidget* parent) {
-    PresetContent content;
-    for (const auto* block : namedControls<COrvelaSliderBlockImpl>(parent))
-        content.sliders.append({block->objectName(), block->exactValue(), block->isEnabled()});
-    for (const auto* picker : namedControls<CColorPicker>(parent)) {
-        const QColor color = picker->color();
-        content.colors.append({picker->objectName(), color.red(), color.green(), color.blue()});
-    }
-    for (const auto* box : namedControls<QCheckBox>(parent))
-        content.checkBoxes.append({box->objectName(), box->isChecked()});
-    return content;
-}
-
 bool mayOverwrite() {
     return QMessageBox::question(static_cast<QWidget*>(DebugBoxes::mainWindow()), text("Warning"),
                                  text("This preset already exists. Do you want to overwrite it?"),
@@ -100,16 +87,31 @@ bool removePreset(EGUIMode mode, const QString& name) {
     return StoreWriting::commit(edit, StoreWriting::Cause::User);
 }
 
-void loadPreset(QWidget* parent, EGUIMode mode, const QString& name) {
-    const std::optional<PresetContent> stored = PresetTree::read(mode, name);
-    if (!stored)
-        return;
-    for (const PresetSlider& slider : stored->sliders)
+PresetContent contentOf(const QWidget* parent) {
+    PresetContent content;
+    for (const auto* block : namedControls<COrvelaSliderBlockImpl>(parent))
+        content.sliders.append({block->objectName(), block->exactValue(), block->isEnabled()});
+    for (const auto* picker : namedControls<CColorPicker>(parent)) {
+        const QColor color = picker->color();
+        content.colors.append({picker->objectName(), color.red(), color.green(), color.blue()});
+    }
+    for (const auto* box : namedControls<QCheckBox>(parent))
+        content.checkBoxes.append({box->objectName(), box->isChecked()});
+    return content;
+}
+
+void show(const QWidget* parent, const PresetContent& content) {
+    for (const PresetSlider& slider : content.sliders)
         load(parent, slider);
-    for (const PresetColor& color : stored->colors)
+    for (const PresetColor& color : content.colors)
         load(parent, color);
-    for (const PresetCheckBox& box : stored->checkBoxes)
+    for (const PresetCheckBox& box : content.checkBoxes)
         load(parent, box);
+}
+
+void loadPreset(QWidget* parent, EGUIMode mode, const QString& name) {
+    if (const std::optional<PresetContent> stored = PresetTree::read(mode, name))
+        show(parent, *stored);
 }
 
 void savePreset(QWidget* parent, EGUIMode mode, const QString& name, bool& saved, bool& isNew,

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Settings/FactoryPresets.h"
+#include "Settings/PresetTree.h"
 
 class QWidget;
 
@@ -28,6 +29,13 @@ bool hasPresets();
 /// Removes a preset, whichever it is. When the store cannot be written a warning says so and it stays.
 /// @return whether it is gone
 bool removePreset(EGUIMode mode, const QString& name);
+
+/// What a preset of the controls below `parent` that have a name would hold.
+orvela::PresetContent contentOf(const QWidget* parent);
+
+/// Puts `content` onto the controls below `parent`. Controls without an entry keep their state, entries
+/// without a control are skipped.
+void show(const QWidget* parent, const orvela::PresetContent& content);
 
 /// Puts a preset onto the controls below `parent`. Controls without an entry keep their state, entries
 /// without a control are skipped; without such a preset nothing happens.

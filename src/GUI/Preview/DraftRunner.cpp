@@ -7,7 +7,15 @@
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
 
+#include <cmath>
+
 namespace orvela {
+
+namespace {
+
+constexpr double kMeasuredPixels = 250'000; // tell of a picture nearly what all its pixels do
+
+}
 
 DraftRunner::DraftRunner(QObject* parent)
     : QObject(parent), mThread([this](const std::stop_token& stop) { work(stop); }) {}
@@ -46,58 +54,89 @@ std::optional<DraftRunner::Request> DraftRunner::next(const std::stop_token& sto
     std::unique_lock lock(mMutex);
     if (!mWoken.wait(lock, stop, [this] { return mWaiting.has_value(); }))
         return std::nullopt;
+    mBegun = mCancelled;
     return std::exchange(mWaiting, std::nullopt);
 }
 
+// Of one that was cancelled nothing is told, however far it came.
 void DraftRunner::process(const Request& request) {
-    int cancelled = 0;
-    {
-        const std::scoped_lock lock(mMutex);
-        cancelled = mCancelled;
-    }
     const std::shared_ptr<CARGBPlane> draft = draftOf(request);
-    const std::scoped_lock lock(mMutex);
-    if (!draft || cancelled != mCancelled)
+    if (!draft)
         return;
-    QMetaObject::invokeMethod(this, [this, draft, area = request.area, cancelled] {
-        if (cancelled == mCancelled)
+    QMetaObject::invokeMethod(this, [this, draft, area = request.area, begun = mBegun] {
+        if (begun == mCancelled)
             Q_EMIT done(draft, area);
     });
 }
 
 void DraftRunner::prepare(const Request& request) {
-    if (mSource.of == request.picture && mSource.area == request.area &&
-        mSource.reduction == request.reduction)
-        return;
-    mSource = {request.picture, request.area, request.reduction,
-               takeSnapshot(*request.picture, request.area, request.reduction),
-               takeSnapshot(*request.host, request.area, request.reduction)};
+    if (mSource.of != request.picture || mSource.area != request.area ||
+        mSource.reduction != request.reduction)
+        mSource = {request.picture, request.area, request.reduction,
+                   takeSnapshot(*request.picture, request.area, request.reduction),
+                   takeSnapshot(*request.host, request.area, request.reduction)};
+    if (mTapeOf.first != request.picture || mTapeOf.second != request.tape) {
+        mTapeOf = {request.picture, request.tape};
+        mTape = request.tape ? std::optional(*request.tape) : std::nullopt;
+    }
 }
 
 std::shared_ptr<CARGBPlane> DraftRunner::draftOf(const Request& request) {
     prepare(request);
-    CARGBPlane input(*mSource.picture, QStringLiteral("Draft input"));
-    auto output = std::make_shared<CARGBPlane>(*mSource.picture, QStringLiteral("Draft output"));
-    const CARGBPlaneProxyDirect host(*mSource.host, CARGBPlaneProxyDirect::Private);
+    if (mTape) {
+        MeasurementTape played = *mTape;
+        auto draft = run(request, *mSource.picture, *mSource.host,
+                         [&played](CThreadedCore& core) { core.playTape(played); });
+        if (!draft || !played.hasMissed())
+            return draft;
+    }
+    if (!measure(request))
+        return nullptr;
+    MeasurementTape played = *mTape;
+    return run(request, *mSource.picture, *mSource.host,
+               [&played](CThreadedCore& core) { core.playTape(played); });
+}
+
+// These settings need what no run has measured: a small copy of the whole picture tells it nearly.
+bool DraftRunner::measure(const Request& request) {
+    const CARGBPlane& picture = *request.picture;
+    const QRect whole(0, 0, picture.width(), picture.height());
+    const auto reduction = static_cast<int>(std::ceil(std::sqrt(picture.pixelCount() / kMeasuredPixels)));
+    mTapeOf = {};
+    mTape.emplace();
+    if (!run(request, *takeSnapshot(picture, whole, reduction),
+             *takeSnapshot(*request.host, whole, reduction),
+             [this](CThreadedCore& core) { core.recordTape(&*mTape); }))
+        return false;
+    mTapeOf = {request.picture, request.tape};
+    return true;
+}
+
+std::shared_ptr<CARGBPlane> DraftRunner::run(const Request& request, const CARGBPlane& picture,
+                                             const CARGBPlane& host,
+                                             const std::function<void(CThreadedCore&)>& setUp) {
+    CARGBPlane input(picture, QStringLiteral("Draft input"));
+    auto output = std::make_shared<CARGBPlane>(picture, QStringLiteral("Draft output"));
+    const CARGBPlaneProxyDirect proxy(host, CARGBPlaneProxyDirect::Private);
     std::unique_ptr<CThreadedCore> core;
     if (request.finalTouch)
         core = std::make_unique<CThreadedCore_FinalTouch>(&input, output.get());
     else
         core = std::make_unique<CThreadedCore_Orvela>(&input, output.get());
     connect(core.get(), &CThreadedCore::stepDone, core.get(), [&core] { core->stepHandled(); });
-    core->setProxy(&host);
+    core->setProxy(&proxy);
     core->setParams(request.params);
-    std::optional<MeasurementTape> tape;
-    if (request.tape)
-        core->setExcerpt({request.picture->pixelCount(), request.reduction}, &tape.emplace(*request.tape));
+    setUp(*core);
     {
         const std::scoped_lock lock(mMutex);
+        if (mBegun != mCancelled)
+            return nullptr;
         mCore = core.get();
     }
     core->run();
     const std::scoped_lock lock(mMutex);
     mCore = nullptr;
-    return core->lastProcessingDone() ? output : nullptr;
+    return core->lastProcessingDone() && mBegun == mCancelled ? output : nullptr;
 }
 
 } // namespace orvela

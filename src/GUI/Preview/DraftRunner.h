@@ -58,14 +58,23 @@ private:
     void process(const Request& request);
     void prepare(const Request& request);
     std::shared_ptr<CARGBPlane> draftOf(const Request& request);
+    bool measure(const Request& request);
+    std::shared_ptr<CARGBPlane> run(const Request& request, const CARGBPlane& picture, const CARGBPlane& host,
+                                    const std::function<void(CThreadedCore&)>& setUp);
 
     std::mutex mMutex;
     std::condition_variable_any mWoken;
     std::optional<Request> mWaiting;
     CThreadedCore* mCore = nullptr; ///< that works now
     int mCancelled = 0;             ///< how often
-    Source mSource;                 ///< of the thread alone
-    std::jthread mThread;           ///< last: ends before the rest
+
+    // Of the thread alone.
+    int mBegun = 0; ///< mCancelled when the request was taken
+    Source mSource;
+    std::optional<MeasurementTape> mTape; ///< that is played
+    std::pair<std::shared_ptr<const CARGBPlane>, std::shared_ptr<const MeasurementTape>> mTapeOf;
+
+    std::jthread mThread; ///< last: ends before the rest
 };
 
 } // namespace orvela

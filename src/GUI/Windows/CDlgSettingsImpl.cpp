@@ -2,7 +2,6 @@
 
 #include "Core/CThreadedCore.h"
 #include "GUI/Controls/COrvelaSliderBlockImpl.h"
-#include "GUI/Controls/CThinHorizontalSlider.h"
 #include "GUI/Panes/CWgtPane3SlidersImpl.h"
 #include "GUI/Panes/CWgtPaneAdvancedImpl.h"
 #include "GUI/Panes/CWgtPaneFinalTouchImpl.h"
@@ -13,6 +12,7 @@
 #include "GUI/Preview/CSignaledGraphicsView.h"
 #include "GUI/Preview/DraftRunner.h"
 #include "GUI/Windows/CDlgCustomPresetImpl.h"
+#include "GUI/Windows/PaneHistory.h"
 #include "GUI/Windows/Previews.h"
 #include "GUI/Windows/Translations.h"
 #include "GUI/Windows/WindowSetup.h"
@@ -22,7 +22,7 @@
 #include "Utility/CGenericEx.h"
 #include "Utility/DebugBoxes.h"
 
-#include <QShortcut>
+#include <QScopedValueRollback>
 
 using namespace orvela;
 
@@ -82,7 +82,9 @@ CDlgSettingsImpl::CDlgSettingsImpl(EGUIMode mode, CARGBPlane* inPlane, CARGBPlan
     connect(this, &QDialog::finished, this, &CDlgSettingsImpl::onMy_this_finished);
     connect(lstBxPreset, &QComboBox::currentIndexChanged, this,
             [this](int index) { on_lstBxPreset_currentIndexChanged(lstBxPreset->itemText(index)); });
-    addShortcuts();
+    mHistory = new PaneHistory([this](const PaneState& state) { showPaneState(state); }, this);
+    addKeys();
+    acceptDropsOn(this);
     CPresetStore::ensureFactoryPresets(this);
     // A native window is to be there before anything else happens.
     show();
@@ -90,24 +92,6 @@ CDlgSettingsImpl::CDlgSettingsImpl(EGUIMode mode, CARGBPlane* inPlane, CARGBPlan
 }
 
 CDlgSettingsImpl::~CDlgSettingsImpl() = default;
-
-void CDlgSettingsImpl::addShortcuts() {
-    const auto add = [this](const QKeySequence& keys, QAbstractButton* button) {
-        connect(new QShortcut(keys, this), &QShortcut::activated, button, [button] {
-            if (button->isVisible())
-                button->click();
-        });
-        button->setToolTip(tr("%1 (%2)", "tool tip and keys")
-                               .arg(button->toolTip(), keys.toString(QKeySequence::NativeText)));
-    };
-    add(Qt::Key_F5, btnRefresh);
-    add(Qt::CTRL | Qt::Key_Period, btnStopProcessing);
-    add(QKeySequence::ZoomIn, btnZoomIn);
-    add(QKeySequence::ZoomOut, btnZoomOut);
-    add(QKeySequence::Save, btnSavePreset);
-    add(Qt::CTRL | Qt::Key_Return, btnOK);
-    add(QKeySequence::HelpContents, btnHelp);
-}
 
 void CDlgSettingsImpl::run() {
     const CBatchMode& batch = CBatchMode::instance();
@@ -166,6 +150,7 @@ void CDlgSettingsImpl::runInteractive(EGUIMode mode) {
 
 void CDlgSettingsImpl::makePreviews() {
     mPreviews = std::make_unique<Previews>(this);
+    addKeysToPreviews();
     CSignaledGraphicsView* original = mPreviews->originalView();
     CSignaledGraphicsView* processed = mPreviews->processedView();
     connect(original, &CSignaledGraphicsView::scrolledBy, this,
@@ -187,11 +172,8 @@ void CDlgSettingsImpl::makePreviews() {
 }
 
 void CDlgSettingsImpl::changeMode(EGUIMode mode) {
-    if (mRunning) {
-        mModeWanted = mode;
-        mCore->stop();
-        return;
-    }
+    if (mRunning)
+        return stopFor([this, mode] { changeMode(mode); });
     guarded([&] {
         const EGUIMode before = std::exchange(mMode, mode);
         if (before == Mode_Advanced && mode == Mode_FinalTouch) {
@@ -199,10 +181,14 @@ void CDlgSettingsImpl::changeMode(EGUIMode mode) {
             mAdvancedAutoRefresh = chkBxAutoRefresh->isChecked();
         }
         setWindowTitle(Translations::modeName(mode));
-        makePane(mode);
-        makeCore();
-        fillPresets();
-        on_lstBxPreset_currentIndexChanged(lstBxPreset->currentText());
+        {
+            const QScopedValueRollback<bool> together(mTogether, true);
+            makePane(mode);
+            makeCore();
+            fillPresets();
+            on_lstBxPreset_currentIndexChanged(lstBxPreset->currentText());
+        }
+        startTimer();
         QTimer::singleShot(0, this, &CDlgSettingsImpl::restoreWindowsStates);
         layout()->setSizeConstraint(QLayout::SetFixedSize);
         mUpToDate = false;
@@ -210,6 +196,7 @@ void CDlgSettingsImpl::changeMode(EGUIMode mode) {
             lstBxPreset->setCurrentIndex(mAdvancedPreset);
             chkBxAutoRefresh->setChecked(mAdvancedAutoRefresh);
         }
+        mHistory->begin(paneState());
     });
 }
 
@@ -222,8 +209,7 @@ void CDlgSettingsImpl::makePane(EGUIMode mode) {
     mPane = newPane(this, mode);
     connect(mPane, &IWgtPane::changeMode, this, &CDlgSettingsImpl::changeMode);
     centralLayout->addWidget(mPane);
-    for (const CThinHorizontalSlider* slider : mPane->findChildren<CThinHorizontalSlider*>())
-        connect(slider, &CThinHorizontalSlider::valueChanged, this, &CDlgSettingsImpl::sliderMoves);
+    preparePane();
     enableProfiling(mPane->showsPresets());
     chkBxAutoRefresh->setChecked(mPane->autoRefresh());
     btnRefresh->setVisible(!mUpToDate);
@@ -236,6 +222,8 @@ void CDlgSettingsImpl::makeCore() {
         mCore->deleteLater();
     mCore = nullptr;
     mWholeTape.reset(); // of another picture
+    if (mDrafts)
+        mDrafts->cancel();
     prepareInput();
     mCore = mPane->createCore(mInPlane, mOutPlane, this);
     connect(mCore, &CThreadedCore::started, this, &CDlgSettingsImpl::onMy_thrdCore_started);
@@ -315,8 +303,10 @@ void CDlgSettingsImpl::on_btnTurnAllOff_clicked() {
 }
 
 void CDlgSettingsImpl::turnAll(bool on) {
-    for (COrvelaSliderBlockImpl* block : mPane->findChildren<COrvelaSliderBlockImpl*>())
-        block->setEnabled(on);
+    together(on ? tr("all sliders on") : tr("all sliders off"), [this, on] {
+        for (COrvelaSliderBlockImpl* block : mPane->findChildren<COrvelaSliderBlockImpl*>())
+            block->setEnabled(on);
+    });
 }
 
 void CDlgSettingsImpl::on_btnHelp_clicked() {
@@ -335,6 +325,7 @@ void CDlgSettingsImpl::restoreWindowsStates() {
     setSplitView(PresetTree::switchOf(settings.value(PresetTree::guiKey(kSplit))));
     if (mMode == Mode_Advanced)
         selectPreset(settings.value(PresetTree::guiKey(kSelected), QStringLiteral("Automatic")).toString());
+    mHistory->begin(paneState()); // nothing of this was the user's
 }
 
 void CDlgSettingsImpl::onMy_this_finished(int) {

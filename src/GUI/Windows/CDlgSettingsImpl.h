@@ -9,16 +9,18 @@
 #include <exception>
 #include <functional>
 #include <memory>
-#include <optional>
 
 class CARGBPlane;
 class CThreadedCore;
+class CThinHorizontalSlider;
 class IWgtPane;
 
 namespace orvela {
 class DraftRunner;
 class MeasurementTape;
+class PaneHistory;
 class Previews;
+struct PaneState;
 } // namespace orvela
 
 /// The window in which a mode runs: the sliders of the mode, previews of the original and the processed
@@ -89,6 +91,10 @@ public Q_SLOTS:
     /// Stops a run, whose result is not used, and closes.
     void reject() override;
 
+protected:
+    /// Presets are dropped on this window and those of the previews.
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
 private:
     // CDlgSettingsImpl.cpp: the window and its modes
     void runPreset(EGUIMode mode);
@@ -100,8 +106,23 @@ private:
     void makeCore();
     void prepareInput();
     void connectSource(QWidget* source);
-    void addShortcuts();
     void turnAll(bool on);
+
+    // CDlgSettingsKeys.cpp
+    void addKeys();
+    void addKeysToPreviews();
+    void showKeys(const QWidget* root);
+
+    // CDlgSettingsPane.cpp: what the user does to the pane
+    void preparePane();
+    orvela::PaneState paneState() const;
+    void showPaneState(const orvela::PaneState& state);
+    void together(const QString& what, const std::function<void()>& action);
+    void settingsChanged(const QString& what);
+    void sliderMoves(const CThinHorizontalSlider* slider);
+    void requestRefresh();
+    void acceptDropsOn(QWidget* window);
+    void loadDropped(const QList<QUrl>& urls);
 
     // CDlgSettingsPresets.cpp
     void fillPresets();
@@ -109,8 +130,7 @@ private:
     bool savePresetAs(const QString& name, bool asks, bool& isNew);
 
     // CDlgSettingsRuns.cpp
-    void settingsChanged();
-    void sliderMoves();
+    void stopFor(const std::function<void()>& action);
     void requestDraft();
     void startTimer();
     void runCore();
@@ -131,16 +151,18 @@ private:
     std::shared_ptr<const CARGBPlane> mOriginalCopy;     ///< for drafts
     std::shared_ptr<orvela::MeasurementTape> mTape;      ///< of the run under way
     std::shared_ptr<orvela::MeasurementTape> mWholeTape; ///< of the last whole run
+    orvela::PaneHistory* mHistory;
     QTimer mRefreshTimer;
     std::function<void(const QString&)> mOpenPage;
 
     bool mUpToDate = false;
+    bool mTogether = false; ///< changes of the pane belong to one
     bool mApplyOnFinish = false;
     bool mRunInNonInteractiveMode = false;
 
     bool mRunning = false;
     bool mRefreshWanted = false;         ///< once the run that is being stopped has returned
-    std::optional<EGUIMode> mModeWanted; ///< likewise
+    std::function<void()> mActionWanted; ///< likewise
     bool mStoppedByUser = false;         ///< the last run; its result is not the whole one
     bool mStatesRestored = false;
     std::exception_ptr mFailure; ///< for the caller of run()

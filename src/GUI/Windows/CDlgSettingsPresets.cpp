@@ -53,9 +53,11 @@ void CDlgSettingsImpl::selectPreset(const QString& name) {
 void CDlgSettingsImpl::on_lstBxPreset_currentIndexChanged(const QString& name) {
     if (!mPane)
         return;
-    if (CPresetStore::isFactoryPresetName(name))
-        mPane->setSliders(lstBxPreset->currentText());
-    CPresetStore::loadPreset(mPane, mMode, name);
+    together(tr("preset %1").arg(name), [&] {
+        if (CPresetStore::isFactoryPresetName(name))
+            mPane->setSliders(lstBxPreset->currentText());
+        CPresetStore::loadPreset(mPane, mMode, name);
+    });
 }
 
 bool CDlgSettingsImpl::savePresetAs(const QString& name, bool asks, bool& isNew) {
@@ -101,11 +103,10 @@ void CDlgSettingsImpl::on_btnRevertPreset_clicked() {
             QMessageBox::Yes | QMessageBox::No) != QMessageBox::Yes)
         return;
     const QString name = lstBxPreset->currentText();
-    if (!CPresetStore::isFactoryPresetName(name)) {
-        CPresetStore::loadPreset(mPane, mMode, name);
-        return;
-    }
-    mPane->setSliders(name);
+    const QString what = tr("reverting %1").arg(name);
+    if (!CPresetStore::isFactoryPresetName(name))
+        return together(what, [&] { CPresetStore::loadPreset(mPane, mMode, name); });
+    together(what, [&] { mPane->setSliders(name); });
     bool isNew = false;
     if (!savePresetAs(name, false, isNew))
         DebugBoxes::debugWarning(QStringLiteral("Success failed."), QStringLiteral("Debug Warning"));

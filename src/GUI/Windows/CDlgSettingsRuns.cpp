@@ -4,6 +4,7 @@
 #include "GUI/Presets/CPresetStore.h"
 #include "GUI/Preview/DraftRunner.h"
 #include "GUI/Windows/CDlgSettingsImpl.h"
+#include "GUI/Windows/PaneHistory.h"
 #include "GUI/Windows/Previews.h"
 #include "GUI/Windows/Translations.h"
 #include "Utility/CGenericEx.h"
@@ -13,31 +14,6 @@
 #include <QScopedValueRollback>
 
 using namespace orvela;
-
-void CDlgSettingsImpl::onMy_slider_valueChanged(double) {
-    settingsChanged();
-}
-
-void CDlgSettingsImpl::onMy_slider_stateChanged(bool) {
-    settingsChanged();
-}
-
-void CDlgSettingsImpl::onMy_colorPicker_colorChanged(QColor) {
-    settingsChanged();
-}
-
-void CDlgSettingsImpl::settingsChanged() {
-    mUpToDate = false;
-    startTimer();
-    requestDraft();
-}
-
-// The refresh waits for the end of the movement.
-void CDlgSettingsImpl::sliderMoves() {
-    if (mRefreshTimer.isActive())
-        mRefreshTimer.start();
-    requestDraft();
-}
 
 void CDlgSettingsImpl::requestDraft() {
     if (!mPreviews || mRunning || !isVisible())
@@ -95,22 +71,28 @@ void CDlgSettingsImpl::runCore() {
     if (mDrafts)
         mDrafts->cancel();
     mTape = std::make_shared<MeasurementTape>();
-    mCore->setTape(mPreviews ? mTape.get() : nullptr);
+    mCore->recordTape(mPreviews ? mTape.get() : nullptr);
     const QScopedValueRollback<bool> running(mRunning, true);
     Q_EMIT mCore->started();
     mCore->run();
     Q_EMIT mCore->finished();
 }
 
+// What cannot be done beside the run that is under way comes after it.
+void CDlgSettingsImpl::stopFor(const std::function<void()>& action) {
+    mActionWanted = action;
+    mCore->stop();
+}
+
 // What was asked for meanwhile. Not at once: this may be called from within a slot of the pane.
 void CDlgSettingsImpl::runEnded() {
     const bool again = std::exchange(mRefreshWanted, false);
-    const std::optional<EGUIMode> mode = std::exchange(mModeWanted, std::nullopt);
+    const std::function<void()> action = std::exchange(mActionWanted, nullptr);
     if (!isVisible())
         return; // closed by what happened meanwhile
     tellFailures();
-    if (mode)
-        QTimer::singleShot(0, this, [this, mode] { changeMode(*mode); });
+    if (action)
+        QTimer::singleShot(0, this, action);
     else if (again)
         QTimer::singleShot(0, this, &CDlgSettingsImpl::on_btnRefresh_clicked);
 }
@@ -122,6 +104,7 @@ void CDlgSettingsImpl::onMy_thrdCore_started() {
     btnRefresh->hide();
     btnStopProcessing->show();
     mPane->setEnabled(false);
+    mHistory->setUsable(false);
     if (!mPane->takesProcessedImage())
         mInPlane->copyFrom(original());
 }
@@ -148,6 +131,7 @@ void CDlgSettingsImpl::onMy_thrdCore_finished() {
     btnRefresh->setVisible(!chkBxAutoRefresh->isChecked());
     btnOK->setEnabled(true);
     mPane->setEnabled(true);
+    mHistory->setUsable(true);
     // A stopped run ends like any other, but its picture is not the one that was asked for.
     mUpToDate = !mRefreshWanted && !mStoppedByUser;
     if (mUpToDate && mCore->lastProcessingDone())
@@ -190,7 +174,7 @@ void CDlgSettingsImpl::accept() {
 void CDlgSettingsImpl::reject() {
     mApplyOnFinish = false;
     mRefreshWanted = false;
-    mModeWanted.reset();
+    mActionWanted = nullptr;
     if (mCore)
         mCore->stop();
     QDialog::reject();

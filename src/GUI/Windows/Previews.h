@@ -5,12 +5,14 @@
 
 #include <QElapsedTimer>
 #include <QObject>
-#include <QPointer>
+
+#include <functional>
 
 class CDlgDualPreviewImpl;
 class CDlgSinglePreviewImpl;
 class CSignaledGraphicsView;
 class CThreadedCore;
+class QAction;
 class QSettings;
 class QWidget;
 
@@ -59,6 +61,12 @@ public:
     /// The copy of the original that is shown.
     std::shared_ptr<const CARGBPlane> originalCopy() const { return mOriginal.plane(); }
 
+    /// The windows, whichever are shown.
+    QList<QWidget*> windows() const;
+    /// Fit, 100 % and the line to compare by. F2, held in any of the windows or the owner's, shows the
+    /// original; so does Space in the pictures.
+    const QList<QAction*>& keys() const { return mKeys; }
+
     /// Shows the windows: two when split.
     void setSplit(bool split);
     bool isSplit() const { return mSplit; }
@@ -98,6 +106,8 @@ protected:
 
 private:
     CSignaledGraphicsView* makeView(PreviewPicture& picture);
+    void addKey(Qt::Key key, Qt::KeyboardModifiers modifiers, const std::function<void()>& action);
+    bool isHoldKey(const QObject* watched, int key) const;
     void scaleTo(double scale);
     double deviceScale() const;
     void placeBesideOwner();
@@ -111,6 +121,7 @@ private:
     CDlgDualPreviewImpl* mJoined;
     CDlgSinglePreviewImpl* mOrig;
     CDlgSinglePreviewImpl* mProc;
+    QList<QAction*> mKeys;
     bool mSplit = false;
     int mStep = ZoomTable::kFit;
     float mBaseScale = 1;

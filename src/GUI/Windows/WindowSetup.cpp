@@ -4,6 +4,7 @@
 #include "Settings/PresetTree.h"
 #include "Settings/SettingsStore.h"
 
+#include <QCoreApplication>
 #include <QGuiApplication>
 #include <QPoint>
 #include <QScreen>
@@ -40,6 +41,13 @@ void flatten(std::initializer_list<QWidget*> buttons) {
             palette.setBrush(QPalette::All, role, window);
         button->setPalette(palette);
     }
+}
+
+QString withKeys(const QString& toolTip, const QList<QKeySequence>& keys) {
+    if (keys.isEmpty())
+        return toolTip;
+    return QCoreApplication::translate("CDlgSettingsImpl", "%1 (%2)", "tool tip and keys")
+        .arg(toolTip, keys.first().toString(QKeySequence::NativeText));
 }
 
 void restorePosition(QWidget& window) {

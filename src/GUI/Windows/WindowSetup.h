@@ -1,7 +1,9 @@
 #pragma once
 
 #include <QFont>
+#include <QKeySequence>
 #include <QList>
+#include <QString>
 
 #include <initializer_list>
 
@@ -15,6 +17,9 @@ class SettingsEdit;
 
 /// Takes the relief from buttons: the shading roles of their palette become the brush of the window.
 void flatten(std::initializer_list<QWidget*> buttons);
+
+/// A tool tip that tells the keys of what it belongs to, if there are any.
+QString withKeys(const QString& toolTip, const QList<QKeySequence>& keys);
 
 /// Moves a window that has not been shown to where the settings store says that one of its class was last. It
 /// stays where it is when there is none, or when no screen shows its title there.
