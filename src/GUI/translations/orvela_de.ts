@@ -400,11 +400,11 @@ Ihre Änderungen verloren. Fortfahren?</translation>
     </message>
     <message>
         <source>Color</source>
-        <translation type="unfinished">Farbe</translation>
+        <translation>Farbe</translation>
     </message>
     <message>
         <source>Information</source>
-        <translation type="unfinished">Hinweis</translation>
+        <translation>Hinweis</translation>
     </message>
     <message>
         <source>%1 was loaded without what this window has no slider for: %2</source>

@@ -400,11 +400,11 @@ los cambios realizados. ¿Continuar?</translation>
     </message>
     <message>
         <source>Color</source>
-        <translation type="unfinished">Color</translation>
+        <translation>Color</translation>
     </message>
     <message>
         <source>Information</source>
-        <translation type="unfinished">Información</translation>
+        <translation>Información</translation>
     </message>
     <message>
         <source>%1 was loaded without what this window has no slider for: %2</source>
