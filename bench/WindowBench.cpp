@@ -18,7 +18,6 @@
 #include <QPointingDevice>
 #include <QScrollBar>
 #include <QTemporaryDir>
-#include <QTimer>
 #include <QToolButton>
 
 #include <benchmark/benchmark.h>
@@ -81,7 +80,7 @@ public:
 
     /// Does `action` while the window is open, with the result of a whole run shown.
     void run(const std::function<void()>& action) {
-        QTimer::singleShot(0, &window, [&] {
+        const auto user = [&] {
             wait(200);
             window.findChild<CDlgDualPreviewImpl*>()->resize(kPreviews);
             window.findChild<QComboBox*>(QStringLiteral("lstBxPreset"))
@@ -90,7 +89,8 @@ public:
             button("btnRefresh").click();
             action();
             window.reject();
-        });
+        };
+        QMetaObject::invokeMethod(&window, user, Qt::QueuedConnection);
         window.run();
     }
 

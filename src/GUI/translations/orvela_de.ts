@@ -885,6 +885,18 @@ Ihre Änderungen verloren. Fortfahren?</translation>
         <source>Automatic gamma, second pass</source>
         <translation>Automatisches Gamma, zweiter Durchgang</translation>
     </message>
+    <message>
+        <source>Copying the picture</source>
+        <translation>Bild kopieren</translation>
+    </message>
+    <message>
+        <source>Done</source>
+        <translation>Fertig</translation>
+    </message>
+    <message>
+        <source>Failed</source>
+        <translation>Fehlgeschlagen</translation>
+    </message>
 </context>
 <context>
     <name>SliderTable</name>

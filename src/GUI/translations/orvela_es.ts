@@ -885,6 +885,18 @@ los cambios realizados. ¿Continuar?</translation>
         <source>Automatic gamma, second pass</source>
         <translation>Gamma automático, segunda pasada</translation>
     </message>
+    <message>
+        <source>Copying the picture</source>
+        <translation>Copiando la imagen</translation>
+    </message>
+    <message>
+        <source>Done</source>
+        <translation>Terminado</translation>
+    </message>
+    <message>
+        <source>Failed</source>
+        <translation>Error</translation>
+    </message>
 </context>
 <context>
     <name>SliderTable</name>
