@@ -162,7 +162,7 @@ private:
     bool mRunning = false;
     bool mRefreshWanted = false;         ///< once the run that is being stopped has returned
     std::function<void()> mActionWanted; ///< likewise
-    bool mStoppedByUser = false;         ///< the last run; its result is not the whole one
+    bool mRunIsStale = false;            ///< was stopped, or the settings have changed since it began
     bool mStatesRestored = false;
     std::exception_ptr mFailure; ///< for the caller of run()
 

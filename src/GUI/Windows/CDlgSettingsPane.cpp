@@ -68,6 +68,9 @@ void CDlgSettingsImpl::together(const QString& what, const std::function<void()>
 
 void CDlgSettingsImpl::requestRefresh() {
     mUpToDate = false;
+    mRunIsStale = true;
+    if (mRunning && mApplyOnFinish)
+        return on_btnRefresh_clicked(); // what is applied is what the pane says
     startTimer();
     requestDraft();
 }

@@ -46,7 +46,7 @@ void CDlgSettingsImpl::on_chkBxAutoRefresh_clicked(bool checked) {
 // Asked for in the middle of a run, it is made up for once that has returned.
 void CDlgSettingsImpl::on_btnRefresh_clicked() {
     if (mRunning) {
-        mUpToDate = false;
+        mRunIsStale = true;
         mRefreshWanted = true;
         mCore->stop();
         return;
@@ -62,7 +62,7 @@ void CDlgSettingsImpl::on_btnRefresh_clicked() {
 
 void CDlgSettingsImpl::runCore() {
     mUpToDate = false;
-    mStoppedByUser = false;
+    mRunIsStale = false;
     CUserParamsPhotoshop params(mMode);
     mPane->applyGUIParams(params);
     mCore->setParams(params);
@@ -81,6 +81,8 @@ void CDlgSettingsImpl::runCore() {
 // What cannot be done beside the run that is under way comes after it.
 void CDlgSettingsImpl::stopFor(const std::function<void()>& action) {
     mActionWanted = action;
+    mApplyOnFinish = false;
+    mRunIsStale = true;
     mCore->stop();
 }
 
@@ -132,8 +134,7 @@ void CDlgSettingsImpl::onMy_thrdCore_finished() {
     btnOK->setEnabled(true);
     mPane->setEnabled(true);
     mHistory->setUsable(true);
-    // A stopped run ends like any other, but its picture is not the one that was asked for.
-    mUpToDate = !mRefreshWanted && !mStoppedByUser;
+    mUpToDate = !mRunIsStale;
     if (mUpToDate && mCore->lastProcessingDone())
         mWholeTape = mTape;
     if (!mCore->lastProcessingDone()) {
@@ -151,7 +152,7 @@ void CDlgSettingsImpl::onMy_thrdCore_finished() {
 void CDlgSettingsImpl::on_btnStopProcessing_clicked() {
     mApplyOnFinish = false;
     mRefreshWanted = false;
-    mStoppedByUser = true;
+    mRunIsStale = true;
     mCore->stop();
 }
 

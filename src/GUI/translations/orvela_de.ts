@@ -384,7 +384,7 @@ Ihre Änderungen verloren. Fortfahren?</translation>
     </message>
     <message>
         <source>all sliders on</source>
-        <translation>alle Regler an</translation>
+        <translation>alle Regler ein</translation>
     </message>
     <message>
         <source>all sliders off</source>
@@ -392,7 +392,7 @@ Ihre Änderungen verloren. Fortfahren?</translation>
     </message>
     <message>
         <source>%1 on</source>
-        <translation>%1 an</translation>
+        <translation>%1 ein</translation>
     </message>
     <message>
         <source>%1 off</source>
@@ -408,7 +408,7 @@ Ihre Änderungen verloren. Fortfahren?</translation>
     </message>
     <message>
         <source>%1 was loaded without what this window has no slider for: %2</source>
-        <translation>%1 wurde geladen, ausgenommen das, wofür dieses Fenster keinen Regler hat: %2</translation>
+        <translation>%1 wurde geladen, jedoch ohne das, wofür dieses Fenster keinen Regler hat: %2</translation>
     </message>
     <message>
         <source>preset %1</source>
@@ -896,6 +896,18 @@ Ihre Änderungen verloren. Fortfahren?</translation>
     <message>
         <source>Automatic gamma, second pass</source>
         <translation>Automatisches Gamma, zweiter Durchgang</translation>
+    </message>
+    <message>
+        <source>Copying the picture</source>
+        <translation>Bild kopieren</translation>
+    </message>
+    <message>
+        <source>Done</source>
+        <translation>Fertig</translation>
+    </message>
+    <message>
+        <source>Failed</source>
+        <translation>Fehlgeschlagen</translation>
     </message>
 </context>
 <context>

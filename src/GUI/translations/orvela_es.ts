@@ -408,7 +408,7 @@ los cambios realizados. ¿Continuar?</translation>
     </message>
     <message>
         <source>%1 was loaded without what this window has no slider for: %2</source>
-        <translation>%1 se ha cargado sin aquello para lo que esta ventana no tiene control: %2</translation>
+        <translation>Se cargó %1 sin aquello para lo que esta ventana no tiene control: %2</translation>
     </message>
     <message>
         <source>preset %1</source>
@@ -896,6 +896,18 @@ los cambios realizados. ¿Continuar?</translation>
     <message>
         <source>Automatic gamma, second pass</source>
         <translation>Gamma automático, segunda pasada</translation>
+    </message>
+    <message>
+        <source>Copying the picture</source>
+        <translation>Copiando la imagen</translation>
+    </message>
+    <message>
+        <source>Done</source>
+        <translation>Terminado</translation>
+    </message>
+    <message>
+        <source>Failed</source>
+        <translation>Error</translation>
     </message>
 </context>
 <context>
