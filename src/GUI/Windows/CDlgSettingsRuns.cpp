@@ -44,6 +44,8 @@ void CDlgSettingsImpl::on_chkBxAutoRefresh_clicked(bool checked) {
 
 // Asked for in the middle of a run, it is made up for once that has returned.
 void CDlgSettingsImpl::on_btnRefresh_clicked() {
+    if (!isVisible())
+        return; // closed: what is shown as the result stays it
     if (mRunning) {
         mRunIsStale = true;
         mRefreshWanted = true;
