@@ -189,7 +189,7 @@ void CDlgSettingsImpl::changeMode(EGUIMode mode) {
             on_lstBxPreset_currentIndexChanged(lstBxPreset->currentText());
         }
         startTimer();
-        QTimer::singleShot(0, this, &CDlgSettingsImpl::restoreWindowsStates);
+        later([this] { restoreWindowsStates(); });
         layout()->setSizeConstraint(QLayout::SetFixedSize);
         mUpToDate = false;
         if (before == Mode_FinalTouch && mode == Mode_Advanced) {

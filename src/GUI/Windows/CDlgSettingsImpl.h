@@ -133,6 +133,7 @@ private:
     void requestDraft();
     void startTimer();
     void runCore();
+    void later(const std::function<void()>& action);
     void runEnded();
     void applyNonIteractiveMode();
     void tellFailures();

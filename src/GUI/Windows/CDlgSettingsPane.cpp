@@ -116,7 +116,7 @@ bool CDlgSettingsImpl::eventFilter(QObject* watched, QEvent* event) {
         auto* drop = static_cast<QDropEvent*>(event);
         drop->acceptProposedAction();
         // Who dragged it waits for the end of this event: no box before.
-        QTimer::singleShot(0, this, [this, urls = drop->mimeData()->urls()] { loadDropped(urls); });
+        later([this, urls = drop->mimeData()->urls()] { loadDropped(urls); });
         return true;
     }
     default:

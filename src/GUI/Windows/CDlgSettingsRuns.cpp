@@ -45,6 +45,8 @@ void CDlgSettingsImpl::on_chkBxAutoRefresh_clicked(bool checked) {
 
 // Asked for in the middle of a run, it is made up for once that has returned.
 void CDlgSettingsImpl::on_btnRefresh_clicked() {
+    if (!isVisible())
+        return; // closed: what is shown as the result stays it
     if (mRunning) {
         mRunIsStale = true;
         mRefreshWanted = true;
@@ -86,6 +88,17 @@ void CDlgSettingsImpl::stopFor(const std::function<void()>& action) {
     mCore->stop();
 }
 
+// In the next pass of the event loop, if the window is still there.
+void CDlgSettingsImpl::later(const std::function<void()>& action) {
+    auto* timer = new QTimer(this);
+    timer->setSingleShot(true);
+    connect(timer, &QTimer::timeout, this, [timer, action] {
+        timer->deleteLater();
+        action();
+    });
+    timer->start(0);
+}
+
 // What was asked for meanwhile. Not at once: this may be called from within a slot of the pane.
 void CDlgSettingsImpl::runEnded() {
     const bool again = std::exchange(mRefreshWanted, false);
@@ -94,9 +107,9 @@ void CDlgSettingsImpl::runEnded() {
         return; // closed by what happened meanwhile
     tellFailures();
     if (action)
-        QTimer::singleShot(0, this, action);
+        later(action);
     else if (again)
-        QTimer::singleShot(0, this, &CDlgSettingsImpl::on_btnRefresh_clicked);
+        later([this] { on_btnRefresh_clicked(); });
 }
 
 void CDlgSettingsImpl::onMy_thrdCore_started() {

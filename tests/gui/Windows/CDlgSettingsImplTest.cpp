@@ -110,11 +110,11 @@ TEST(CDlgSettingsImpl, CancelInTheMiddleOfARunAppliesNothing) {
 TEST(CDlgSettingsImpl, OkInTheMiddleOfARunStartsItAnewAndAcceptsTheWholeOne) {
     ProcessingWindow opened(Mode_Advanced, picture());
     QStringList heard;
+    bool pressed = false; // outlives the user's hand: the second run comes after it
     opened.run([&] {
         QObject::connect(opened.core(), &CThreadedCore::started, [&] { heard += QStringLiteral("started"); });
         QObject::connect(opened.core(), &CThreadedCore::finished,
                          [&] { heard += QStringLiteral("finished"); });
-        bool pressed = false;
         QObject::connect(opened.core(), &CThreadedCore::stepDone, &opened.window, [&](int step) {
             if (step == 4 && !std::exchange(pressed, true))
                 opened.click("btnOK");
@@ -124,6 +124,26 @@ TEST(CDlgSettingsImpl, OkInTheMiddleOfARunStartsItAnewAndAcceptsTheWholeOne) {
     EXPECT_EQ(heard.join(' '), "started finished started finished");
     EXPECT_TRUE(opened.window.appliesOnFinish());
     EXPECT_EQ(testplanes::bytes(opened.output), opened.engineResult(CUserParamsPhotoshop(Mode_Automatic)));
+}
+
+TEST(CDlgSettingsImpl, WhatIsChosenDuringARunIsWhatOkApplies) {
+    for (const char* button : {"btnRefresh", "btnOK"}) {
+        SCOPED_TRACE(button);
+        ProcessingWindow opened(Mode_Advanced, picture());
+        bool chosen = false;
+        opened.run([&] {
+            QObject::connect(opened.core(), &CThreadedCore::stepDone, &opened.window, [&](int step) {
+                if (step == 6 && !std::exchange(chosen, true))
+                    opened.find<QComboBox>("lstBxPreset")->setCurrentText(QStringLiteral("Landscape"));
+            });
+            opened.click(button);
+            if (opened.window.isVisible() && opened.find("btnOK")->isEnabled())
+                opened.click("btnOK");
+        });
+        EXPECT_TRUE(opened.window.appliesOnFinish());
+        EXPECT_EQ(testplanes::bytes(opened.output),
+                  opened.engineResult(CUserParamsPhotoshop(Mode_Landscape)));
+    }
 }
 
 TEST(CDlgSettingsImpl, ThreeChangesWithinASecondMakeOneRun) {
