@@ -1,8 +1,12 @@
-// Writes pictures of every control, pane or small window to a folder:
-//     gui_screenshots controls|panes|windows FOLDER SUFFIX [dark]
-// The scale is that of the environment variable QT_SCALE_FACTOR; the suffix tells the variants apart.
+// Writes pictures of every control, pane or small window, or of the windows in every layout, to a folder:
+//     gui_screenshots controls|panes|windows FOLDER SUFFIX light|dark
+//     gui_screenshots layouts FOLDER SUFFIX light|dark PHOTO [LANGUAGE]
+// The scale is that of the environment variable QT_SCALE_FACTOR; the suffix tells the variants apart. Layouts
+// need a screen with a window manager. scripts/screenshots runs it.
 
 #include "GUI/Controls/Artwork.h"
+#include "GUI/Windows/Translations.h"
+#include "LayoutScreenshots.h"
 #include "Shots.h"
 #include "Utility/CARGBPlane.h"
 
@@ -15,10 +19,14 @@ using namespace orvela;
 
 namespace {
 
+constexpr char kUsage[] = "usage: gui_screenshots controls|panes|windows FOLDER SUFFIX light|dark\n"
+                          "       gui_screenshots layouts FOLDER SUFFIX light|dark PHOTO [LANGUAGE]\n";
+
 QPalette darkPalette() {
     QPalette dark(QColor(53, 53, 53));
     dark.setColor(QPalette::Base, QColor(35, 35, 35));
     dark.setColor(QPalette::Highlight, QColor(42, 130, 218));
+    dark.setColor(QPalette::Link, QColor(90, 170, 240));
     for (auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText})
         dark.setColor(QPalette::Disabled, role, QColor(140, 140, 140));
     return dark;
@@ -47,14 +55,17 @@ int main(int argc, char** argv) {
     qputenv("XDG_CONFIG_HOME", settings.path().toLocal8Bit());
     QApplication application(argc, argv);
     const QStringList arguments = QCoreApplication::arguments();
-    if (arguments.size() < 4) {
-        std::fputs("usage: gui_screenshots controls|panes|windows FOLDER SUFFIX [dark]\n", stderr);
+    if (arguments.size() < 5) {
+        std::fputs(kUsage, stderr);
         return 2;
     }
-    if (arguments.value(4) == QLatin1String("dark"))
+    if (arguments[4] == QLatin1String("dark"))
         QApplication::setPalette(darkPalette());
     QApplication::setStyle(QStringLiteral("Fusion"));
+    Translations::install(QLocale(arguments.value(6, QStringLiteral("en"))));
     initArtwork();
+    if (arguments[1] == QLatin1String("layouts"))
+        return takeLayouts(arguments.value(5), arguments[2], arguments[3]) ? 0 : 1;
     CARGBPlane plane(240, 160, QStringLiteral("preview"));
     bool saved = true;
     for (auto& [name, widget] : shotsOf(arguments[1], plane)) {

@@ -30,8 +30,8 @@ struct Reply {
 constexpr int kMostBytes = 4096;
 
 /// Posts the form and waits for the reply, without serving the user in the meantime. It goes through the
-/// proxy that is set up for the system, on Linux by the variable http_proxy. Redirections are not followed,
-/// and a transfer that takes too long is given up.
+/// proxy that is set up for the system, on Linux by the variable http_proxy. Only Windows follows
+/// redirections, as its library does by itself. A transfer that takes too long is given up.
 Reply post(const Form& form);
 
 } // namespace WebPost

@@ -20,7 +20,7 @@ struct Closer {
 };
 using Handle = std::unique_ptr<std::remove_pointer_t<HINTERNET>, Closer>;
 
-constexpr DWORD kRequestFlags = 1 | INTERNET_FLAG_NO_AUTO_REDIRECT;
+constexpr DWORD kRequestFlags = 1;
 constexpr DWORD kUntilZero = static_cast<DWORD>(-1); // the header ends at its terminating zero
 constexpr char kHeader[] = "Content-Type: application/x-www-form-urlencoded\r\n";
 

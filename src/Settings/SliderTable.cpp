@@ -115,8 +115,9 @@ constexpr SliderDescription kSliders[] = {
                                       "fewest places at 0.1, in most at 10.")},
     {&P::mAuto_Color_Value, &P::mAuto_Color_Enabled, QT_TRANSLATE_NOOP("SliderTable", "AutoColor"), &Tenth,
      S::Main, Z::Standard,
-     QT_TRANSLATE_NOOP("SliderTable",
-                       "Removes colour casts by stretching each colour: gently up to 50, most at 100.")},
+     QT_TRANSLATE_NOOP(
+         "SliderTable",
+         "Removes colour casts by stretching each colour, from 56 on; up to 55 it leaves colours alone.")},
     {&P::mFade_Value, &P::mFade_Enabled, QT_TRANSLATE_NOOP("SliderTable", "Fade"), &Tenth, S::Main, Z::Fade,
      QT_TRANSLATE_NOOP(
          "SliderTable",

@@ -2,15 +2,16 @@
 
 #include "GUI/Controls/Artwork.h"
 #include "GUI/Presets/CBatchMode.h"
+#include "GUI/Presets/StoreWriting.h"
 #include "GUI/Windows/CDlgAboutImpl.h"
 #include "GUI/Windows/CDlgProgramInfosImpl.h"
 #include "GUI/Windows/CDlgSettingsImpl.h"
 #include "GUI/Windows/HelpWindow.h"
 #include "GUI/Windows/MessageBoxes.h"
+#include "GUI/Windows/Translations.h"
 #include "GUI/Windows/WindowSetup.h"
 #include "Platform/WindowParent.h"
 #include "Settings/PresetTree.h"
-#include "Settings/SettingsEdit.h"
 #include "Settings/SettingsStore.h"
 #include "Update/RunningVersion.h"
 #include "Update/UpdateServer.h"
@@ -135,7 +136,7 @@ void CDlgMainImpl::done(int result) {
     SettingsEdit edit;
     addPosition(edit, *this);
     edit.set(PresetTree::guiKey(kExpanded), isExpanded());
-    storeLayout(edit);
+    StoreWriting::commit(edit, StoreWriting::Cause::Program);
     QDialog::done(result);
 }
 
@@ -158,18 +159,18 @@ void CDlgMainImpl::on_btnCollapse_clicked() {
 
 void CDlgMainImpl::setButtonTexts(bool shown) {
     const std::initializer_list<std::pair<QToolButton*, QString>> texts = {
-        {btnAutomatic, tr("Automatic")},
-        {btnAutoContrast, tr("Auto Contrast")},
-        {btnAutoLevels, tr("Auto Levels")},
-        {btnAutoColor, tr("Auto Color")},
-        {btnAutoSaturation, tr("Auto Saturation")},
-        {btnAdjustments, tr("Adjustments")},
-        {btnAddIllumination, tr("Add Illumination")},
-        {btnAdvanced, tr("Advanced")},
-        {btnCustomPresets, tr("Custom")},
-        {btnIndivFilters, tr("All Filters")},
-        {btnHelp, tr("Help")},
-        {btnAbout, tr("About")},
+        {btnAutomatic, QCoreApplication::translate("CDlgMain", "Automatic")},
+        {btnAutoContrast, QCoreApplication::translate("CDlgMain", "Auto Contrast")},
+        {btnAutoLevels, QCoreApplication::translate("CDlgMain", "Auto Levels")},
+        {btnAutoColor, QCoreApplication::translate("CDlgMain", "Auto Color")},
+        {btnAutoSaturation, QCoreApplication::translate("CDlgMain", "Auto Saturation")},
+        {btnAdjustments, QCoreApplication::translate("CDlgMain", "Adjustments")},
+        {btnAddIllumination, QCoreApplication::translate("CDlgMain", "Add Illumination")},
+        {btnAdvanced, QCoreApplication::translate("CDlgMain", "Advanced")},
+        {btnCustomPresets, QCoreApplication::translate("CDlgMain", "Custom")},
+        {btnIndivFilters, QCoreApplication::translate("CDlgMain", "All Filters")},
+        {btnHelp, QCoreApplication::translate("CDlgMain", "Help")},
+        {btnAbout, QCoreApplication::translate("CDlgMain", "About")},
     };
     for (const auto& [button, text] : texts) {
         button->setText(shown ? text : QString());
@@ -180,10 +181,12 @@ void CDlgMainImpl::setButtonTexts(bool shown) {
 }
 
 void CDlgMainImpl::setButtonWidths(int width, const char* styleSheet) {
-    for (QToolButton* button : findChildren<QToolButton*>()) {
+    const QList<QToolButton*> buttons = findChildren<QToolButton*>();
+    for (QToolButton* button : buttons) {
         button->setFixedWidth(width);
         button->setStyleSheet(QLatin1String(styleSheet));
     }
+    fitTexts(buttons, font(), width);
 }
 
 void CDlgMainImpl::on_btnToggleBatchMode_clicked() {
@@ -201,8 +204,12 @@ void CDlgMainImpl::refreshBatchButton() {
                "the last operation you performed with orvela.\n\nTo disable batch mode, hold <b>SHIFT</b> "
                "pressed when selecting Orvela from Plug-ins menu."),
             QMessageBox::Ok);
-    if (isExpanded())
-        btnToggleBatchMode->setText(mWantedBatchState ? tr("Batch Mode is on") : tr("Batch Mode is off"));
+    if (isExpanded()) {
+        btnToggleBatchMode->setText(mWantedBatchState
+                                        ? QCoreApplication::translate("CDlgMain", "Batch Mode is on")
+                                        : QCoreApplication::translate("CDlgMain", "Batch Mode is off"));
+        fitTexts(findChildren<QToolButton*>(), font(), kExpandedWidth);
+    }
     btnToggleBatchMode->setProperty(kBatchProperty, mWantedBatchState);
     btnToggleBatchMode->setIcon(QIcon(mWantedBatchState ? QStringLiteral(":/Main UI/Batch01_On_24x24.png")
                                                         : QStringLiteral(":/Main UI/Batch01_Off_24x24.png")));
@@ -216,7 +223,9 @@ void CDlgMainImpl::on_btnIndivFilters_clicked() {
             menu->addSeparator();
             continue;
         }
-        QAction* action = menu->addAction(QIcon(QLatin1String(entry.icon)), getModeAsString(entry.mode));
+        QAction* action = menu->addAction(
+            QIcon(QLatin1String(entry.icon)),
+            Translations::modeName(entry.mode).replace(QLatin1Char('&'), QLatin1String("&&")));
         action->setData(int(entry.mode));
         connect(action, &QAction::triggered, this, &CDlgMainImpl::indivFilterActionClicked);
     }

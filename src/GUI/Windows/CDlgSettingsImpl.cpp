@@ -8,15 +8,16 @@
 #include "GUI/Panes/CWgtPaneGenericImpl.h"
 #include "GUI/Presets/CBatchMode.h"
 #include "GUI/Presets/CPresetStore.h"
+#include "GUI/Presets/StoreWriting.h"
 #include "GUI/Preview/CSignaledGraphicsView.h"
 #include "GUI/Preview/DraftRunner.h"
 #include "GUI/Windows/CDlgCustomPresetImpl.h"
 #include "GUI/Windows/PaneHistory.h"
 #include "GUI/Windows/Previews.h"
+#include "GUI/Windows/Translations.h"
 #include "GUI/Windows/WindowSetup.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
 #include "Settings/PresetTree.h"
-#include "Settings/SettingsEdit.h"
 #include "Settings/SettingsStore.h"
 #include "Utility/CGenericEx.h"
 #include "Utility/DebugBoxes.h"
@@ -179,7 +180,7 @@ void CDlgSettingsImpl::changeMode(EGUIMode mode) {
             mAdvancedPreset = lstBxPreset->currentIndex();
             mAdvancedAutoRefresh = chkBxAutoRefresh->isChecked();
         }
-        setWindowTitle(tr(getModeAsString(mode).toUtf8()));
+        setWindowTitle(Translations::modeName(mode));
         {
             const QScopedValueRollback<bool> together(mTogether, true);
             makePane(mode);
@@ -337,5 +338,5 @@ void CDlgSettingsImpl::onMy_this_finished(int) {
         mPreviews->saveTo(edit);
         mPreviews->hide();
     }
-    storeLayout(edit);
+    StoreWriting::commit(edit, StoreWriting::Cause::Program);
 }

@@ -6,6 +6,7 @@
 #include "GUI/Windows/CDlgSettingsImpl.h"
 #include "GUI/Windows/PaneHistory.h"
 #include "GUI/Windows/Previews.h"
+#include "GUI/Windows/Translations.h"
 #include "Utility/CGenericEx.h"
 #include "Utility/DebugBoxes.h"
 #include "Utility/Logger.h"
@@ -112,8 +113,9 @@ void CDlgSettingsImpl::onMy_thrdCore_percentDone(int percent) {
     prgBrCoreStatus->setPercentage(percent);
 }
 
-void CDlgSettingsImpl::onMy_thrdCore_stepDone(int step, int total, const QString& name) {
-    prgBrCoreStatus->setStep(step, total, name);
+// The name of the step is one for the log.
+void CDlgSettingsImpl::onMy_thrdCore_stepDone(int step, int total, const QString&) {
+    prgBrCoreStatus->setStep(step, total, Translations::stepTitle(mCore->stepTitle()));
     if (mPreviews)
         showing([this] { mPreviews->showStep(*mCore); });
     mCore->stepHandled();

@@ -1,15 +1,14 @@
 #include "GUI/Windows/WindowSetup.h"
 
+#include "GUI/Presets/StoreWriting.h"
 #include "Settings/PresetTree.h"
 #include "Settings/SettingsStore.h"
-#include "Utility/CGenericEx.h"
-#include "Utility/Logger.h"
 
 #include <QCoreApplication>
 #include <QGuiApplication>
 #include <QPoint>
 #include <QScreen>
-#include <QWidget>
+#include <QToolButton>
 
 #include <algorithm>
 
@@ -64,19 +63,31 @@ void restorePosition(QWidget& window) {
 void storePosition(const QWidget& window) {
     SettingsEdit edit;
     addPosition(edit, window);
-    storeLayout(edit);
+    StoreWriting::commit(edit, StoreWriting::Cause::Program);
 }
 
 void addPosition(SettingsEdit& edit, const QWidget& window) {
     edit.set(positionKey(window), window.pos());
 }
 
-void storeLayout(const SettingsEdit& edit) {
-    try {
-        edit.commit();
-    } catch (const CGenericEx& failure) {
-        Log::log(LogLevel::Warning, "%s", failure.what());
+void fitTexts(const QList<QToolButton*>& buttons, QFont font, int width) {
+    constexpr double kStep = 0.25;    // points
+    constexpr double kSmallest = 0.7; // of the font
+    const auto fits = [width](const QToolButton* button) {
+        return button->text().isEmpty() || toolButtonWidth(*button) <= width;
+    };
+    const double smallest = font.pointSizeF() * kSmallest;
+    for (;; font.setPointSizeF(font.pointSizeF() - kStep)) {
+        for (QToolButton* button : buttons)
+            button->setFont(font);
+        if (font.pointSizeF() - kStep < smallest || std::all_of(buttons.begin(), buttons.end(), fits))
+            return;
     }
+}
+
+int toolButtonWidth(const QToolButton& button) {
+    // The toolkit asks for a blank at either side of the text, which has its own margins.
+    return button.sizeHint().width() - 2 * button.fontMetrics().horizontalAdvance(QLatin1Char(' '));
 }
 
 } // namespace orvela

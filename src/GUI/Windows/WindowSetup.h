@@ -1,11 +1,14 @@
 #pragma once
 
+#include <QFont>
 #include <QKeySequence>
+#include <QList>
 #include <QString>
 
 #include <initializer_list>
 
 class QPoint;
+class QToolButton;
 class QWidget;
 
 namespace orvela {
@@ -25,13 +28,17 @@ void restorePosition(QWidget& window);
 /// Whether enough of the title of a window so wide would show at `position` to take hold of it.
 bool isReachable(const QPoint& position, int width);
 
-/// Writes where the window is. A store that cannot be written is logged and does not stop it.
+/// Writes where the window is. A store that cannot be written does not stop it.
 void storePosition(const QWidget& window);
 
 /// Puts where the window is into `edit`.
 void addPosition(SettingsEdit& edit, const QWidget& window);
 
-/// Makes a change that only says how windows stand: a store that cannot be written is logged.
-void storeLayout(const SettingsEdit& edit);
+/// Gives buttons, shown with their texts, the largest font not above `font` in which every text has room in
+/// `width` pixels. It does not go below seven tenths of it.
+void fitTexts(const QList<QToolButton*>& buttons, QFont font, int width);
+
+/// The pixels that a button needs for its icon and its text.
+int toolButtonWidth(const QToolButton& button);
 
 } // namespace orvela

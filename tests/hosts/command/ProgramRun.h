@@ -29,9 +29,9 @@ protected:
         return finish(process);
     }
 
-    void begin(QProcess& process, const char* arguments) {
+    void begin(QProcess& process, const char* arguments, const char* program = ORVELA_PROGRAM) {
         process.setWorkingDirectory(mFolder.path());
-        process.start(QStringLiteral(ORVELA_PROGRAM),
+        process.start(QString::fromUtf8(program),
                       QString::fromUtf8(arguments).split(QLatin1Char(' '), Qt::SkipEmptyParts));
         ASSERT_TRUE(process.waitForStarted());
     }
