@@ -68,6 +68,8 @@ void CDlgSettingsImpl::together(const QString& what, const std::function<void()>
 
 void CDlgSettingsImpl::requestRefresh() {
     mUpToDate = false;
+    if (mRun == Run::Whole)
+        mRun = Run::Spoilt;
     startTimer();
     requestDraft();
 }
@@ -113,7 +115,7 @@ bool CDlgSettingsImpl::eventFilter(QObject* watched, QEvent* event) {
         auto* drop = static_cast<QDropEvent*>(event);
         drop->acceptProposedAction();
         // Who dragged it waits for the end of this event: no box before.
-        QTimer::singleShot(0, this, [this, urls = drop->mimeData()->urls()] { loadDropped(urls); });
+        whenIdle([this, urls = drop->mimeData()->urls()] { loadDropped(urls); });
         return true;
     }
     default:
@@ -122,12 +124,10 @@ bool CDlgSettingsImpl::eventFilter(QObject* watched, QEvent* event) {
 }
 
 void CDlgSettingsImpl::loadDropped(const QList<QUrl>& urls) {
-    if (mRunning)
-        return stopFor([this, urls] { loadDropped(urls); });
     try {
         const QString path = PresetDrop::fileOf(urls);
         CUserParamsPhotoshop now(mMode);
-        mPane->applyGUIParams(now);
+        mPane->writeSettings(now.mSliderParams);
         QStringList left;
         together(QFileInfo(path).fileName(),
                  [&] { left = PresetDrop::load(mPane, mMode, now.mSliderParams, path); });
