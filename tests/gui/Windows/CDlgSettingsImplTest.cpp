@@ -112,11 +112,11 @@ TEST(CDlgSettingsImpl, CancelInTheMiddleOfARunAppliesNothing) {
 TEST(CDlgSettingsImpl, OkInTheMiddleOfARunStartsItAnewAndAcceptsTheWholeOne) {
     ProcessingWindow opened(Mode_Advanced, picture());
     QStringList heard;
+    bool pressed = false; // outlives what is done here
     opened.run([&] {
         QObject::connect(opened.core(), &CThreadedCore::started, [&] { heard += QStringLiteral("started"); });
         QObject::connect(opened.core(), &CThreadedCore::finished,
                          [&] { heard += QStringLiteral("finished"); });
-        bool pressed = false;
         QObject::connect(opened.core(), &CThreadedCore::stepDone, &opened.window, [&](int step) {
             if (step == 4 && !std::exchange(pressed, true))
                 opened.click("btnOK");
