@@ -118,6 +118,7 @@ private:
 
     // CDlgSettingsPane.cpp: what the user does to the pane
     void preparePane();
+    void orderTabs();
     orvela::PaneState paneState() const;
     void showPaneState(const orvela::PaneState& state);
     void together(const QString& what, const std::function<void()>& action);

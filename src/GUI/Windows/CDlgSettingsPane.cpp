@@ -28,6 +28,20 @@ void CDlgSettingsImpl::preparePane() {
     mPane->addActions({mHistory->undoAction(), mHistory->redoAction()});
     mPane->setContextMenuPolicy(Qt::ActionsContextMenu);
     showKeys(mPane);
+    orderTabs();
+}
+
+// The pane is made last but stands above the buttons at the bottom.
+void CDlgSettingsImpl::orderTabs() {
+    QWidget* last = btnDeletePreset;
+    for (QWidget* next = mPane->nextInFocusChain(); mPane->isAncestorOf(next);
+         next = next->nextInFocusChain())
+        if (next->focusPolicy() != Qt::NoFocus)
+            last = next;
+    for (QWidget* bottom : std::initializer_list<QWidget*>{btnHelp, btnOK, btnCancel}) {
+        setTabOrder(last, bottom);
+        last = bottom;
+    }
 }
 
 void CDlgSettingsImpl::onMy_slider_valueChanged(double) {
