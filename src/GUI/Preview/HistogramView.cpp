@@ -3,6 +3,7 @@
 #include <QPainter>
 
 #include <algorithm>
+#include <numeric>
 
 namespace orvela {
 
@@ -28,9 +29,13 @@ double mostOf(const LevelCounts::Counts& counts) {
 LevelCounts LevelCounts::of(const CARGBPlane& picture) {
     LevelCounts counts;
     const std::int64_t pixels = picture.pixelCount();
-    const std::int64_t step = std::max<std::int64_t>(1, pixels / kPixelsCounted);
-    const std::array<const std::uint8_t*, 3> samples = {
-        picture.samples(Channel::Red), picture.samples(Channel::Green), picture.samples(Channel::Blue)};
+    std::int64_t step = std::max<std::int64_t>(1, pixels / kPixelsCounted);
+    while (std::gcd(step, std::int64_t{picture.width()}) > 1)
+        ++step; // or some columns would never be counted
+    const bool grey = picture.colorMode() == CARGBPlane::Grayscale; // the preview shows the first channel
+    std::array<const std::uint8_t*, 3> samples = {};
+    for (std::size_t c = 0; c < 3; ++c)
+        samples[c] = picture.samples(grey ? Channel::Red : kChannels[c]);
     for (std::int64_t i = 0; i < pixels; i += step) {
         for (std::size_t c = 0; c < 3; ++c)
             ++counts.channels[c][samples[c][i]];

@@ -71,6 +71,8 @@ CDlgMainImpl::CDlgMainImpl(void* hostWindow, CARGBPlane* inPlane, CARGBPlane* ou
     restoreState();
     setWindowTitle(tr("Orvela %1").arg(kRunningVersion, 0, 'g'));
     flatten({btnCollapse, btnExpand});
+    btnHelp->setShortcut(QKeySequence::HelpContents);
+    btnHelp->setToolTip(withKeys(btnHelp->toolTip(), {btnHelp->shortcut()}));
     if (qEnvironmentVariableIsSet("ORVELA_STYLESHEET"))
         setStyleSheet(
             QStringLiteral("color: white;background: qlineargradient(x1: 0, y1: 0, x2: 0, y2: 1, stop: 0 "

@@ -65,7 +65,6 @@ void CDlgSettingsImpl::addKeysToPreviews() {
     auto* cancel = new QAction(mPreviews.get()); // this window is a dialog and has that key
     cancel->setShortcut(Qt::Key_Escape);
     connect(cancel, &QAction::triggered, this, &CDlgSettingsImpl::on_btnCancel_clicked);
-    installEventFilter(mPreviews.get());
     for (QWidget* window : mPreviews->windows()) {
         window->addActions(actions());
         window->addAction(cancel);

@@ -84,6 +84,8 @@ void CDlgSettingsImpl::requestRefresh() {
     mUpToDate = false;
     if (mRun == Run::Whole)
         mRun = Run::Spoilt;
+    if (mRun != Run::None && mApplyOnFinish)
+        return refresh(); // what is applied is what the pane says
     startTimer();
     requestDraft();
 }

@@ -11,6 +11,7 @@
 #include "Settings/SettingsEdit.h"
 
 #include <QAction>
+#include <QApplication>
 #include <QKeyEvent>
 #include <QScreen>
 #include <QScrollBar>
@@ -58,8 +59,7 @@ Previews::Previews(QWidget* owner)
     addKey(Qt::Key_0, Qt::ControlModifier, [this] { zoomTo(ZoomTable::kFit); });
     addKey(Qt::Key_1, Qt::ControlModifier, [this] { zoomToPixels(); });
     addKey(Qt::Key_F3, {}, [this] { setComparing(!isComparing()); });
-    for (QWidget* window : windows())
-        window->installEventFilter(this);
+    qApp->installEventFilter(this);
     for (QScrollBar* bar : {mProcessedView->horizontalScrollBar(), mProcessedView->verticalScrollBar()})
         connect(bar, &QScrollBar::valueChanged, this, &Previews::seenPartChanged);
 }
@@ -89,7 +89,7 @@ CSignaledGraphicsView* Previews::makeView(PreviewPicture& picture) {
     view->setDragMode(QGraphicsView::ScrollHandDrag);
     view->setBackgroundBrush(Qt::black);
     view->setMinimumSize(kSmallest);
-    view->installEventFilter(this);
+    view->viewport()->setAcceptDrops(false); // the window takes them
     return view;
 }
 
@@ -228,19 +228,33 @@ void Previews::setComparing(bool comparing) {
     mBar->setComparing(comparing);
 }
 
+bool Previews::isHoldKey(const QObject* watched, int key) const {
+    if (key == Qt::Key_Space)
+        return watched == mOriginalView || watched == mProcessedView;
+    const auto* widget = qobject_cast<const QWidget*>(watched);
+    return key == Qt::Key_F2 && widget &&
+           (widget->window() == mOwner || windows().contains(widget->window()));
+}
+
+// Of the whole program: a field that has the focus would keep the release of a key.
 bool Previews::eventFilter(QObject* watched, QEvent* event) {
-    if (event->type() == QEvent::KeyPress || event->type() == QEvent::KeyRelease) {
+    switch (event->type()) {
+    case QEvent::KeyPress:
+    case QEvent::KeyRelease: {
         const auto* key = static_cast<QKeyEvent*>(event);
-        const bool inPicture = watched == mOriginalView || watched == mProcessedView;
-        if (key->key() == Qt::Key_F2 || (inPicture && key->key() == Qt::Key_Space)) {
-            if (!key->isAutoRepeat())
-                setHeld(event->type() == QEvent::KeyPress);
-            return true;
-        }
+        if (!isHoldKey(watched, key->key()))
+            return false;
+        if (!key->isAutoRepeat())
+            setHeld(event->type() == QEvent::KeyPress);
+        return true;
     }
-    if (event->type() == QEvent::FocusOut || event->type() == QEvent::WindowDeactivate)
-        setHeld(false); // the release goes elsewhere
-    return QObject::eventFilter(watched, event);
+    case QEvent::FocusOut: // the release goes elsewhere
+    case QEvent::WindowDeactivate:
+        setHeld(false);
+        return false;
+    default:
+        return false;
+    }
 }
 
 void Previews::saveTo(SettingsEdit& edit) const {

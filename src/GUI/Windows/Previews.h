@@ -67,8 +67,8 @@ public:
 
     /// The windows, whichever are shown.
     QList<QWidget*> windows() const;
-    /// Fit, 100 % and the line to compare by. F2, held in any of the windows or in one that this is made an
-    /// event filter of, shows the original; so does Space in the pictures.
+    /// Fit, 100 % and the line to compare by. F2, held in any of the windows or the owner's, shows the
+    /// original; so does Space in the pictures.
     const QList<QAction*>& keys() const { return mKeys; }
 
     /// Shows the windows: two when split.
@@ -113,6 +113,7 @@ protected:
 private:
     CSignaledGraphicsView* makeView(PreviewPicture& picture);
     void addKey(Qt::Key key, Qt::KeyboardModifiers modifiers, const std::function<void()>& action);
+    bool isHoldKey(const QObject* watched, int key) const;
     void scaleTo(double scale);
     double deviceScale() const;
     void placeBesideOwner();

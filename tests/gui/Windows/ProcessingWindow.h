@@ -40,9 +40,16 @@ public:
 
     /// What the engine makes of the picture by itself.
     std::vector<std::uint8_t> engineResult(const CUserParamsPhotoshop& params) const {
-        CARGBPlane in(proxy.plane(), QStringLiteral("in"));
-        CARGBPlane out(proxy.plane(), QStringLiteral("out"));
-        CThreadedCore_Orvela core(&in, &out);
+        return engineResult<CThreadedCore_Orvela>(params, proxy.plane());
+    }
+
+    /// What a core makes by itself of a picture that was made of this one.
+    template <class Core>
+    std::vector<std::uint8_t> engineResult(const CUserParamsPhotoshop& params,
+                                           const CARGBPlane& start) const {
+        CARGBPlane in(start, QStringLiteral("in"));
+        CARGBPlane out(start, QStringLiteral("out"));
+        Core core(&in, &out);
         QObject::connect(&core, &CThreadedCore::stepDone, [&core] { core.stepHandled(); });
         core.setProxy(&proxy);
         core.setParams(params);

@@ -114,8 +114,7 @@ TEST_F(Undo, APresetIsOneStepAndItsNameComesBack) {
         EXPECT_EQ(presets->currentText(), "LandscapePro");
         opened.click("btnOK");
     });
-    EXPECT_EQ(testplanes::bytes(opened.output),
-              opened.engineResult(CUserParamsPhotoshop(Mode_LandscapePro)));
+    EXPECT_EQ(testplanes::bytes(opened.output), opened.engineResult(CUserParamsPhotoshop(Mode_LandscapePro)));
 }
 
 TEST_F(Undo, ATypedNumberIsUndoneFromWithinItsField) {
