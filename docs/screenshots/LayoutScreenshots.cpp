@@ -203,7 +203,7 @@ void Layouts::takeOthers() {
     for (const auto& [mode, name] : {std::pair(Mode_Adjustments, "adjustments"),
                                      {Mode_AddIllumination, "add-illumination"},
                                      {Mode_ColorFilter, "color-filter"}})
-        drive(mode, [this, name](CDlgSettingsImpl& window) {
+        drive(mode, [this, name = name](CDlgSettingsImpl& window) {
             click(window, "btnTurnAllOn");
             click(window, "btnRefresh");
             take(QString::fromLatin1(name));

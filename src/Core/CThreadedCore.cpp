@@ -50,14 +50,14 @@ void CThreadedCore::run() {
     if (mContext.tape && !mContext.playsTape)
         *mContext.tape = MeasurementTape(mInPlane->pixelCount());
 
-    announce(0, 1, "Duplicating Input Plane", "Copying the picture");
+    announce(0, 1, "Duplicating Input Plane", QT_TRANSLATE_NOOP("PipelineTable", "Copying the picture"));
     emitPercentDone(0);
     if (runPipeline()) {
-        announce(1, 1, "All Done", "Done");
+        announce(1, 1, "All Done", QT_TRANSLATE_NOOP("PipelineTable", "Done"));
         emitPercentDone(100);
         mLastProcessingDone = true;
     } else {
-        announce(0, 1, "Failed", "Failed");
+        announce(0, 1, "Failed", QT_TRANSLATE_NOOP("PipelineTable", "Failed"));
         emitPercentDone(0);
     }
 }

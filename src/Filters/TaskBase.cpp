@@ -110,6 +110,7 @@ bool TaskBase::runPhases() {
     pre.done();
 
     const PhaseTimer pass("Pre DoApplyParallel");
+    testStop(); // before a pass that would have to be undone
     mPassBegun = true;
     if (!DoApplyParallel()) {
         Log::scopeExit(LogLevel::Debug, "Task canceled in DoApplyParallel.");
@@ -178,15 +179,17 @@ const TaskDescription& TaskBase::description() const {
     return kNone;
 }
 
+void TaskBase::testStop() const {
+    if (const TaskDescription& own = description(); own.testsStop && mParams->mCancelRequested)
+        throw CanceledEx(own.source, own.line);
+}
+
 std::uint32_t TaskBase::enterRow(std::uint32_t index) {
     const std::uint32_t row = index * mVertStep;
-    if (const TaskDescription& own = description(); own.testsStop) {
-        if (mParams->mCancelRequested)
-            throw CanceledEx(own.source, own.line);
-        if (mParams->mProgressCallback) {
-            const float perRow = 100.0F / static_cast<float>(mInPlane->height());
-            mParams->mProgressCallback(static_cast<std::int32_t>(perRow * static_cast<float>(row + 1)));
-        }
+    testStop();
+    if (description().testsStop && mParams->mProgressCallback) {
+        const float perRow = 100.0F / static_cast<float>(mInPlane->height());
+        mParams->mProgressCallback(static_cast<std::int32_t>(perRow * static_cast<float>(row + 1)));
     }
     onRow(row);
     return row;

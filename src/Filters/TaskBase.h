@@ -156,6 +156,7 @@ private:
 
     bool runPhases();
     void restore();
+    void testStop() const;
     std::uint32_t enterRow(std::uint32_t index);
     void logPlanes(const char* text) const;
     /// The second plane whose address the opening lines show.

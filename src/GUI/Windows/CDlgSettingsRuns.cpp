@@ -215,7 +215,7 @@ void CDlgSettingsImpl::reject() {
 
 void CDlgSettingsImpl::applyNonIteractiveMode() {
     if (!mRunInNonInteractiveMode)
-        DebugBoxes::warningBox(this, tr("Warning"),
+        DebugBoxes::warningBox(static_cast<QWidget*>(this), tr("Warning"),
                                tr("Calling applyNonIteractiveMode when mRunInNonInteractiveMode is false."));
     for (QWidget* hidden : {frmPresets, frmCentralContainer, frmBottomContainer})
         hidden->hide();

@@ -29,7 +29,7 @@ struct Catalogues {
 QString chosenLanguage(const QLocale& locale) {
     const QStringList known = languages();
     for (const QString& wanted : locale.uiLanguages()) {
-        const QString language = wanted.section(QLatin1Char('-'), 0, 0);
+        QString language = wanted.section(QLatin1Char('-'), 0, 0);
         if (language == QLatin1String("en") || known.contains(language))
             return language;
     }
@@ -42,7 +42,7 @@ QString install(const QLocale& locale) {
     static std::unique_ptr<Catalogues> installed;
     initResource();
     installed.reset(); // takes the translators away
-    const QString language = chosenLanguage(locale);
+    QString language = chosenLanguage(locale);
     if (language == QLatin1String("en"))
         return language;
     installed = std::make_unique<Catalogues>();

@@ -382,6 +382,42 @@ Ihre Änderungen verloren. Fortfahren?</translation>
         <source>A step of the processing failed and was left out: %1 (%2)</source>
         <translation>Ein Schritt der Bearbeitung ist fehlgeschlagen und wurde ausgelassen: %1 (%2)</translation>
     </message>
+    <message>
+        <source>all sliders on</source>
+        <translation>alle Regler ein</translation>
+    </message>
+    <message>
+        <source>all sliders off</source>
+        <translation>alle Regler aus</translation>
+    </message>
+    <message>
+        <source>%1 on</source>
+        <translation>%1 ein</translation>
+    </message>
+    <message>
+        <source>%1 off</source>
+        <translation>%1 aus</translation>
+    </message>
+    <message>
+        <source>Color</source>
+        <translation>Farbe</translation>
+    </message>
+    <message>
+        <source>Information</source>
+        <translation>Hinweis</translation>
+    </message>
+    <message>
+        <source>%1 was loaded without what this window has no slider for: %2</source>
+        <translation>%1 wurde geladen, jedoch ohne das, wofür dieses Fenster keinen Regler hat: %2</translation>
+    </message>
+    <message>
+        <source>preset %1</source>
+        <translation>Vorgabe %1</translation>
+    </message>
+    <message>
+        <source>reverting %1</source>
+        <translation>Zurücksetzen von %1</translation>
+    </message>
 </context>
 <context>
     <name>CDlgSinglePreview</name>
@@ -849,6 +885,18 @@ Ihre Änderungen verloren. Fortfahren?</translation>
         <source>Automatic gamma, second pass</source>
         <translation>Automatisches Gamma, zweiter Durchgang</translation>
     </message>
+    <message>
+        <source>Copying the picture</source>
+        <translation>Bild kopieren</translation>
+    </message>
+    <message>
+        <source>Done</source>
+        <translation>Fertig</translation>
+    </message>
+    <message>
+        <source>Failed</source>
+        <translation>Fehlgeschlagen</translation>
+    </message>
 </context>
 <context>
     <name>SliderTable</name>
@@ -1189,6 +1237,22 @@ Ihre Änderungen verloren. Fortfahren?</translation>
     <message>
         <source>How often each brightness and colour occurs, from black to white. The line is the original picture.</source>
         <translation>Wie oft jede Helligkeit und Farbe vorkommt, von Schwarz bis Weiß. Die Linie ist das Original.</translation>
+    </message>
+</context>
+<context>
+    <name>orvela::PaneHistory</name>
+    <message>
+        <source>%1: %2</source>
+        <comment>undo or redo: what</comment>
+        <translation>%1: %2</translation>
+    </message>
+    <message>
+        <source>Undo</source>
+        <translation>Rückgängig</translation>
+    </message>
+    <message>
+        <source>Redo</source>
+        <translation>Wiederholen</translation>
     </message>
 </context>
 <context>

@@ -382,6 +382,42 @@ los cambios realizados. ¿Continuar?</translation>
         <source>A step of the processing failed and was left out: %1 (%2)</source>
         <translation>Falló un paso del procesamiento y se omitió: %1 (%2)</translation>
     </message>
+    <message>
+        <source>all sliders on</source>
+        <translation>todos los controles activados</translation>
+    </message>
+    <message>
+        <source>all sliders off</source>
+        <translation>todos los controles desactivados</translation>
+    </message>
+    <message>
+        <source>%1 on</source>
+        <translation>%1 activado</translation>
+    </message>
+    <message>
+        <source>%1 off</source>
+        <translation>%1 desactivado</translation>
+    </message>
+    <message>
+        <source>Color</source>
+        <translation>Color</translation>
+    </message>
+    <message>
+        <source>Information</source>
+        <translation>Información</translation>
+    </message>
+    <message>
+        <source>%1 was loaded without what this window has no slider for: %2</source>
+        <translation>Se cargó %1 sin aquello para lo que esta ventana no tiene control: %2</translation>
+    </message>
+    <message>
+        <source>preset %1</source>
+        <translation>preajuste %1</translation>
+    </message>
+    <message>
+        <source>reverting %1</source>
+        <translation>restablecer %1</translation>
+    </message>
 </context>
 <context>
     <name>CDlgSinglePreview</name>
@@ -849,6 +885,18 @@ los cambios realizados. ¿Continuar?</translation>
         <source>Automatic gamma, second pass</source>
         <translation>Gamma automático, segunda pasada</translation>
     </message>
+    <message>
+        <source>Copying the picture</source>
+        <translation>Copiando la imagen</translation>
+    </message>
+    <message>
+        <source>Done</source>
+        <translation>Terminado</translation>
+    </message>
+    <message>
+        <source>Failed</source>
+        <translation>Error</translation>
+    </message>
 </context>
 <context>
     <name>SliderTable</name>
@@ -1189,6 +1237,22 @@ los cambios realizados. ¿Continuar?</translation>
     <message>
         <source>How often each brightness and colour occurs, from black to white. The line is the original picture.</source>
         <translation>Con qué frecuencia aparece cada brillo y color, del negro al blanco. La línea es la imagen original.</translation>
+    </message>
+</context>
+<context>
+    <name>orvela::PaneHistory</name>
+    <message>
+        <source>%1: %2</source>
+        <comment>undo or redo: what</comment>
+        <translation>%1: %2</translation>
+    </message>
+    <message>
+        <source>Undo</source>
+        <translation>Deshacer</translation>
+    </message>
+    <message>
+        <source>Redo</source>
+        <translation>Rehacer</translation>
     </message>
 </context>
 <context>

@@ -1,5 +1,7 @@
 #include "GUI/Windows/Translations.h"
 
+#include "Core/PipelineTable.h"
+#include "GUI/Controls/COrvelaStatusIndicator.h"
 #include "GUI/Panes/CWgtPaneAdvancedImpl.h"
 #include "GUI/Windows/CDlgAboutImpl.h"
 #include "GUI/Windows/CDlgCustomPresetImpl.h"
@@ -9,6 +11,7 @@
 #include "GUI/Windows/WindowSetup.h"
 #include "Settings/ModeTable.h"
 #include "Settings/SettingsStore.h"
+#include "Settings/SliderTable.h"
 #include "Update/UpdateMessage.h"
 #include "gui/Windows/ProcessingWindow.h"
 #include "support/ModalDialog.h"
@@ -20,10 +23,12 @@
 #include <QLineEdit>
 #include <QMessageBox>
 #include <QPushButton>
+#include <QRegularExpression>
 #include <QScopeGuard>
 #include <QTabBar>
 #include <QTabWidget>
 #include <QToolButton>
+#include <QTranslator>
 
 #include <gtest/gtest.h>
 
@@ -170,6 +175,41 @@ TEST(Translations, TakesTheFirstLanguageOfTheUserThatItSpeaks) {
         const bool isEnglish = Translations::modeName(Mode_AddIllumination) == "Add Illumination";
         EXPECT_EQ(isEnglish, QByteArray(language) == "en") << locale;
     }
+}
+
+TEST(Translations, KnowsEveryTextOfTheTables) {
+    for (const QString& language : Translations::languages()) {
+        QTranslator catalogue;
+        ASSERT_TRUE(catalogue.load(QStringLiteral(":/translations/orvela_") + language));
+        const auto expectKnown = [&](const char* context, const char* text) {
+            EXPECT_FALSE(catalogue.translate(context, text).isEmpty())
+                << qPrintable(language) << ": " << text;
+        };
+        for (const ModeDescription& mode : ModeTable::all())
+            expectKnown("ModeTable", mode.displayName);
+        for (const PipelineStep& step : PipelineTable::mainSteps())
+            expectKnown("PipelineTable", step.title);
+        for (const SliderDescription& slider : SliderTable::sliders()) {
+            expectKnown("SliderTable", slider.label);
+            expectKnown("SliderTable", slider.help);
+        }
+    }
+}
+
+TEST(Translations, TellsTheStepsOfARun) {
+    const Language german(QStringLiteral("de"));
+    ProcessingWindow driven(Mode_Advanced, testplanes::noise(32, 24));
+    QStringList steps;
+    driven.run([&] {
+        const auto* progress = driven.find<COrvelaStatusIndicator>("prgBrCoreStatus");
+        QObject::connect(driven.core(), &CThreadedCore::stepDone, progress,
+                         [&] { steps.append(progress->stepName()); });
+        driven.click("btnRefresh");
+        EXPECT_EQ(progress->toolTip(), progress->stepName());
+        driven.window.reject();
+    });
+    EXPECT_TRUE(steps.contains("Automatisches Gamma, erster Durchgang")) << qPrintable(steps.join('|'));
+    EXPECT_TRUE(steps.filter(QRegularExpression("Histo|_|Copying|Done|Super")).isEmpty());
 }
 
 TEST(Translations, LeavesKeysAsTheyAreAndSpeaksWithButtonsOfTheToolkitToo) {
