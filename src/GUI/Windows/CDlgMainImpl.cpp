@@ -71,6 +71,7 @@ CDlgMainImpl::CDlgMainImpl(void* hostWindow, CARGBPlane* inPlane, CARGBPlane* ou
     restoreState();
     setWindowTitle(tr("Orvela %1").arg(kRunningVersion, 0, 'g'));
     flatten({btnCollapse, btnExpand});
+    nameByToolTips(*this);
     btnHelp->setShortcut(QKeySequence::HelpContents);
     btnHelp->setToolTip(withKeys(btnHelp->toolTip(), {btnHelp->shortcut()}));
     if (qEnvironmentVariableIsSet("ORVELA_STYLESHEET"))

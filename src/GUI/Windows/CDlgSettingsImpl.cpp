@@ -72,6 +72,7 @@ CDlgSettingsImpl::CDlgSettingsImpl(EGUIMode mode, CARGBPlane* inPlane, CARGBPlan
     setupUi(this);
     for (QToolButton* button : findChildren<QToolButton*>())
         flatten({button});
+    nameByToolTips(*this);
     lblZoomLevel->setMinimumWidth(lblZoomLevel->fontMetrics().horizontalAdvance(QStringLiteral("66.7% ")));
     btnGluePreviews->hide();
     btnStopProcessing->hide();
@@ -155,7 +156,11 @@ void CDlgSettingsImpl::runInteractive(EGUIMode mode) {
 
 void CDlgSettingsImpl::changeMode(EGUIMode mode) {
     if (mRun != Run::None)
-        return whenIdle([this, mode] { changeMode(mode); });
+        return whenIdle([this, mode] {
+            mApplyOnFinish = mRefreshWanted =
+                false; // the picture of this pane was asked for, not of the next
+            changeMode(mode);
+        });
     guarded([&] {
         const EGUIMode before = std::exchange(mMode, mode);
         if (before == Mode_Advanced && mode == Mode_FinalTouch) {
@@ -283,7 +288,7 @@ void CDlgSettingsImpl::restoreWindowsStates() {
     mHistory->begin(paneState()); // nothing of this was the user's
 }
 
-// What was stored stays where this window never came to stand by it: closed before, or without previews.
+// What was stored stays where this window was closed before it came to stand by it.
 void CDlgSettingsImpl::onMy_this_finished(int) {
     for (QTimer* timer : {&mRefreshTimer, &mDraftTimer, &mGoOnTimer})
         timer->stop();
@@ -293,6 +298,7 @@ void CDlgSettingsImpl::onMy_this_finished(int) {
         mPreviews->hide();
 }
 
+// Whether they are split is nothing that a run without previews could tell.
 void CDlgSettingsImpl::storeWindowsStates() const {
     SettingsEdit edit;
     addPosition(edit, *this);

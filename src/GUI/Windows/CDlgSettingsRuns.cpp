@@ -111,11 +111,16 @@ void CDlgSettingsImpl::runEnded() {
         mGoOnTimer.start();
 }
 
+// One thing at a time: each may open a box, close the window or be told of by its signals.
 void CDlgSettingsImpl::goOn() {
-    while (isVisible() && mRun == Run::None && !mWaiting.isEmpty())
+    if (mRun != Run::None) // begun since
+        return mWaiting.isEmpty() ? void() : stopRun();
+    if (!mWaiting.isEmpty())
         mWaiting.takeFirst()();
-    if (std::exchange(mRefreshWanted, false))
-        refresh();
+    else if (std::exchange(mRefreshWanted, false))
+        return refresh();
+    if (isVisible() && (mRefreshWanted || !mWaiting.isEmpty()))
+        mGoOnTimer.start();
 }
 
 // What changes the settings, or opens a box that would halt the run, waits for its end. The focus waits at

@@ -7,9 +7,12 @@
 #include "GUI/Panes/IWgtPane.h"
 #include "GUI/Presets/CBatchMode.h"
 #include "GUI/Presets/CPresetStore.h"
+#include "GUI/Preview/CGridCell.h"
+#include "GUI/Preview/CSignaledGraphicsView.h"
 #include "Settings/SettingsStore.h"
 #include "gui/Windows/ProcessingWindow.h"
 #include "support/BoxRecorder.h"
+#include "support/LogCapture.h"
 #include "support/ModalDialog.h"
 
 #include <QCheckBox>
@@ -18,6 +21,7 @@
 #include <QMessageBox>
 #include <QMimeData>
 #include <QPushButton>
+#include <QScrollBar>
 #include <QTemporaryDir>
 
 #include <gtest/gtest.h>
@@ -374,6 +378,44 @@ TEST_F(Runs, ThatFailLeaveTheWindowOpenAndCanBeMadeAnew) {
     });
     EXPECT_EQ(runs, 1);
     expectWholeResult();
+}
+
+class RunsAndDrafts : public Runs {
+protected:
+    QGraphicsView* view() { return opened.window.findChildren<CSignaledGraphicsView*>().last(); }
+    QRectF seen() { return view()->mapToScene(view()->viewport()->rect()).boundingRect(); }
+
+    // What lies over the whole picture: a draft or a step.
+    QRectF part() {
+        for (const QGraphicsItem* item : view()->scene()->items())
+            if (dynamic_cast<const CGridCell*>(item) && item->zValue() > 1)
+                return item->sceneBoundingRect();
+        return {};
+    }
+};
+
+TEST_F(RunsAndDrafts, GoWithWhatIsSeenUntilThereIsAResult) {
+    LogCapture log;
+    opened.run([&] {
+        const auto covered = [&] {
+            return part().adjusted(-1, -1, 1, 1).contains(seen() & view()->sceneRect());
+        };
+        for (int i = 0; i < 4; ++i)
+            opened.click("btnZoomIn");
+        block("sldrSaturation")->setValue(130);
+        EXPECT_TRUE(QTest::qWaitFor(covered, 3000));
+        for (QScrollBar* bar : {view()->horizontalScrollBar(), view()->verticalScrollBar()})
+            bar->setValue(bar->maximum());
+        EXPECT_TRUE(QTest::qWaitFor(covered, 3000)) << "after scrolling";
+        opened.click("btnZoomOut");
+        opened.click("btnZoomOut");
+        EXPECT_TRUE(QTest::qWaitFor(covered, 3000)) << "after zooming";
+        EXPECT_FALSE(log.has("CWgtPaneAdvancedImpl::applyGUIParams")) << "the listing is one of runs";
+        opened.core()->setObserver([](const TaskReport&) { throw std::bad_alloc(); });
+        boxes([&] { opened.click("btnRefresh"); });
+        EXPECT_TRUE(part().isNull()) << "a run that failed left a step over the picture before";
+        opened.click("btnCancel");
+    });
 }
 
 } // namespace
