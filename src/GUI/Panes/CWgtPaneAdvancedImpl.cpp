@@ -25,10 +25,13 @@ void CWgtPaneAdvancedImpl::doSetSliders(const QString& presetName) {
     showColors(PaneTable::colors(Mode_Advanced), factory.mSliderParams);
 }
 
-void CWgtPaneAdvancedImpl::applyGUIParams(CUserParams& params) {
-    CSliderParams& settings = params.mSliderParams;
+void CWgtPaneAdvancedImpl::writeSettings(CSliderParams& settings) const {
     writeSliders(PaneTable::sliders(Mode_Advanced), settings);
     writeColors(PaneTable::colors(Mode_Advanced), settings);
+}
+
+void CWgtPaneAdvancedImpl::applyGUIParams(CUserParams& params) {
+    writeSettings(params.mSliderParams);
     Log::log(LogLevel::Debug, "CWgtPaneAdvancedImpl::applyGUIParams");
     params.list(QStringLiteral("CWgtPaneAdvancedImpl::applyGUIParams"));
     Log::log(LogLevel::Debug, "CWgtPaneAdvancedImpl::applyGUIParams finished.");

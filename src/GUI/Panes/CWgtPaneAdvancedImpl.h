@@ -12,6 +12,7 @@ public:
     CWgtPaneAdvancedImpl(QWidget* owner, EGUIMode mode);
 
     void applyGUIParams(CUserParams& params) override;
+    void writeSettings(CSliderParams& settings) const override;
     CThreadedCore* createCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* owner) override;
 
 public Q_SLOTS:

@@ -55,12 +55,15 @@ void CWgtPaneFinalTouchImpl::doSetSliders(const QString&) {
         setUpSlider(slider, false, slider.initial);
 }
 
-void CWgtPaneFinalTouchImpl::applyGUIParams(CUserParams& params) {
-    CSliderParams& settings = params.mSliderParams;
+void CWgtPaneFinalTouchImpl::writeSettings(CSliderParams& settings) const {
     writeSliders(PaneTable::sliders(Mode_FinalTouch), settings);
     writeColors(PaneTable::colors(Mode_FinalTouch), settings);
+}
+
+void CWgtPaneFinalTouchImpl::applyGUIParams(CUserParams& params) {
+    writeSettings(params.mSliderParams);
     Log::log(LogLevel::Debug, "TMP: params.mSliderParams.mColor_Touch_Enabled %d.",
-             settings.mColor_Touch_Enabled);
+             params.mSliderParams.mColor_Touch_Enabled);
 }
 
 CThreadedCore* CWgtPaneFinalTouchImpl::createCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* owner) {

@@ -31,8 +31,7 @@ void CWgtPaneGenericImpl::addColorPicker(const PaneColor& color) {
     setUpColorPicker(picker, color, sldrGeneric);
 }
 
-void CWgtPaneGenericImpl::applyGUIParams(CUserParams& params) {
-    CSliderParams& settings = params.mSliderParams;
+void CWgtPaneGenericImpl::writeSettings(CSliderParams& settings) const {
     if (mSlider)
         settings.*mSlider->slider.value = static_cast<float>(sldrGeneric->exactValue());
     writeColors(mColors, settings);

@@ -12,7 +12,7 @@ public:
     CWgtPaneGenericImpl(QWidget* owner, EGUIMode mode);
 
     /// Writes the position and the colour; the mode's parameters have the filter switched on.
-    void applyGUIParams(CUserParams& params) override;
+    void writeSettings(CSliderParams& settings) const override;
     CThreadedCore* createCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* owner) override;
 
 private:

@@ -85,8 +85,10 @@ CColorPicker* IWgtPane::picker(const PaneColor& color) const {
 void IWgtPane::setUpSlider(COrvelaSliderBlockImpl* block, const QString& label) {
     block->setText(label);
     block->setValue(kMiddle);
-    connect(block, SIGNAL(valueChanged(double)), mOwner, SLOT(onMy_slider_valueChanged(double)));
-    connect(block, SIGNAL(stateChanged(bool)), mOwner, SLOT(onMy_slider_stateChanged(bool)));
+    connect(block, SIGNAL(valueChanged(double)), mOwner, SLOT(onMy_slider_valueChanged(double)),
+            Qt::UniqueConnection);
+    connect(block, SIGNAL(stateChanged(bool)), mOwner, SLOT(onMy_slider_stateChanged(bool)),
+            Qt::UniqueConnection);
 }
 
 void IWgtPane::setUpSlider(const PaneSlider& slider, bool on, double position) {

@@ -32,11 +32,14 @@ public:
     bool takesProcessedImage() const { return mTakesProcessedImage; }
 
     /// Writes the states, colours and exact positions of the controls into the fields of `params` that they
-    /// drive.
-    virtual void applyGUIParams(CUserParams& params) = 0;
+    /// drive, for a run; panes log it.
+    virtual void applyGUIParams(CUserParams& params) { writeSettings(params.mSliderParams); }
 
     /// Makes the core of the pane's modes, a child of `owner`. The planes are not owned.
     virtual CThreadedCore* createCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* owner) = 0;
+
+    /// The same without a word: a slider that is moved asks for a draft at every step.
+    virtual void writeSettings(CSliderParams& settings) const = 0;
 
     /// Puts the controls to a factory preset.
     void setSliders(const QString& presetName);
@@ -54,8 +57,8 @@ Q_SIGNALS:
     void changeMode(EGUIMode mode);
 
 protected:
-    /// Labels the block, puts it to position 500 and tells the owner of its changes. Further calls make the
-    /// owner hear of a change once more.
+    /// Labels the block, puts it to position 500 and tells the owner of its changes, once however often it is
+    /// set up. The slots are found by name: panes do not know the class of their window.
     void setUpSlider(COrvelaSliderBlockImpl* block, const QString& label);
     /// Gives the slider's block all that its description holds, the state and the position (0 to 1000).
     void setUpSlider(const orvela::PaneSlider& slider, bool on, double position);

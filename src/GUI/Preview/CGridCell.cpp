@@ -1,6 +1,7 @@
 #include "GUI/Preview/CGridCell.h"
 
 #include "Core/Snapshot.h"
+#include "Utility/Logger.h"
 
 #include <QImage>
 #include <QPainter>
@@ -8,6 +9,8 @@
 
 #include <algorithm>
 #include <cmath>
+#include <new>
+#include <utility>
 
 using namespace orvela;
 
@@ -18,6 +21,8 @@ constexpr double kPixelsSeen = 2; // from this enlargement on the pixels themsel
 
 QImage imageOf(const CARGBPlane& plane, const QRect& part) {
     QImage image(part.size(), QImage::Format_RGB32);
+    if (image.isNull())
+        throw std::bad_alloc();
     const bool grey = plane.colorMode() == CARGBPlane::Grayscale;
     for (int y = part.top(); y <= part.bottom(); ++y) {
         const ConstRow row = plane.row(y);
@@ -37,14 +42,24 @@ QRectF CGridCell::boundingRect() const {
     return QRectF(QPointF(0, 0), QSizeF(part().size()));
 }
 
+// Nothing may be thrown through the event loop: a tile that finds no memory is left out.
 void CGridCell::paint(QPainter* painter, const QStyleOptionGraphicsItem*, QWidget*) {
-    const double scale = QStyleOptionGraphicsItem::levelOfDetailFromTransform(painter->deviceTransform());
+    try {
+        paintTile(*painter);
+    } catch (const std::exception& error) {
+        if (!std::exchange(mFailed, true))
+            Log::log(LogLevel::Warning, "A preview cannot be painted: %s", error.what());
+    }
+}
+
+void CGridCell::paintTile(QPainter& painter) {
+    const double scale = QStyleOptionGraphicsItem::levelOfDetailFromTransform(painter.deviceTransform());
     const int level =
         scale > 0 ? std::clamp(static_cast<int>(std::floor(-std::log2(scale))), 0, kLastLevel) : kLastLevel;
-    painter->setRenderHint(QPainter::SmoothPixmapTransform, scale < kPixelsSeen);
+    painter.setRenderHint(QPainter::SmoothPixmapTransform, scale < kPixelsSeen);
     // The last column and row of a reduced copy may stand for fewer pixels than the others.
     const QSizeF shown = QSizeF(part().size()) / (1 << level);
-    painter->drawPixmap(boundingRect(), pixmapFor(level), QRectF(QPointF(0, 0), shown));
+    painter.drawPixmap(boundingRect(), pixmapFor(level), QRectF(QPointF(0, 0), shown));
 }
 
 const QPixmap& CGridCell::pixmapFor(int level) {

@@ -20,6 +20,7 @@ public:
 
 private:
     QRect part() const { return {QPoint(mLeft, mTop), QPoint(mRight, mBottom)}; }
+    void paintTile(QPainter& painter);
     const QPixmap& pixmapFor(int level);
 
     const CARGBPlane& mPlane;
@@ -27,5 +28,6 @@ private:
     int mTop;
     int mRight;
     int mBottom;
+    bool mFailed = false;         ///< to find memory; that was logged
     QHash<int, QPixmap> mPixmaps; ///< by how often the size was halved
 };

@@ -29,6 +29,7 @@ public:
     /// @param part  the area's pixels, reduced or not
     /// @param area  in pixels of the picture
     void showPart(std::shared_ptr<const CARGBPlane> part, const QRect& area);
+    void dropPart();
 
     /// What is compared with; null for nothing.
     void setBefore(std::shared_ptr<const CARGBPlane> before);
@@ -40,7 +41,6 @@ public:
 
 private:
     void hangCurtain();
-    void dropPart();
 
     QGraphicsScene mScene;
     std::shared_ptr<const CARGBPlane> mPlane;

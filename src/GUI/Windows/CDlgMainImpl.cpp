@@ -17,6 +17,7 @@
 #include "Update/UpdateServer.h"
 #include "Utility/CGenericEx.h"
 
+#include <QCloseEvent>
 #include <QMenu>
 #include <QMessageBox>
 #include <QPointer>
@@ -79,6 +80,7 @@ CDlgMainImpl::CDlgMainImpl(void* hostWindow, CARGBPlane* inPlane, CARGBPlane* ou
     restoreState();
     setWindowTitle(tr("Orvela %1").arg(kRunningVersion, 0, 'g'));
     flatten({btnCollapse, btnExpand});
+    nameByToolTips(*this);
     btnHelp->setShortcut(QKeySequence::HelpContents);
     btnHelp->setToolTip(withKeys(btnHelp->toolTip(), {btnHelp->shortcut()}));
     if (qEnvironmentVariableIsSet("ORVELA_STYLESHEET"))
@@ -106,11 +108,13 @@ void CDlgMainImpl::showUpdateLink() {
     const QSettings settings = openSettings();
     const QString key = QStringLiteral("UpdateAvailable");
     updateAvailableLabel->setVisible(settings.contains(key));
-    updateAvailableLabel->setText(
-        tr("<a href=\"http://%1/update%2.html\">Update Available</>")
-            .arg(updateServer().host.toHtmlEscaped(), settings.value(key).toString().toHtmlEscaped()));
+    updateAvailableLabel->setText(QStringLiteral("<a href=\"http://%1/update%2.html\">%3</>")
+                                      .arg(updateServer().host.toHtmlEscaped(),
+                                           settings.value(key).toString().toHtmlEscaped(),
+                                           tr("Update Available").toHtmlEscaped()));
 }
 
+// A batch run that was stopped counts as cancelled: its picture is not written.
 bool CDlgMainImpl::run() {
     if (CBatchMode::instance().isBatchModeEnabled())
         startMode(Mode_Batch);
@@ -143,12 +147,23 @@ void CDlgMainImpl::runMode(EGUIMode mode) {
     [[maybe_unused]] const CGenericEx cancelled(QStringLiteral("User cancel."), "CDlgMainImpl", __LINE__);
 }
 
+// However it closes: an accepted dialog gets no close event. In batch mode it was nowhere.
 void CDlgMainImpl::done(int result) {
-    SettingsEdit edit;
-    addPosition(edit, *this);
-    edit.set(PresetTree::guiKey(kExpanded), isExpanded());
-    StoreWriting::commit(edit, StoreWriting::Cause::Program);
+    if (isVisible()) {
+        SettingsEdit edit;
+        addPosition(edit, *this);
+        edit.set(PresetTree::guiKey(kExpanded), isExpanded());
+        StoreWriting::commit(edit, StoreWriting::Cause::Program);
+    }
     QDialog::done(result);
+}
+
+// The frame of a window that is disabled still closes it: not while a mode runs, whose result would be
+// written all the same.
+void CDlgMainImpl::closeEvent(QCloseEvent* event) {
+    if (isEnabled())
+        return QDialog::closeEvent(event);
+    event->ignore();
 }
 
 void CDlgMainImpl::on_btnExpand_clicked() {
@@ -188,11 +203,16 @@ void CDlgMainImpl::setButtonTexts(bool shown) {
         button->setAccessibleName(text);
     }
     if (!shown)
-        btnToggleBatchMode->setText(QString());
+        btnToggleBatchMode->setText(QString()); // no text has room
+}
+
+// Not those of windows that belong to this one, such as the manual's.
+QList<QToolButton*> CDlgMainImpl::ownButtons() const {
+    return findChildren<QToolButton*>(QString(), Qt::FindDirectChildrenOnly);
 }
 
 void CDlgMainImpl::setButtonWidths(int width, const char* styleSheet) {
-    const QList<QToolButton*> buttons = findChildren<QToolButton*>();
+    const QList<QToolButton*> buttons = ownButtons();
     for (QToolButton* button : buttons) {
         button->setFixedWidth(width);
         button->setStyleSheet(QLatin1String(styleSheet));
@@ -206,20 +226,26 @@ void CDlgMainImpl::on_btnToggleBatchMode_clicked() {
     refreshBatchButton();
 }
 
+void CDlgMainImpl::tellBatchMode() {
+    const QString text =
+        tr("Batch mode is now enabled! Next time when you start Orvela, Orvela will process the image "
+           "with "
+           "the last operation you performed with orvela.\n\nTo disable batch mode, hold <b>SHIFT</b> "
+           "pressed when selecting Orvela from Plug-ins menu.");
+    QMessageBox box(QMessageBox::Information, tr("Batch Mode Enabled"),
+                    QString(text).replace(QLatin1Char('\n'), QLatin1String("<br>")), QMessageBox::Ok, this);
+    box.setTextFormat(Qt::RichText); // looked at by itself only the first line would count
+    box.exec();
+}
+
 void CDlgMainImpl::refreshBatchButton() {
     if (mWantedBatchState)
-        QMessageBox::information(
-            this, tr("Batch Mode Enabled"),
-            tr("Batch mode is now enabled! Next time when you start Orvela, Orvela will process the image "
-               "with "
-               "the last operation you performed with orvela.\n\nTo disable batch mode, hold <b>SHIFT</b> "
-               "pressed when selecting Orvela from Plug-ins menu."),
-            QMessageBox::Ok);
+        tellBatchMode();
     if (isExpanded()) {
         btnToggleBatchMode->setText(mWantedBatchState
                                         ? QCoreApplication::translate("CDlgMain", "Batch Mode is on")
                                         : QCoreApplication::translate("CDlgMain", "Batch Mode is off"));
-        fitTexts(findChildren<QToolButton*>(), font(), kExpandedWidth);
+        fitTexts(ownButtons(), font(), kExpandedWidth);
     }
     btnToggleBatchMode->setProperty(kBatchProperty, mWantedBatchState);
     btnToggleBatchMode->setIcon(QIcon(mWantedBatchState ? QStringLiteral(":/Main UI/Batch01_On_24x24.png")

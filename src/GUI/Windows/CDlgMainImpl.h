@@ -51,13 +51,18 @@ public Q_SLOTS:
     /// Opens a topic of the manual.
     void openHelpPage(const QString& page);
 
+protected:
+    void closeEvent(QCloseEvent* event) override;
+
 private:
     void startMode(EGUIMode mode);
     void runMode(EGUIMode mode);
     void restoreState();
     void showUpdateLink();
     void setButtonTexts(bool shown);
+    QList<QToolButton*> ownButtons() const;
     void setButtonWidths(int width, const char* styleSheet);
+    void tellBatchMode();
     void refreshBatchButton();
     bool isExpanded() const { return btnCollapse->isVisibleTo(this); }
 

@@ -9,7 +9,6 @@
 #include "GUI/Presets/CBatchMode.h"
 #include "GUI/Presets/CPresetStore.h"
 #include "GUI/Presets/StoreWriting.h"
-#include "GUI/Preview/CSignaledGraphicsView.h"
 #include "GUI/Preview/DraftRunner.h"
 #include "GUI/Windows/CDlgCustomPresetImpl.h"
 #include "GUI/Windows/PaneHistory.h"
@@ -73,12 +72,16 @@ CDlgSettingsImpl::CDlgSettingsImpl(EGUIMode mode, CARGBPlane* inPlane, CARGBPlan
     setupUi(this);
     for (QToolButton* button : findChildren<QToolButton*>())
         flatten({button});
+    nameByToolTips(*this);
     lblZoomLevel->setMinimumWidth(lblZoomLevel->fontMetrics().horizontalAdvance(QStringLiteral("66.7% ")));
     btnGluePreviews->hide();
     btnStopProcessing->hide();
-    mRefreshTimer.setSingleShot(true);
+    for (QTimer* timer : {&mRefreshTimer, &mDraftTimer, &mGoOnTimer})
+        timer->setSingleShot(true);
     mRefreshTimer.setInterval(kRefreshMilliseconds);
-    connect(&mRefreshTimer, &QTimer::timeout, this, &CDlgSettingsImpl::on_btnRefresh_clicked);
+    connect(&mRefreshTimer, &QTimer::timeout, this, &CDlgSettingsImpl::refreshByItself);
+    connect(&mDraftTimer, &QTimer::timeout, this, &CDlgSettingsImpl::makeDraft);
+    connect(&mGoOnTimer, &QTimer::timeout, this, &CDlgSettingsImpl::goOn);
     connect(this, &QDialog::finished, this, &CDlgSettingsImpl::onMy_this_finished);
     connect(lstBxPreset, &QComboBox::currentIndexChanged, this,
             [this](int index) { on_lstBxPreset_currentIndexChanged(lstBxPreset->itemText(index)); });
@@ -112,6 +115,7 @@ void CDlgSettingsImpl::runPreset(EGUIMode mode) {
                                              : CPresetStore::factoryPresetName(mode);
     if (name.isEmpty())
         return;
+    mRunInNonInteractiveMode = true;
     changeMode(Mode_Advanced);
     if (mFailure)
         return;
@@ -121,9 +125,11 @@ void CDlgSettingsImpl::runPreset(EGUIMode mode) {
         mPane->setSliders(name); // a store that could not be written has no factory presets
     setWindowTitle(tr("Applying custom advanced filter:") + name);
     runWithoutDialogue();
+    CBatchMode::instance().setBatchMode(mMode);
 }
 
 void CDlgSettingsImpl::runBatch(EGUIMode mode) {
+    mRunInNonInteractiveMode = true;
     changeMode(mode);
     if (mFailure)
         return;
@@ -132,12 +138,12 @@ void CDlgSettingsImpl::runBatch(EGUIMode mode) {
 }
 
 void CDlgSettingsImpl::runWithoutDialogue() {
-    mRunInNonInteractiveMode = true;
     show();
     btnOK->setEnabled(false);
     mApplyOnFinish = true;
     on_btnRefresh_clicked();
-    CBatchMode::instance().setBatchMode(mMode);
+    while (isVisible() && mRefreshWanted) // no event loop goes on after this
+        goOn();
 }
 
 void CDlgSettingsImpl::runInteractive(EGUIMode mode) {
@@ -148,32 +154,13 @@ void CDlgSettingsImpl::runInteractive(EGUIMode mode) {
     CBatchMode::instance().setBatchMode(mMode);
 }
 
-void CDlgSettingsImpl::makePreviews() {
-    mPreviews = std::make_unique<Previews>(this);
-    addKeysToPreviews();
-    CSignaledGraphicsView* original = mPreviews->originalView();
-    CSignaledGraphicsView* processed = mPreviews->processedView();
-    connect(original, &CSignaledGraphicsView::scrolledBy, this,
-            &CDlgSettingsImpl::onMy_grphVwOriginal_scrolled);
-    connect(processed, &CSignaledGraphicsView::scrolledBy, this,
-            &CDlgSettingsImpl::onMy_grphVwProcessed_scrolled);
-    for (CSignaledGraphicsView* view : {original, processed}) {
-        connect(view, &CSignaledGraphicsView::sizeChanged, this, &CDlgSettingsImpl::previewWindowSizeChanged);
-        connect(view, &CSignaledGraphicsView::zoomRequested, this,
-                [this, view](int notches, QPoint at) { mPreviews->zoomAround(view, notches, at); });
-    }
-    connect(mPreviews.get(), &Previews::zoomChanged, lblZoomLevel, &QLabel::setText);
-    mDrafts = std::make_unique<DraftRunner>();
-    connect(mDrafts.get(), &DraftRunner::done, this,
-            [this](const std::shared_ptr<CARGBPlane>& draft, const QRect& area) {
-                if (!mRunning)
-                    mPreviews->showDraft(draft, area);
-            });
-}
-
 void CDlgSettingsImpl::changeMode(EGUIMode mode) {
-    if (mRunning)
-        return stopFor([this, mode] { changeMode(mode); });
+    if (mRun != Run::None)
+        return whenIdle([this, mode] {
+            mApplyOnFinish = mRefreshWanted =
+                false; // the picture of this pane was asked for, not of the next
+            changeMode(mode);
+        });
     guarded([&] {
         const EGUIMode before = std::exchange(mMode, mode);
         if (before == Mode_Advanced && mode == Mode_FinalTouch) {
@@ -181,6 +168,7 @@ void CDlgSettingsImpl::changeMode(EGUIMode mode) {
             mAdvancedAutoRefresh = chkBxAutoRefresh->isChecked();
         }
         setWindowTitle(Translations::modeName(mode));
+        const bool wasUpToDate = mUpToDate;
         {
             const QScopedValueRollback<bool> together(mTogether, true);
             makePane(mode);
@@ -188,15 +176,14 @@ void CDlgSettingsImpl::changeMode(EGUIMode mode) {
             fillPresets();
             on_lstBxPreset_currentIndexChanged(lstBxPreset->currentText());
         }
-        startTimer();
-        later([this] { restoreWindowsStates(); });
+        QTimer::singleShot(0, this, &CDlgSettingsImpl::restoreWindowsStates);
         layout()->setSizeConstraint(QLayout::SetFixedSize);
         mUpToDate = false;
         if (before == Mode_FinalTouch && mode == Mode_Advanced) {
             lstBxPreset->setCurrentIndex(mAdvancedPreset);
             chkBxAutoRefresh->setChecked(mAdvancedAutoRefresh);
         }
-        mHistory->begin(paneState());
+        beginPane(wasUpToDate);
     });
 }
 
@@ -212,9 +199,16 @@ void CDlgSettingsImpl::makePane(EGUIMode mode) {
     preparePane();
     enableProfiling(mPane->showsPresets());
     chkBxAutoRefresh->setChecked(mPane->autoRefresh());
-    btnRefresh->setVisible(!mUpToDate);
-    if (mUpToDate && !mApplyOnFinish)
+}
+
+// Follows the results of the pane before: where they were up to date, those of this one are a second later.
+// Once everything else stands, since it tells of changes too; and where nothing comes by itself the button is
+// always there, or there would be no way on.
+void CDlgSettingsImpl::beginPane(bool wasUpToDate) {
+    btnRefresh->setVisible(!wasUpToDate || !chkBxAutoRefresh->isChecked());
+    if (wasUpToDate && !mApplyOnFinish)
         startTimer();
+    mHistory->begin(paneState());
 }
 
 void CDlgSettingsImpl::makeCore() {
@@ -222,8 +216,7 @@ void CDlgSettingsImpl::makeCore() {
         mCore->deleteLater();
     mCore = nullptr;
     mWholeTape.reset(); // of another picture
-    if (mDrafts)
-        mDrafts->cancel();
+    dropDrafts();
     prepareInput();
     mCore = mPane->createCore(mInPlane, mOutPlane, this);
     connect(mCore, &CThreadedCore::started, this, &CDlgSettingsImpl::onMy_thrdCore_started);
@@ -258,42 +251,6 @@ void CDlgSettingsImpl::enableProfiling(bool enabled) {
     frmPresets->setVisible(enabled);
 }
 
-void CDlgSettingsImpl::previewWindowSizeChanged(QRect geometry) {
-    mPreviews->fitWidth(geometry);
-}
-
-void CDlgSettingsImpl::setSplitView(bool split) {
-    btnSplitPreviews->setVisible(!split);
-    btnGluePreviews->setVisible(split);
-    mPreviews->setSplit(split);
-}
-
-void CDlgSettingsImpl::on_btnSplitPreviews_clicked() {
-    setSplitView(true);
-}
-
-void CDlgSettingsImpl::on_btnGluePreviews_clicked() {
-    setSplitView(false);
-}
-
-void CDlgSettingsImpl::onMy_grphVwOriginal_scrolled(int x, int y) {
-    Previews::align(mPreviews->processedView(), x, y);
-}
-
-void CDlgSettingsImpl::onMy_grphVwProcessed_scrolled(int x, int y) {
-    Previews::align(mPreviews->originalView(), x, y);
-}
-
-void CDlgSettingsImpl::on_btnZoomIn_clicked() {
-    if (mPreviews)
-        mPreviews->zoomIn();
-}
-
-void CDlgSettingsImpl::on_btnZoomOut_clicked() {
-    if (mPreviews)
-        mPreviews->zoomOut();
-}
-
 void CDlgSettingsImpl::on_btnTurnAllOn_clicked() {
     turnAll(true);
 }
@@ -305,7 +262,8 @@ void CDlgSettingsImpl::on_btnTurnAllOff_clicked() {
 void CDlgSettingsImpl::turnAll(bool on) {
     together(on ? tr("all sliders on") : tr("all sliders off"), [this, on] {
         for (COrvelaSliderBlockImpl* block : mPane->findChildren<COrvelaSliderBlockImpl*>())
-            block->setEnabled(on);
+            if (!on || !block->isHidden()) // nobody could switch off again what is never shown
+                block->setEnabled(on);
     });
 }
 
@@ -314,9 +272,11 @@ void CDlgSettingsImpl::on_btnHelp_clicked() {
         mOpenPage(helpTopicOf(mMode));
 }
 
+// Once: later the windows are where the user put them, and the preset is that of the way back from Final
+// Touch. Runs without dialogue have no previews, and their preset is not the window's last one.
 void CDlgSettingsImpl::restoreWindowsStates() {
     if (!isVisible() || std::exchange(mStatesRestored, true))
-        return; // closed meanwhile, or where the user put it
+        return; // closed meanwhile
     const QSettings settings = openSettings();
     restorePosition(*this);
     if (!mPreviews)
@@ -328,15 +288,24 @@ void CDlgSettingsImpl::restoreWindowsStates() {
     mHistory->begin(paneState()); // nothing of this was the user's
 }
 
+// What was stored stays where this window was closed before it came to stand by it.
 void CDlgSettingsImpl::onMy_this_finished(int) {
-    mRefreshTimer.stop();
+    for (QTimer* timer : {&mRefreshTimer, &mDraftTimer, &mGoOnTimer})
+        timer->stop();
+    if (mStatesRestored)
+        storeWindowsStates();
+    if (mPreviews)
+        mPreviews->hide();
+}
+
+// Whether they are split is nothing that a run without previews could tell.
+void CDlgSettingsImpl::storeWindowsStates() const {
     SettingsEdit edit;
     addPosition(edit, *this);
     edit.set(PresetTree::guiKey(kSelected), lstBxPreset->currentText());
     if (mPreviews) {
         edit.set(PresetTree::guiKey(kSplit), mPreviews->isSplit());
         mPreviews->saveTo(edit);
-        mPreviews->hide();
     }
     StoreWriting::commit(edit, StoreWriting::Cause::Program);
 }

@@ -4,6 +4,7 @@
 #include "Settings/EGUIMode.h"
 
 #include <QDialog>
+#include <QPointer>
 #include <QTimer>
 
 #include <exception>
@@ -29,7 +30,7 @@ struct PaneState;
 ///
 /// Runs are made on this thread and serve its events, so every slot may be called in the middle of one. A
 /// core never gets a second run meanwhile: who asks for one stops the first, and the second starts when it
-/// has returned.
+/// has returned. So does everything else that cannot be done beside a run.
 class CDlgSettingsImpl : public QDialog, private Ui::CDlgSettings {
     Q_OBJECT
 
@@ -48,9 +49,10 @@ public:
     void run();
 
     /// After run(): whether the output plane holds a result that is to be used.
-    bool appliesOnFinish() const { return mApplyOnFinish; }
+    bool appliesOnFinish() const { return mApplyOnFinish && result() == Accepted; }
 
-    /// Loads the preset into the pane.
+    /// Loads the preset into the pane. No slot: the list has no signal of that name and argument any more,
+    /// and one that is looked for by name would be missed with a warning.
     void on_lstBxPreset_currentIndexChanged(const QString& name);
 
 public Q_SLOTS:
@@ -101,11 +103,13 @@ private:
     void runBatch(EGUIMode mode);
     void runInteractive(EGUIMode mode);
     void runWithoutDialogue();
-    void makePreviews();
     void makePane(EGUIMode mode);
+    void beginPane(bool wasUpToDate);
     void makeCore();
     void prepareInput();
+    const CARGBPlane& original() const;
     void turnAll(bool on);
+    void storeWindowsStates() const;
 
     // CDlgSettingsKeys.cpp
     void addKeys();
@@ -114,6 +118,7 @@ private:
 
     // CDlgSettingsPane.cpp: what the user does to the pane
     void preparePane();
+    void orderTabs();
     orvela::PaneState paneState() const;
     void showPaneState(const orvela::PaneState& state);
     void together(const QString& what, const std::function<void()>& action);
@@ -128,18 +133,36 @@ private:
     void selectPreset(const QString& name);
     bool savePresetAs(const QString& name, bool asks, bool& isNew);
 
-    // CDlgSettingsRuns.cpp
-    void stopFor(const std::function<void()>& action);
+    // CDlgSettingsPreviews.cpp
+    void makePreviews();
     void requestDraft();
-    void startTimer();
-    void runCore();
-    void later(const std::function<void()>& action);
-    void runEnded();
-    void applyNonIteractiveMode();
-    void tellFailures();
-    void guarded(const std::function<void()>& action);
+    void makeDraft();
+    void dropDrafts();
+    void seenPartChanged();
+    void showResult();
     void showing(const std::function<void()>& action);
-    const CARGBPlane& original() const;
+
+    // CDlgSettingsRuns.cpp
+    void startTimer();
+    void refreshByItself();
+    void refresh();
+    void runCore();
+    void stopRun();
+    void whenIdle(const std::function<void()>& action);
+    void runEnded();
+    void goOn();
+    void rest(bool resting);
+    void parkFocus(const QWidget* part);
+    void giveFocusBack();
+    void applyNonIteractiveMode();
+    QString failureText() const;
+    bool isWantedDespite(const QString& failure);
+    void tell(const QString& failure);
+    void guarded(const std::function<void()>& action);
+
+    /// The run under way. One is spoilt when it was stopped, or when the controls changed since they were
+    /// read: its result is not the one that they ask for.
+    enum class Run { None, Whole, Spoilt };
 
     EGUIMode mMode;
     CARGBPlane* mInPlane;
@@ -153,17 +176,20 @@ private:
     std::shared_ptr<orvela::MeasurementTape> mWholeTape; ///< of the last whole run
     orvela::PaneHistory* mHistory;
     QTimer mRefreshTimer;
+    QTimer mDraftTimer;
+    QTimer mGoOnTimer;
     std::function<void(const QString&)> mOpenPage;
 
-    bool mUpToDate = false;
-    bool mTogether = false; ///< changes of the pane belong to one
+    Run mRun = Run::None;
+    bool mUpToDate = false;   ///< the output plane holds what the controls ask for
+    bool mDraftsSeen = false; ///< in the place of a result
+    bool mTogether = false;   ///< changes of the pane belong to one
     bool mApplyOnFinish = false;
     bool mRunInNonInteractiveMode = false;
-
-    bool mRunning = false;
-    bool mRefreshWanted = false;         ///< once the run that is being stopped has returned
-    std::function<void()> mActionWanted; ///< likewise
-    bool mRunIsStale = false;            ///< was stopped, or the settings have changed since it began
+    bool mRefreshWanted = false;           ///< once the run that is being stopped has returned
+    QList<std::function<void()>> mWaiting; ///< before that
+    QPointer<QWidget> mFocusBefore;        ///< the run
+    QString mTold;                         ///< failure of the last run
     bool mStatesRestored = false;
     std::exception_ptr mFailure; ///< for the caller of run()
 

@@ -28,6 +28,20 @@ void CDlgSettingsImpl::preparePane() {
     mPane->addActions({mHistory->undoAction(), mHistory->redoAction()});
     mPane->setContextMenuPolicy(Qt::ActionsContextMenu);
     showKeys(mPane);
+    orderTabs();
+}
+
+// The pane is made last but stands above the buttons at the bottom.
+void CDlgSettingsImpl::orderTabs() {
+    QWidget* last = btnDeletePreset;
+    for (QWidget* next = mPane->nextInFocusChain(); mPane->isAncestorOf(next);
+         next = next->nextInFocusChain())
+        if (next->focusPolicy() != Qt::NoFocus)
+            last = next;
+    for (QWidget* bottom : std::initializer_list<QWidget*>{btnHelp, btnOK, btnCancel}) {
+        setTabOrder(last, bottom);
+        last = bottom;
+    }
 }
 
 void CDlgSettingsImpl::onMy_slider_valueChanged(double) {
@@ -68,9 +82,10 @@ void CDlgSettingsImpl::together(const QString& what, const std::function<void()>
 
 void CDlgSettingsImpl::requestRefresh() {
     mUpToDate = false;
-    mRunIsStale = true;
-    if (mRunning && mApplyOnFinish)
-        return on_btnRefresh_clicked(); // what is applied is what the pane says
+    if (mRun == Run::Whole)
+        mRun = Run::Spoilt;
+    if (mRun != Run::None && mApplyOnFinish)
+        return refresh(); // what is applied is what the pane says
     startTimer();
     requestDraft();
 }
@@ -116,7 +131,7 @@ bool CDlgSettingsImpl::eventFilter(QObject* watched, QEvent* event) {
         auto* drop = static_cast<QDropEvent*>(event);
         drop->acceptProposedAction();
         // Who dragged it waits for the end of this event: no box before.
-        later([this, urls = drop->mimeData()->urls()] { loadDropped(urls); });
+        whenIdle([this, urls = drop->mimeData()->urls()] { loadDropped(urls); });
         return true;
     }
     default:
@@ -125,12 +140,10 @@ bool CDlgSettingsImpl::eventFilter(QObject* watched, QEvent* event) {
 }
 
 void CDlgSettingsImpl::loadDropped(const QList<QUrl>& urls) {
-    if (mRunning)
-        return stopFor([this, urls] { loadDropped(urls); });
     try {
         const QString path = PresetDrop::fileOf(urls);
         CUserParamsPhotoshop now(mMode);
-        mPane->applyGUIParams(now);
+        mPane->writeSettings(now.mSliderParams);
         QStringList left;
         together(QFileInfo(path).fileName(),
                  [&] { left = PresetDrop::load(mPane, mMode, now.mSliderParams, path); });

@@ -11,30 +11,24 @@
 #include "Utility/DebugBoxes.h"
 #include "Utility/Logger.h"
 
+#include <QApplication>
+#include <QMessageBox>
 #include <QScopedValueRollback>
 
 using namespace orvela;
 
-void CDlgSettingsImpl::requestDraft() {
-    if (!mPreviews || mRunning || !isVisible())
-        return;
-    DraftRunner::Request request;
-    request.picture = mPreviews->originalCopy();
-    request.host = mPane->takesProcessedImage() ? mOriginalCopy : request.picture;
-    const Previews::Seen part = mPreviews->draftPart();
-    request.area = part.area;
-    request.reduction = part.reduction;
-    request.params = CUserParamsPhotoshop(mMode);
-    mPane->applyGUIParams(request.params);
-    request.finalTouch = mMode == Mode_FinalTouch;
-    request.tape = mWholeTape;
-    if (request.picture && request.host && !request.area.isEmpty())
-        mDrafts->request(std::move(request));
+void CDlgSettingsImpl::startTimer() {
+    if (chkBxAutoRefresh->isChecked() && !mRunInNonInteractiveMode)
+        mRefreshTimer.start();
 }
 
-void CDlgSettingsImpl::startTimer() {
-    if (chkBxAutoRefresh->isChecked())
+// A run that reads the controls as they stand makes it needless, and nothing starts behind a box, a menu or a
+// list that is open.
+void CDlgSettingsImpl::refreshByItself() {
+    if (QApplication::activePopupWidget() || QApplication::activeModalWidget() != this)
         mRefreshTimer.start();
+    else if (mRun != Run::Whole)
+        refresh();
 }
 
 void CDlgSettingsImpl::on_chkBxAutoRefresh_clicked(bool checked) {
@@ -43,15 +37,18 @@ void CDlgSettingsImpl::on_chkBxAutoRefresh_clicked(bool checked) {
         startTimer();
 }
 
-// Asked for in the middle of a run, it is made up for once that has returned.
 void CDlgSettingsImpl::on_btnRefresh_clicked() {
+    mTold.clear();
+    refresh();
+}
+
+// Asked for in the middle of a run, it is made up for once that has returned.
+void CDlgSettingsImpl::refresh() {
     if (!isVisible())
-        return; // closed: what is shown as the result stays it
-    if (mRunning) {
-        mRunIsStale = true;
-        mRefreshWanted = true;
-        mCore->stop();
         return;
+    if (mRun != Run::None) {
+        mRefreshWanted = true;
+        return stopRun();
     }
     if (mUpToDate && mCore->lastProcessingDone()) {
         if (mApplyOnFinish)
@@ -64,62 +61,99 @@ void CDlgSettingsImpl::on_btnRefresh_clicked() {
 
 void CDlgSettingsImpl::runCore() {
     mUpToDate = false;
-    mRunIsStale = false;
+    rest(true); // before the controls are read: it ends a drag or a number half typed
+    dropDrafts();
     CUserParamsPhotoshop params(mMode);
     mPane->applyGUIParams(params);
     mCore->setParams(params);
     if (mRunInNonInteractiveMode)
         applyNonIteractiveMode();
-    if (mDrafts)
-        mDrafts->cancel();
     mTape = std::make_shared<MeasurementTape>();
     mCore->recordTape(mPreviews ? mTape.get() : nullptr);
-    const QScopedValueRollback<bool> running(mRunning, true);
+    const QScopedValueRollback<Run> running(mRun, Run::Whole);
     Q_EMIT mCore->started();
     mCore->run();
     Q_EMIT mCore->finished();
 }
 
-// What cannot be done beside the run that is under way comes after it.
-void CDlgSettingsImpl::stopFor(const std::function<void()>& action) {
-    mActionWanted = action;
-    mApplyOnFinish = false;
-    mRunIsStale = true;
+void CDlgSettingsImpl::stopRun() {
+    if (mRun == Run::None)
+        return;
+    mRun = Run::Spoilt;
     mCore->stop();
 }
 
-// In the next pass of the event loop, if the window is still there.
-void CDlgSettingsImpl::later(const std::function<void()>& action) {
-    auto* timer = new QTimer(this);
-    timer->setSingleShot(true);
-    connect(timer, &QTimer::timeout, this, [timer, action] {
-        timer->deleteLater();
-        action();
-    });
-    timer->start(0);
+// Not at once, since this may be called from within a slot of the pane.
+void CDlgSettingsImpl::whenIdle(const std::function<void()>& action) {
+    mWaiting.append(action);
+    if (mRun == Run::None)
+        mGoOnTimer.start();
+    else
+        stopRun();
 }
 
-// What was asked for meanwhile. Not at once: this may be called from within a slot of the pane.
+// A run that ended applies what OK asked for, or goes on with what came in meanwhile.
 void CDlgSettingsImpl::runEnded() {
-    const bool again = std::exchange(mRefreshWanted, false);
-    const std::function<void()> action = std::exchange(mActionWanted, nullptr);
     if (!isVisible())
         return; // closed by what happened meanwhile
-    tellFailures();
-    if (action)
-        later(action);
-    else if (again)
-        later([this] { on_btnRefresh_clicked(); });
+    const QString failure = failureText();
+    if (!mCore->lastProcessingDone())
+        mApplyOnFinish = false; // nothing is there to apply, and the user chooses what to do
+    if (mApplyOnFinish && mUpToDate) {
+        if (failure.isEmpty() || isWantedDespite(failure))
+            return accept();
+        mApplyOnFinish = false;
+    }
+    showResult();
+    tell(failure);
+    mRefreshWanted = mRefreshWanted || mApplyOnFinish; // the run was not the one that OK asked for
+    if (mRefreshWanted || !mWaiting.isEmpty())
+        mGoOnTimer.start();
+}
+
+// One thing at a time: each may open a box, close the window or be told of by its signals.
+void CDlgSettingsImpl::goOn() {
+    if (mRun != Run::None) // begun since
+        return mWaiting.isEmpty() ? void() : stopRun();
+    if (!mWaiting.isEmpty())
+        mWaiting.takeFirst()();
+    else if (std::exchange(mRefreshWanted, false))
+        return refresh();
+    if (isVisible() && (mRefreshWanted || !mWaiting.isEmpty()))
+        mGoOnTimer.start();
+}
+
+// What changes the settings, or opens a box that would halt the run, waits for its end. The focus waits at
+// the progress, where no key does harm: Qt would leave it nowhere, or on the next button that is in use.
+void CDlgSettingsImpl::rest(bool resting) {
+    for (QWidget* part : std::initializer_list<QWidget*>{mPane, frmPresets, chkBxAutoRefresh, btnTurnAllOn,
+                                                         btnTurnAllOff, btnRefresh}) {
+        if (resting)
+            parkFocus(part);
+        part->setEnabled(!resting);
+    }
+    mHistory->setUsable(!resting);
+}
+
+void CDlgSettingsImpl::parkFocus(const QWidget* part) {
+    QWidget* focused = focusWidget();
+    if (!focused || (part != focused && !part->isAncestorOf(focused)))
+        return;
+    mFocusBefore = focused;
+    prgBrCoreStatus->setFocus(Qt::OtherFocusReason);
+}
+
+void CDlgSettingsImpl::giveFocusBack() {
+    QWidget* before = std::exchange(mFocusBefore, nullptr);
+    if (before && before->isVisible() && (!focusWidget() || focusWidget() == prgBrCoreStatus))
+        before->setFocus(Qt::OtherFocusReason);
 }
 
 void CDlgSettingsImpl::onMy_thrdCore_started() {
     if (mApplyOnFinish)
         btnOK->setEnabled(false);
-    chkBxAutoRefresh->setEnabled(false);
     btnRefresh->hide();
     btnStopProcessing->show();
-    mPane->setEnabled(false);
-    mHistory->setUsable(false);
     if (!mPane->takesProcessedImage())
         mInPlane->copyFrom(original());
 }
@@ -140,36 +174,27 @@ void CDlgSettingsImpl::onMy_thrdCore_stepDone(int step, int total) {
     onMy_thrdCore_stepDone(step, total, QString());
 }
 
+// A stopped run ends like any other, but its picture is not the one that was asked for: OK makes another.
+// Final Touch goes on from it, since that is the picture that is seen.
 void CDlgSettingsImpl::onMy_thrdCore_finished() {
-    chkBxAutoRefresh->setEnabled(true);
+    rest(false);
     btnStopProcessing->hide();
     btnRefresh->setVisible(!chkBxAutoRefresh->isChecked());
     btnOK->setEnabled(true);
-    mPane->setEnabled(true);
-    mHistory->setUsable(true);
-    mUpToDate = !mRunIsStale;
+    giveFocusBack();
+    mUpToDate = mRun == Run::Whole;
     if (mUpToDate && mCore->lastProcessingDone())
         mWholeTape = mTape;
-    if (!mCore->lastProcessingDone()) {
-        mApplyOnFinish = false; // nothing is there to apply
-        return;
-    }
-    if (!isVisible())
-        return;
-    if (mApplyOnFinish && mUpToDate)
-        accept();
-    else if (mPreviews)
-        showing([this] { mPreviews->showProcessed(*mOutPlane); });
 }
 
 void CDlgSettingsImpl::on_btnStopProcessing_clicked() {
     mApplyOnFinish = false;
     mRefreshWanted = false;
-    mRunIsStale = true;
-    mCore->stop();
+    stopRun();
 }
 
 void CDlgSettingsImpl::on_btnOK_clicked() {
+    parkFocus(btnOK);
     btnOK->setEnabled(false);
     mApplyOnFinish = true;
     on_btnRefresh_clicked();
@@ -188,9 +213,8 @@ void CDlgSettingsImpl::accept() {
 void CDlgSettingsImpl::reject() {
     mApplyOnFinish = false;
     mRefreshWanted = false;
-    mActionWanted = nullptr;
-    if (mCore)
-        mCore->stop();
+    mWaiting.clear();
+    stopRun();
     QDialog::reject();
 }
 
@@ -214,16 +238,27 @@ void CDlgSettingsImpl::applyNonIteractiveMode() {
         hidden->hide();
 }
 
-void CDlgSettingsImpl::tellFailures() {
-    QString text;
+QString CDlgSettingsImpl::failureText() const {
     if (!mCore->lastProcessingDone())
-        text = tr("The picture could not be processed: %1").arg(mCore->failure().cause);
+        return tr("The picture could not be processed: %1").arg(mCore->failure().cause);
     for (const TaskReport& report : mCore->reports())
-        if (report.outcome == TaskOutcome::Failed && text.isEmpty())
-            text = tr("A step of the processing failed and was left out: %1 (%2)")
-                       .arg(report.failure.cause, QLatin1String(report.name));
-    if (!text.isEmpty())
-        DebugBoxes::warningBox(static_cast<QWidget*>(this), tr("Warning"), text);
+        if (report.outcome == TaskOutcome::Failed)
+            return tr("A step of the processing failed and was left out: %1 (%2)")
+                .arg(report.failure.cause, QLatin1String(report.name));
+    return {};
+}
+
+bool CDlgSettingsImpl::isWantedDespite(const QString& failure) {
+    mTold = failure;
+    return QMessageBox::question(this, tr("Warning"),
+                                 failure + QLatin1String("\n\n") + tr("Use the picture nevertheless?"),
+                                 QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes;
+}
+
+// Once, and not after each of the runs that follow by themselves.
+void CDlgSettingsImpl::tell(const QString& failure) {
+    if (std::exchange(mTold, failure) != failure && !failure.isEmpty())
+        DebugBoxes::warningBox(static_cast<QWidget*>(this), tr("Warning"), failure);
 }
 
 // Nothing may be thrown through the event loop. What keeps the mode from going on ends the dialogue and is
@@ -234,14 +269,5 @@ void CDlgSettingsImpl::guarded(const std::function<void()>& action) {
     } catch (...) {
         mFailure = std::current_exception();
         reject();
-    }
-}
-
-// A preview that finds no memory stays as it was; the picture itself is not touched.
-void CDlgSettingsImpl::showing(const std::function<void()>& action) {
-    try {
-        action();
-    } catch (const CGenericEx& error) {
-        Log::log(LogLevel::Warning, "The preview cannot be shown: %s", error.what());
     }
 }

@@ -164,6 +164,7 @@ void HelpWindow::belongTo(QWidget* owner) {
     if (parentWidget())
         parentWidget()->removeEventFilter(this);
     setParent(owner, windowFlags());
+    setEnabled(true); // it was disabled with the window before
     owner->installEventFilter(this);
     setGeometry(place);
     if (windowHandle()) // or the window manager would choose a place again, having chosen the first one

@@ -116,8 +116,9 @@ void PaneHistory::showState(const PaneState& state) {
 void PaneHistory::updateActions() {
     const auto update = [this](QAction* action, bool possible, const QString& name, const QString& step) {
         action->setEnabled(mUsable && possible);
-        action->setText(step.isEmpty() ? name : tr("%1: %2", "undo or redo: what").arg(name, step));
-        action->setToolTip(withKeys(action->text(), action->shortcuts()));
+        QString text = step.isEmpty() ? name : tr("%1: %2", "undo or redo: what").arg(name, step);
+        action->setToolTip(withKeys(text, action->shortcuts()));
+        action->setText(text.replace(QLatin1Char('&'), QLatin1String("&&"))); // in menus it marks a key
     };
     update(mUndo, mStack.canUndo(), tr("Undo"), mStack.undoText());
     update(mRedo, mStack.canRedo(), tr("Redo"), mStack.redoText());

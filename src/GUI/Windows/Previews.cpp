@@ -60,6 +60,8 @@ Previews::Previews(QWidget* owner)
     addKey(Qt::Key_1, Qt::ControlModifier, [this] { zoomToPixels(); });
     addKey(Qt::Key_F3, {}, [this] { setComparing(!isComparing()); });
     qApp->installEventFilter(this);
+    for (QScrollBar* bar : {mProcessedView->horizontalScrollBar(), mProcessedView->verticalScrollBar()})
+        connect(bar, &QScrollBar::valueChanged, this, &Previews::seenPartChanged);
 }
 
 // The views would outlive their scenes: the windows belong to the owner.
@@ -112,6 +114,11 @@ void Previews::showStep(const CThreadedCore& core) {
     mProcessed.showPart(core.snapshot(area, reduction), area);
     mBar->setDraft(false);
     mSinceStep.start();
+}
+
+void Previews::dropStep() {
+    mProcessed.dropPart();
+    mBar->setDraft(false);
 }
 
 Previews::Seen Previews::draftPart() const {
@@ -176,8 +183,11 @@ void Previews::fitWidth(const QRect& viewGeometry) {
 }
 
 void Previews::scaleTo(double scale) {
-    for (QGraphicsView* view : {mOriginalView, mProcessedView})
+    for (QGraphicsView* view : {mOriginalView, mProcessedView}) {
         view->setTransform(QTransform::fromScale(scale, scale));
+        view->setSceneRect(QRectF()); // the scene's: lays it out anew also where only the height is another
+    }
+    Q_EMIT seenPartChanged();
 }
 
 void Previews::zoomTo(int step) {

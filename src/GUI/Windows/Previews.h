@@ -42,6 +42,10 @@ public:
     /// Shows the picture of a run as it stands between two tasks, where and as finely as it is seen; not more
     /// often than the eye can follow.
     void showStep(const CThreadedCore& core);
+    /// The next step is shown however soon it comes.
+    void showNextStep() { mSinceStep.invalidate(); }
+    /// Shows the last whole picture in place of the steps or the draft after it.
+    void dropStep();
 
     /// The part of the processed picture that is seen, in its pixels, and how many of them, in a row, become
     /// one of the screen (1 at least).
@@ -100,6 +104,8 @@ public:
 Q_SIGNALS:
     /// What the zoom is called now.
     void zoomChanged(const QString& text);
+    /// Another part of the pictures, or as many pixels of the screen for it, than before.
+    void seenPartChanged();
 
 protected:
     bool eventFilter(QObject* watched, QEvent* event) override;

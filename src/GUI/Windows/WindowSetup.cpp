@@ -4,6 +4,7 @@
 #include "Settings/PresetTree.h"
 #include "Settings/SettingsStore.h"
 
+#include <QComboBox>
 #include <QCoreApplication>
 #include <QGuiApplication>
 #include <QPoint>
@@ -40,6 +41,15 @@ void flatten(std::initializer_list<QWidget*> buttons) {
              {QPalette::Light, QPalette::Midlight, QPalette::Dark, QPalette::Mid, QPalette::Shadow})
             palette.setBrush(QPalette::All, role, window);
         button->setPalette(palette);
+    }
+}
+
+void nameByToolTips(const QWidget& window) {
+    for (QWidget* control : window.findChildren<QWidget*>()) {
+        const auto* button = qobject_cast<QAbstractButton*>(control);
+        if (((button && button->text().isEmpty()) || qobject_cast<QComboBox*>(control)) &&
+            control->accessibleName().isEmpty())
+            control->setAccessibleName(control->toolTip());
     }
 }
 

@@ -18,6 +18,10 @@ class SettingsEdit;
 /// Takes the relief from buttons: the shading roles of their palette become the brush of the window.
 void flatten(std::initializer_list<QWidget*> buttons);
 
+/// Names buttons without a text, and lists, by their tool tips, for who does not see their pictures. Those
+/// that have a name keep it.
+void nameByToolTips(const QWidget& window);
+
 /// A tool tip that tells the keys of what it belongs to, if there are any.
 QString withKeys(const QString& toolTip, const QList<QKeySequence>& keys);
 

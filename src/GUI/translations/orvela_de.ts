@@ -227,10 +227,6 @@
         <translation>Orvela %1</translation>
     </message>
     <message>
-        <source>&lt;a href=&quot;http://%1/update%2.html&quot;&gt;Update Available&lt;/&gt;</source>
-        <translation>&lt;a href=&quot;http://%1/update%2.html&quot;&gt;Neue Version&lt;/&gt;</translation>
-    </message>
-    <message>
         <source>Batch Mode Enabled</source>
         <translation>Stapelmodus eingeschaltet</translation>
     </message>
@@ -241,6 +237,10 @@ To disable batch mode, hold &lt;b&gt;SHIFT&lt;/b&gt; pressed when selecting Orve
         <translation>Der Stapelmodus ist eingeschaltet. Beim nächsten Start bearbeitet Orvela das Bild so, wie Sie zuletzt eines bearbeitet haben.
 
 Zum Ausschalten halten Sie die &lt;b&gt;Umschalttaste&lt;/b&gt; gedrückt, während Sie Orvela im Menü der Filter wählen.</translation>
+    </message>
+    <message>
+        <source>Update Available</source>
+        <translation>Neue Version</translation>
     </message>
 </context>
 <context>
@@ -323,6 +323,10 @@ Zum Ausschalten halten Sie die &lt;b&gt;Umschalttaste&lt;/b&gt; gedrückt, währ
     <message>
         <source>Go back to the mode selection without any processement.</source>
         <translation>Zurück zur Auswahl, ohne das Bild zu ändern.</translation>
+    </message>
+    <message>
+        <source>View the Orvela Manual.</source>
+        <translation>Das Handbuch von Orvela öffnen.</translation>
     </message>
 </context>
 <context>
@@ -421,6 +425,10 @@ Ihre Änderungen verloren. Fortfahren?</translation>
     <message>
         <source>This name is kept for the last operation. Choose another one.</source>
         <translation>Dieser Name ist für den letzten Vorgang reserviert. Wählen Sie einen anderen.</translation>
+    </message>
+    <message>
+        <source>Use the picture nevertheless?</source>
+        <translation>Das Bild trotzdem verwenden?</translation>
     </message>
 </context>
 <context>

@@ -227,10 +227,6 @@
         <translation>Orvela %1</translation>
     </message>
     <message>
-        <source>&lt;a href=&quot;http://%1/update%2.html&quot;&gt;Update Available&lt;/&gt;</source>
-        <translation>&lt;a href=&quot;http://%1/update%2.html&quot;&gt;Nueva versión&lt;/&gt;</translation>
-    </message>
-    <message>
         <source>Batch Mode Enabled</source>
         <translation>Modo por lotes activado</translation>
     </message>
@@ -241,6 +237,10 @@ To disable batch mode, hold &lt;b&gt;SHIFT&lt;/b&gt; pressed when selecting Orve
         <translation>El modo por lotes está activado. La próxima vez que inicie Orvela, procesará la imagen con la última operación que realizó.
 
 Para desactivarlo, mantenga pulsada la tecla &lt;b&gt;Mayús&lt;/b&gt; al elegir Orvela en el menú de filtros.</translation>
+    </message>
+    <message>
+        <source>Update Available</source>
+        <translation>Nueva versión</translation>
     </message>
 </context>
 <context>
@@ -323,6 +323,10 @@ Para desactivarlo, mantenga pulsada la tecla &lt;b&gt;Mayús&lt;/b&gt; al elegir
     <message>
         <source>Go back to the mode selection without any processement.</source>
         <translation>Volver a la selección sin modificar la imagen.</translation>
+    </message>
+    <message>
+        <source>View the Orvela Manual.</source>
+        <translation>Abrir el manual de Orvela.</translation>
     </message>
 </context>
 <context>
@@ -421,6 +425,10 @@ los cambios realizados. ¿Continuar?</translation>
     <message>
         <source>This name is kept for the last operation. Choose another one.</source>
         <translation>Este nombre está reservado para la última operación. Elija otro.</translation>
+    </message>
+    <message>
+        <source>Use the picture nevertheless?</source>
+        <translation>¿Usar la imagen de todos modos?</translation>
     </message>
 </context>
 <context>

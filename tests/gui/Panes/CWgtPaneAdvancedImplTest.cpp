@@ -83,3 +83,18 @@ TEST(CWgtPaneAdvancedImpl, ScrollsToTheRowThatTabReaches) {
         EXPECT_FALSE(part->visibleRegion().isEmpty());
     }
 }
+
+TEST(CWgtPaneAdvancedImpl, TellsOfAChangeOnceHoweverManyPresetsWereLoaded) {
+    const Shown<CWgtPaneAdvancedImpl> shown(Mode_Advanced);
+    COrvelaSliderBlockImpl* block = shown.pane->sldrIllumination;
+    const auto told = [&](int key) {
+        block->setEnabled(true);
+        const qsizetype before = shown.owner.values.size();
+        QTest::keyClick(block->sldrValue, Qt::Key(key));
+        return shown.owner.values.size() - before;
+    };
+    const qsizetype first = told(Qt::Key_Left);
+    for (int i = 0; i < 20; ++i)
+        shown.pane->setSliders(QStringLiteral("Portrait"));
+    EXPECT_EQ(told(Qt::Key_Left), first);
+}

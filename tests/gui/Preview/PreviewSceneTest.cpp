@@ -1,5 +1,7 @@
 #include "GUI/Preview/PreviewScene.h"
 
+#include "GUI/Preview/CGridCell.h"
+#include "support/LogCapture.h"
 #include "support/TestPlanes.h"
 
 #include <QGraphicsItem>
@@ -62,6 +64,21 @@ TEST(PreviewScene, OneCellReadsThePlaneWhenFirstPainted) {
     const CARGBPlane empty(0, 0, QStringLiteral("empty"));
     PreviewScene::show(scene, empty);
     EXPECT_TRUE(scene.items().isEmpty());
+}
+
+TEST(CGridCell, LeavesATileOutThatFindsNoMemoryAndLogsItOnce) {
+    const auto plane = places(4, 1);
+    CGridCell cell(*plane, 0, 0, 70'000'000, 0); // no image can be so wide
+    QImage ground(4, 4, QImage::Format_RGB32);
+    ground.fill(Qt::magenta);
+    const QImage before = ground.copy();
+    const LogCapture log;
+    QPainter painter(&ground);
+    for (int i = 0; i < 2; ++i)
+        cell.paint(&painter, nullptr, nullptr);
+    painter.end();
+    EXPECT_EQ(ground, before);
+    EXPECT_EQ(log.lines().size(), 1U);
 }
 
 } // namespace

@@ -152,4 +152,79 @@ TEST_F(CDlgMainImplTest, AboutAndInformationsMayLoseTheirParent) {
     }
 }
 
+TEST_F(CDlgMainImplTest, StaysWhileAModeRunsWhateverItsFrameIsAsked) {
+    bool stayed = false;
+    EXPECT_TRUE(run([&] {
+        QTimer::singleShot(0, &*mWindow, [&] { // in the midst of the run
+            mWindow->close();
+            stayed = mWindow->isVisible();
+        });
+        click("btnAutomatic");
+    }));
+    EXPECT_TRUE(stayed);
+}
+
+TEST_F(CDlgMainImplTest, SaysHowToEndBatchModeInBold) {
+    QString said;
+    const ModalDialogs reader([&said](QDialog& dialog) {
+        auto* box = qobject_cast<QMessageBox*>(&dialog);
+        if (!box)
+            return;
+        EXPECT_EQ(box->textFormat(), Qt::RichText);
+        said = box->text();
+        box->accept();
+    });
+    run([&] {
+        click("btnToggleBatchMode");
+        mWindow->close();
+    });
+    EXPECT_TRUE(said.contains("orvela.<br><br>To disable batch mode, hold <b>SHIFT</b>")) << qPrintable(said);
+}
+
+TEST_F(CDlgMainImplTest, InBatchModeLeavesAloneWhereItWasLast) {
+    run([&] { click("btnAutomatic"); });
+    const QString place = QStringLiteral("2000/GUI/CDlgMainImpl/pos");
+    openSettings().setValue(place, QPoint(77, 88));
+    CBatchMode::instance().setBatchModeEnabled(true);
+    reopen();
+    mWindow->move(5, 6);
+    EXPECT_TRUE(mWindow->run());
+    EXPECT_EQ(openSettings().value(place).toPoint(), QPoint(77, 88));
+}
+
+TEST_F(CDlgMainImplTest, LeavesItsHelpAsItIsAndInUse) {
+    bool usable = false;
+    const auto help = [] {
+        for (QWidget* window : QApplication::topLevelWidgets())
+            if (window->objectName() == QLatin1String("HelpWindow"))
+                return window;
+        return static_cast<QWidget*>(nullptr);
+    };
+    const ModalDialogs hand([&](QDialog& dialog) {
+        if (dialog.objectName() != QLatin1String("CDlgSettings"))
+            return;
+        QTest::qWait(50);
+        usable = help()->isEnabled() && help()->parentWidget() == &dialog;
+        dialog.reject();
+    });
+    run([&] {
+        click("btnHelp");
+        ASSERT_TRUE(help());
+        const QList<QToolButton*> buttons = help()->findChildren<QToolButton*>();
+        ASSERT_FALSE(buttons.isEmpty());
+        click("btnExpand");
+        for (const QToolButton* each : buttons)
+            EXPECT_NE(each->minimumWidth(), 124);
+        click("btnAdvanced");
+        help()->close();
+        mWindow->close();
+    });
+    EXPECT_TRUE(usable);
+}
+
+TEST_F(CDlgMainImplTest, NamesEveryButtonForWhoDoesNotSeeIt) {
+    for (const QToolButton* each : mWindow->findChildren<QToolButton*>())
+        EXPECT_FALSE(each->accessibleName().isEmpty()) << qPrintable(each->objectName());
+}
+
 } // namespace

@@ -6,6 +6,7 @@
 #include "GUI/Preview/CSignaledGraphicsView.h"
 #include "GUI/Windows/CDlgSinglePreviewImpl.h"
 #include "Settings/ModeTable.h"
+#include "Settings/SettingsStore.h"
 #include "gui/Windows/ProcessingWindow.h"
 #include "support/BoxAnswer.h"
 #include "support/BoxRecorder.h"
@@ -282,6 +283,86 @@ TEST(CDlgSettingsImpl, ZoomsByItsTableAndBothViewsKeepTogether) {
         QTest::qWait(50);
         EXPECT_EQ(label->text(), "1%");
         EXPECT_NEAR(views[0]->transform().m11() * 96, views[0]->width(), 1) << "fitted anew";
+        opened.click("btnCancel");
+    });
+}
+
+TEST(CDlgSettingsImpl, TabGoesThroughThePaneBeforeTheButtonsBelowIt) {
+    ProcessingWindow opened(Mode_Advanced, picture());
+    opened.run([&] {
+        for (const bool second : {false, true}) {
+            QStringList order;
+            QWidget* each = opened.find("chkBxAutoRefresh");
+            for (int i = 0; i < 400 && !order.contains(each->objectName()); ++i) {
+                if (each->focusPolicy() & Qt::TabFocus && !each->objectName().isEmpty() &&
+                    opened.window.isAncestorOf(each) && each->parent()->parent() == &opened.window)
+                    order += each->objectName();
+                if (opened.find("frmCentralContainer")->isAncestorOf(each) && !order.endsWith("pane"))
+                    order += QStringLiteral("pane");
+                each = each->nextInFocusChain();
+            }
+            EXPECT_EQ(order.mid(order.indexOf("btnDeletePreset")).join(' ').toStdString(),
+                      "btnDeletePreset pane btnHelp btnOK btnCancel");
+            if (!second) {
+                opened.click("btnRefresh");
+                opened.click("btnFinalTouch");
+            }
+        }
+        opened.click("btnCancel");
+    });
+}
+
+TEST(CDlgSettingsImpl, NamesEveryButtonAndListForWhoDoesNotSeeIt) {
+    const ProcessingWindow opened(Mode_Advanced, picture());
+    for (const auto* button : opened.window.findChildren<QToolButton*>())
+        EXPECT_FALSE(button->accessibleName().isEmpty() && button->text().isEmpty())
+            << qPrintable(button->objectName());
+    EXPECT_FALSE(opened.window.findChild<QComboBox*>("lstBxPreset")->accessibleName().isEmpty());
+}
+
+TEST(CDlgSettingsImpl, AllOnLeavesOffWhatIsNeverShown) {
+    ProcessingWindow opened(Mode_Advanced, picture());
+    opened.run([&] {
+        auto* hidden = opened.find<COrvelaSliderBlockImpl>("sldrAutoContrast");
+        hidden->setEnabled(false);
+        opened.click("btnTurnAllOn");
+        EXPECT_FALSE(hidden->isEnabled());
+        EXPECT_TRUE(opened.find<COrvelaSliderBlockImpl>("sldrGamma_Abs")->isEnabled()) << "of a hidden group";
+        hidden->setEnabled(true);
+        opened.click("btnTurnAllOff");
+        EXPECT_FALSE(hidden->isEnabled());
+        opened.click("btnCancel");
+    });
+}
+
+TEST(CDlgSettingsImpl, KeepsWhatIsStoredWhenItWasClosedBeforeItCameToStandThere) {
+    const QString split = QStringLiteral("2000/GUI/CDlgSettingsImpl/previewsSplitted");
+    const QString selected = QStringLiteral("2000/GUI/CDlgSettingsImpl/selectedPreset");
+    openSettings().setValue(split, true);
+    openSettings().setValue(selected, QStringLiteral("Macro"));
+    ProcessingWindow opened(Mode_Advanced, picture());
+    QTimer::singleShot(0, &opened.window, [&opened] { opened.window.reject(); });
+    opened.window.run();
+    EXPECT_TRUE(openSettings().value(split).toBool());
+    EXPECT_EQ(openSettings().value(selected).toString(), "Macro");
+    openSettings().clear();
+}
+
+TEST(CDlgSettingsImpl, AViewThatBecomesLowerReachesTheWholePicture) {
+    ProcessingWindow opened(Mode_Advanced, testplanes::noise(64, 96));
+    opened.run([&] {
+        auto* joined = opened.find("CDlgDualPreview");
+        auto* view = opened.window.findChildren<CSignaledGraphicsView*>().last();
+        joined->resize(800, 700);
+        QTest::qWait(50);
+        const auto bottom = [view] {
+            view->verticalScrollBar()->setValue(view->verticalScrollBar()->maximum());
+            return view->mapToScene(QPoint(0, view->viewport()->height())).y();
+        };
+        EXPECT_NEAR(bottom(), 96, 1);
+        joined->resize(800, 500);
+        QTest::qWait(50);
+        EXPECT_NEAR(bottom(), 96, 1);
         opened.click("btnCancel");
     });
 }
