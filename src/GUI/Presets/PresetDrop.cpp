@@ -18,22 +18,23 @@ namespace {
 
 constexpr qint64 kMostBytes = 4'000'000;
 
+struct Texts {
+    Q_DECLARE_TR_FUNCTIONS(PresetDrop)
+};
+
 [[noreturn]] void fail(const QString& message) {
     throw PresetError(message.toStdString());
 }
 
-QString text(const char* source) {
-    return QCoreApplication::translate("PresetDrop", source);
-}
-
 QByteArray contentOf(const QString& path) {
     if (!QFileInfo(path).isFile())
-        fail(text("%1: is not a file; drop one preset file, such as one that --save-preset wrote").arg(path));
+        fail(Texts::tr("%1: is not a file; drop one preset file, such as one that --save-preset wrote")
+                 .arg(path));
     QFile file(path);
     if (!file.open(QIODevice::ReadOnly))
-        fail(text("%1: cannot be read: %2").arg(path, file.errorString()));
+        fail(Texts::tr("%1: cannot be read: %2").arg(path, file.errorString()));
     if (file.size() > kMostBytes)
-        fail(text("%1: is larger than 4 MB; drop a file that --save-preset wrote").arg(path));
+        fail(Texts::tr("%1: is larger than 4 MB; drop a file that --save-preset wrote").arg(path));
     return file.readAll();
 }
 
@@ -49,7 +50,7 @@ QStringList switchedOn(const CSliderParams& sliders) {
 
 QString fileOf(const QList<QUrl>& dropped) {
     if (dropped.size() != 1 || !dropped.first().isLocalFile())
-        fail(text(
+        fail(Texts::tr(
             "Only one preset file at a time can be dropped here, such as one that --save-preset wrote."));
     return dropped.first().toLocalFile();
 }
@@ -66,8 +67,9 @@ QStringList load(QWidget* parent, EGUIMode mode, CSliderParams now, const QStrin
     QStringList left = wanted;
     left.removeIf([&kept](const QString& label) { return kept.contains(label); });
     if (!left.isEmpty() && kept.isEmpty())
-        fail(text("%1: holds nothing that these sliders can show (%2); drop it on the window of Advanced")
-                 .arg(path, left.join(QStringLiteral(", "))));
+        fail(
+            Texts::tr("%1: holds nothing that these sliders can show (%2); drop it on the window of Advanced")
+                .arg(path, left.join(QStringLiteral(", "))));
     CPresetStore::show(parent, content);
     return left;
 }

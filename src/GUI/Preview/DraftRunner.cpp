@@ -18,7 +18,9 @@ constexpr double kMeasuredPixels = 250'000; // tell of a picture nearly what all
 }
 
 DraftRunner::DraftRunner(QObject* parent)
-    : QObject(parent), mThread([this](const std::stop_token& stop) { work(stop); }) {}
+    : QObject(parent), mThread([this](const std::stop_token& stop) { work(stop); }) {
+    connect(this, &DraftRunner::made, this, &DraftRunner::tell, Qt::QueuedConnection);
+}
 
 DraftRunner::~DraftRunner() {
     mThread.request_stop();
@@ -58,15 +60,15 @@ std::optional<DraftRunner::Request> DraftRunner::next(const std::stop_token& sto
     return std::exchange(mWaiting, std::nullopt);
 }
 
-// Of one that was cancelled nothing is told, however far it came.
 void DraftRunner::process(const Request& request) {
-    const std::shared_ptr<CARGBPlane> draft = draftOf(request);
-    if (!draft)
-        return;
-    QMetaObject::invokeMethod(this, [this, draft, area = request.area, begun = mBegun] {
-        if (begun == mCancelled)
-            Q_EMIT done(draft, area);
-    });
+    if (const std::shared_ptr<CARGBPlane> draft = draftOf(request))
+        Q_EMIT made(draft, request.area, mBegun);
+}
+
+// On the thread of the receivers. Of one that was cancelled nothing is told, however far it came.
+void DraftRunner::tell(const std::shared_ptr<CARGBPlane>& draft, const QRect& area, int begun) {
+    if (begun == mCancelled)
+        Q_EMIT done(draft, area);
 }
 
 void DraftRunner::prepare(const Request& request) {

@@ -42,6 +42,8 @@ public:
 Q_SIGNALS:
     /// The draft of a part, reduced as it was asked for.
     void done(std::shared_ptr<CARGBPlane> draft, QRect area);
+    /// For this object itself, from its thread: `begun` says how often was cancelled before.
+    void made(std::shared_ptr<CARGBPlane> draft, QRect area, int begun);
 
 private:
     /// The part of the pictures that drafts start from.
@@ -56,6 +58,7 @@ private:
     void work(const std::stop_token& stop);
     std::optional<Request> next(const std::stop_token& stop);
     void process(const Request& request);
+    void tell(const std::shared_ptr<CARGBPlane>& draft, const QRect& area, int begun);
     void prepare(const Request& request);
     std::shared_ptr<CARGBPlane> draftOf(const Request& request);
     bool measure(const Request& request);

@@ -31,7 +31,7 @@ LevelCounts LevelCounts::of(const CARGBPlane& picture) {
     const std::int64_t pixels = picture.pixelCount();
     std::int64_t step = std::max<std::int64_t>(1, pixels / kPixelsCounted);
     while (std::gcd(step, std::int64_t{picture.width()}) > 1)
-        ++step; // or some columns would never be counted
+        ++step;                                                     // or some columns would never be counted
     const bool grey = picture.colorMode() == CARGBPlane::Grayscale; // the preview shows the first channel
     std::array<const std::uint8_t*, 3> samples = {};
     for (std::size_t c = 0; c < 3; ++c)

@@ -56,7 +56,7 @@ protected:
                          [&found](const std::shared_ptr<CARGBPlane>& made) { found = made; });
         runner.request(request);
         EXPECT_TRUE(QTest::qWaitFor([&found] { return found != nullptr; }));
-        runner.disconnect();
+        QObject::disconnect(&runner, &DraftRunner::done, nullptr, nullptr);
         return found;
     }
 

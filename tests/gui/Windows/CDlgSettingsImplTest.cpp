@@ -126,6 +126,26 @@ TEST(CDlgSettingsImpl, OkInTheMiddleOfARunStartsItAnewAndAcceptsTheWholeOne) {
     EXPECT_EQ(testplanes::bytes(opened.output), opened.engineResult(CUserParamsPhotoshop(Mode_Automatic)));
 }
 
+TEST(CDlgSettingsImpl, WhatIsChosenDuringARunIsWhatOkApplies) {
+    for (const char* button : {"btnRefresh", "btnOK"}) {
+        SCOPED_TRACE(button);
+        ProcessingWindow opened(Mode_Advanced, picture());
+        bool chosen = false;
+        opened.run([&] {
+            QObject::connect(opened.core(), &CThreadedCore::stepDone, &opened.window, [&](int step) {
+                if (step == 6 && !std::exchange(chosen, true))
+                    opened.find<QComboBox>("lstBxPreset")->setCurrentText(QStringLiteral("Landscape"));
+            });
+            opened.click(button);
+            if (opened.window.isVisible() && opened.find("btnOK")->isEnabled())
+                opened.click("btnOK");
+        });
+        EXPECT_TRUE(opened.window.appliesOnFinish());
+        EXPECT_EQ(testplanes::bytes(opened.output),
+                  opened.engineResult(CUserParamsPhotoshop(Mode_Landscape)));
+    }
+}
+
 TEST(CDlgSettingsImpl, ThreeChangesWithinASecondMakeOneRun) {
     ProcessingWindow opened(Mode_Advanced, picture());
     int runs = 0;
