@@ -18,6 +18,7 @@
 #include <QPointingDevice>
 #include <QScrollBar>
 #include <QTemporaryDir>
+#include <QTimer>
 #include <QToolButton>
 
 #include <benchmark/benchmark.h>
@@ -90,7 +91,10 @@ public:
             action();
             window.reject();
         };
-        QMetaObject::invokeMethod(&window, user, Qt::QueuedConnection);
+        QTimer start;
+        start.setSingleShot(true);
+        QObject::connect(&start, &QTimer::timeout, &window, user);
+        start.start(0);
         window.run();
     }
 

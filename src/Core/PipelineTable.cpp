@@ -110,12 +110,9 @@ void takeInputLuma(CUserParams& params) {
 
 constexpr char kFinished[] = "  finished";
 
-} // namespace
-
-namespace PipelineTable {
-
-std::span<const PipelineStep> mainSteps() {
-    static const std::vector<PipelineStep> steps = {
+// The main pipeline: what measures, brings out texture, and works on colour and noise.
+std::vector<PipelineStep> stepsToSpots() {
+    return {
         {"Sharp_Smart", QT_TRANSLATE_NOOP("PipelineTable", "Measuring detail"), {FILTER(Sharp_Smart)}},
         {"Histogram (00)",
          QT_TRANSLATE_NOOP("PipelineTable", "Measuring"),
@@ -167,6 +164,12 @@ std::span<const PipelineStep> mainSteps() {
          QT_TRANSLATE_NOOP("PipelineTable", "Black and white spots"),
          {FILTER(CMedian_Salt_Pepper)},
          removesSpots},
+    };
+}
+
+// What follows: tones, levels and light.
+std::vector<PipelineStep> stepsFromGamma() {
+    return {
         {"Gamma", QT_TRANSLATE_NOOP("PipelineTable", "Gamma"), {FILTER(CGamma_Simple_Filter)}},
         {"Contrast", QT_TRANSLATE_NOOP("PipelineTable", "Contrast"), {FILTER(CContrast_Simple_Filter)}},
         {"Moire", QT_TRANSLATE_NOOP("PipelineTable", "Moire"), {FILTER(CMoire), FILTER(CAverage)}},
@@ -210,6 +213,19 @@ std::span<const PipelineStep> mainSteps() {
          QT_TRANSLATE_NOOP("PipelineTable", "Automatic gamma, second pass"),
          {FILTER(Auto_Gamma)}},
     };
+}
+
+} // namespace
+
+namespace PipelineTable {
+
+std::span<const PipelineStep> mainSteps() {
+    static const std::vector<PipelineStep> steps = [] {
+        std::vector<PipelineStep> all = stepsToSpots();
+        const std::vector<PipelineStep> rest = stepsFromGamma();
+        all.insert(all.end(), rest.begin(), rest.end());
+        return all;
+    }();
     return steps;
 }
 

@@ -135,7 +135,7 @@ void CDlgMainImpl::runMode(EGUIMode mode) {
     if (window.appliesOnFinish())
         return accept();
     // Recorded as failures are, and nothing more: the user chooses again.
-    static_cast<void>(CGenericEx(QStringLiteral("User cancel."), "CDlgMainImpl", __LINE__));
+    [[maybe_unused]] const CGenericEx cancelled(QStringLiteral("User cancel."), "CDlgMainImpl", __LINE__);
 }
 
 // However it closes: an accepted dialog gets no close event. In batch mode it was nowhere.

@@ -907,6 +907,29 @@ Ihre Änderungen verloren. Fortfahren?</translation>
     </message>
 </context>
 <context>
+    <name>PresetDrop</name>
+    <message>
+        <source>%1: is not a file; drop one preset file, such as one that --save-preset wrote</source>
+        <translation>%1: ist keine Datei; ziehen Sie eine Vorgabendatei hierher, etwa eine von --save-preset</translation>
+    </message>
+    <message>
+        <source>%1: cannot be read: %2</source>
+        <translation>%1: lässt sich nicht lesen: %2</translation>
+    </message>
+    <message>
+        <source>%1: is larger than 4 MB; drop a file that --save-preset wrote</source>
+        <translation>%1: ist größer als 4 MB; ziehen Sie eine Datei von --save-preset hierher</translation>
+    </message>
+    <message>
+        <source>Only one preset file at a time can be dropped here, such as one that --save-preset wrote.</source>
+        <translation>Hierher kann nur eine Vorgabendatei auf einmal gezogen werden, etwa eine von --save-preset.</translation>
+    </message>
+    <message>
+        <source>%1: holds nothing that these sliders can show (%2); drop it on the window of Advanced</source>
+        <translation>%1: enthält nichts, was diese Regler zeigen können (%2); ziehen Sie die Datei auf das Fenster „Erweitert“</translation>
+    </message>
+</context>
+<context>
     <name>SliderTable</name>
     <message>
         <source>Temperature</source>

@@ -907,6 +907,29 @@ los cambios realizados. ¿Continuar?</translation>
     </message>
 </context>
 <context>
+    <name>PresetDrop</name>
+    <message>
+        <source>%1: is not a file; drop one preset file, such as one that --save-preset wrote</source>
+        <translation>%1: no es un archivo; suelte un archivo de preajuste, como uno de --save-preset</translation>
+    </message>
+    <message>
+        <source>%1: cannot be read: %2</source>
+        <translation>%1: no se puede leer: %2</translation>
+    </message>
+    <message>
+        <source>%1: is larger than 4 MB; drop a file that --save-preset wrote</source>
+        <translation>%1: ocupa más de 4 MB; suelte un archivo de --save-preset</translation>
+    </message>
+    <message>
+        <source>Only one preset file at a time can be dropped here, such as one that --save-preset wrote.</source>
+        <translation>Aquí solo se puede soltar un archivo de preajuste a la vez, como uno de --save-preset.</translation>
+    </message>
+    <message>
+        <source>%1: holds nothing that these sliders can show (%2); drop it on the window of Advanced</source>
+        <translation>%1: no contiene nada que estos controles puedan mostrar (%2); suéltelo en la ventana «Avanzado»</translation>
+    </message>
+</context>
+<context>
     <name>SliderTable</name>
     <message>
         <source>Temperature</source>
