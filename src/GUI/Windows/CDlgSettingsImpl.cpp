@@ -76,12 +76,13 @@ CDlgSettingsImpl::CDlgSettingsImpl(EGUIMode mode, CARGBPlane* inPlane, CARGBPlan
     lblZoomLevel->setMinimumWidth(lblZoomLevel->fontMetrics().horizontalAdvance(QStringLiteral("66.7% ")));
     btnGluePreviews->hide();
     btnStopProcessing->hide();
-    for (QTimer* timer : {&mRefreshTimer, &mDraftTimer, &mGoOnTimer})
+    for (QTimer* timer : {&mRefreshTimer, &mDraftTimer, &mGoOnTimer, &mRestoreTimer})
         timer->setSingleShot(true);
     mRefreshTimer.setInterval(kRefreshMilliseconds);
     connect(&mRefreshTimer, &QTimer::timeout, this, &CDlgSettingsImpl::refreshByItself);
     connect(&mDraftTimer, &QTimer::timeout, this, &CDlgSettingsImpl::makeDraft);
     connect(&mGoOnTimer, &QTimer::timeout, this, &CDlgSettingsImpl::goOn);
+    connect(&mRestoreTimer, &QTimer::timeout, this, &CDlgSettingsImpl::restoreWindowsStates);
     connect(this, &QDialog::finished, this, &CDlgSettingsImpl::onMy_this_finished);
     connect(lstBxPreset, &QComboBox::currentIndexChanged, this,
             [this](int index) { on_lstBxPreset_currentIndexChanged(lstBxPreset->itemText(index)); });
@@ -176,7 +177,7 @@ void CDlgSettingsImpl::changeMode(EGUIMode mode) {
             fillPresets();
             on_lstBxPreset_currentIndexChanged(lstBxPreset->currentText());
         }
-        QTimer::singleShot(0, this, &CDlgSettingsImpl::restoreWindowsStates);
+        mRestoreTimer.start();
         layout()->setSizeConstraint(QLayout::SetFixedSize);
         mUpToDate = false;
         if (before == Mode_FinalTouch && mode == Mode_Advanced) {
@@ -290,7 +291,7 @@ void CDlgSettingsImpl::restoreWindowsStates() {
 
 // What was stored stays where this window was closed before it came to stand by it.
 void CDlgSettingsImpl::onMy_this_finished(int) {
-    for (QTimer* timer : {&mRefreshTimer, &mDraftTimer, &mGoOnTimer})
+    for (QTimer* timer : {&mRefreshTimer, &mDraftTimer, &mGoOnTimer, &mRestoreTimer})
         timer->stop();
     if (mStatesRestored)
         storeWindowsStates();

@@ -178,6 +178,7 @@ private:
     QTimer mRefreshTimer;
     QTimer mDraftTimer;
     QTimer mGoOnTimer;
+    QTimer mRestoreTimer;
     std::function<void(const QString&)> mOpenPage;
 
     Run mRun = Run::None;
