@@ -32,8 +32,6 @@ constexpr std::uint64_t kSampleCopies = 2;
 constexpr std::uint64_t kChannelBytes = 2;
 constexpr std::uint64_t kPlanes = 3;
 constexpr std::uint64_t kPlaneBytes = 3;
-// The process of a HEIF's codec holds the picture several times.
-constexpr std::uint64_t kHeifCodecBytes = 10;
 
 int threadsOf(const EnhanceOptions& options) {
     return options.threads > 0 ? options.threads : RowScheduler::defaultThreads();
@@ -59,7 +57,7 @@ private:
     ExitStatus runGuarded(const Job& job);
     void runJob(const Job& job);
     void makeFolder();
-    ReadOptions reading(const Job& job) const;
+    ReadOptions reading() const;
     bool runPage(const Job& job, PhotographReader& reader, PhotographWriter& writer);
     Photograph read(PhotographReader& reader);
     std::optional<TraceOptions> traceOf(const Job& job, const Photograph& photograph) const;
@@ -120,7 +118,7 @@ void Batch::runJob(const Job& job) {
     writing.stop = &mSignals.stopRequested();
     checkTargetPath(job.target, job.source, writing.overwrite);
     mProgress.begin(QString::fromStdString(Messages::shown(job.source.filename().string())));
-    PhotographReader reader(job.source, reading(job));
+    PhotographReader reader(job.source, reading());
     PhotographWriter writer(job.target, writing);
     for (int page = 0; page < reader.pages(); ++page) {
         mProgress.page(page, reader.pages());
@@ -163,14 +161,12 @@ void Batch::makeFolder() {
         fs::create_directories(*mOptions.targets.folder, error);
 }
 
-ReadOptions Batch::reading(const Job& job) const {
+ReadOptions Batch::reading() const {
     // The final touch keeps one more plane, the trace the last picture and the one to compare it with.
     const std::uint64_t planes = kPlanes + (mSettings.runsFinalTouch ? 1 : 0) + (mOptions.trace ? 2 : 0);
     ReadOptions reading = mOptions.reading;
     reading.limits.sampleCopies = kSampleCopies;
     reading.limits.workBytes = kChannelBytes + planes * kPlaneBytes;
-    if (formatOfExtension(job.target) == FileFormat::Heif)
-        reading.limits.workBytes += kHeifCodecBytes;
     reading.limits.mappedBytes = mMapped;
     return reading;
 }

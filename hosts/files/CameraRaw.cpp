@@ -23,9 +23,10 @@ struct Mark {
 // Canon's CR2, CRW and CR3, Fujifilm's RAF, Olympus' ORF, Panasonic's RW2, Minolta's MRW, Sigma's X3F, Phase
 // One's IIQ of either byte order.
 constexpr std::array kMarks = {
-    Mark{8, "CR\2\0"sv}, Mark{6, "HEAPCCDR"sv}, Mark{4, "ftypcrx "sv}, Mark{0, "FUJIFILMCCD-RAW"sv},
-    Mark{0, "IIRO"sv},   Mark{0, "IIRS"sv},     Mark{0, "MMOR"sv},     Mark{0, "IIU\0"sv},
-    Mark{0, "\0MRM"sv},  Mark{0, "FOVb"sv},     Mark{8, "IIII"sv},     Mark{8, "MMMMRaw"sv},
+    Mark{8, "CR\2\0"sv},   Mark{6, "HEAPCCDR"sv}, Mark{4, "ftypcrx "sv}, Mark{0, "FUJIFILMCCD-RAW"sv},
+    Mark{0, "IIRO"sv},     Mark{0, "IIRS"sv},     Mark{0, "MMOR"sv},     Mark{0, "IIU\0"sv},
+    Mark{0, "\0MRM"sv},    Mark{0, "FOVb"sv},     Mark{8, "IIIITwaR"sv}, Mark{8, "IIIICwaR"sv},
+    Mark{8, "MMMMRawT"sv}, Mark{8, "MMMMRawC"sv},
 };
 
 bool isRaw(const TiffView& tiff, const TagDirectory& directory) {

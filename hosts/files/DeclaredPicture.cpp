@@ -12,8 +12,8 @@ namespace {
 
 namespace fs = std::filesystem;
 
-std::string sizeText(const DeclaredPicture& picture) {
-    return std::to_string(picture.width) + " x " + std::to_string(picture.height) + " pixels";
+std::string sizeText(std::int64_t width, std::int64_t height) {
+    return std::to_string(width) + " x " + std::to_string(height) + " pixels";
 }
 
 std::string megapixels(double count) {
@@ -29,18 +29,29 @@ void checkEdges(const DeclaredPicture& picture, const fs::path& path) {
         refuse(path, "is over 32767 pixels wide or high", "scale it down or cut it into parts");
 }
 
+// More than there is of anything stays that.
+std::uint64_t sum(std::uint64_t a, std::uint64_t b) {
+    return a > kUnlimited - std::min(b, kUnlimited) ? kUnlimited : a + b;
+}
+
+std::uint64_t product(std::uint64_t a, std::uint64_t b) {
+    return b != 0 && a > kUnlimited / b ? kUnlimited : a * b;
+}
+
 void checkMemory(const DeclaredPicture& picture, const fs::path& path, const ReadLimits& limits) {
     const auto pixels = static_cast<std::uint64_t>(picture.width * picture.height);
     const std::uint64_t letGo = picture.fileInView ? 0 : picture.fileBytes;
-    const std::uint64_t needed =
-        kBesideBytes + std::max(pixels * picture.sampleBytes + letGo,
-                                pixels * (limits.sampleCopies * picture.sampleBytes + limits.workBytes));
+    const std::uint64_t decoding = product(pixels, sum(picture.sampleBytes, picture.decoderBytes));
+    const std::uint64_t work =
+        product(pixels, sum(product(limits.sampleCopies, picture.sampleBytes), limits.workBytes));
+    const std::uint64_t needed = sum(kBesideBytes, std::max(sum(decoding, letGo), work));
     const std::uint64_t addresses = grantedAddresses();
     const std::uint64_t granted =
-        std::min(grantedMemory(), addresses - std::min(addresses, limits.mappedBytes)) + letGo;
+        sum(std::min(grantedMemory(), addresses - std::min(addresses, limits.mappedBytes)), letGo);
     if (needed > granted)
-        throw MemoryError(path.string() + ": its " + sizeText(picture) + " need about " + amountOf(needed) +
-                          " of memory, " + amountOf(granted) + " can be had; " + kMemoryAdvice);
+        throw MemoryError(path.string() + ": its " + sizeText(picture.width, picture.height) +
+                          " need about " + amountOf(needed) + " of memory, " + amountOf(granted) +
+                          " can be had; " + kMemoryAdvice);
 }
 
 } // namespace
@@ -62,15 +73,23 @@ void checkPicture(const DeclaredPicture& picture, const fs::path& path, const Re
     const auto pixels = static_cast<double>(picture.width * picture.height);
     if (pixels / picture.mostPixelsPerByte > static_cast<double>(picture.fileBytes))
         refuse(path,
-               "is damaged or cut short: it claims " + sizeText(picture) + ", more than its " +
-                   std::to_string(picture.fileBytes) + " bytes can hold",
+               "is damaged or cut short: it claims " + sizeText(picture.width, picture.height) +
+                   ", more than its " + std::to_string(picture.fileBytes) + " bytes can hold",
                kCopyAgain);
     if (pixels > limits.megapixels * 1e6)
         refuse(path,
-               "has " + megapixels(pixels / 1e6) + " (" + sizeText(picture) + "), more than the " +
-                   megapixels(limits.megapixels) + " of --max-megapixels",
+               "has " + megapixels(pixels / 1e6) + " (" + sizeText(picture.width, picture.height) +
+                   "), more than the " + megapixels(limits.megapixels) + " of --max-megapixels",
                "raise it or scale the photograph down");
     checkMemory(picture, path, limits);
+}
+
+void checkEncoding(const Photograph& photograph, const std::string& kind, std::uint64_t bytes) {
+    const std::uint64_t granted = obtainableMemory();
+    if (bytes > granted)
+        throw MemoryError(photograph.source.string() + ": to become a " + kind + " its " +
+                          sizeText(photograph.width, photograph.height) + " need about " + amountOf(bytes) +
+                          " of memory more, " + amountOf(granted) + " can be had; " + kMemoryAdvice);
 }
 
 } // namespace orvela

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "files/Photograph.h"
+#include "files/PixelBounds.h"
 
 #include <cstdint>
 #include <filesystem>
@@ -22,9 +23,9 @@ struct DeclaredPicture {
     std::int64_t height = 0;
     std::uint64_t sampleBytes = 3; ///< of each pixel, decoded
     std::uint64_t fileBytes = 0;
-    double mostPixelsPerByte =
-        std::numeric_limits<double>::infinity(); ///< that the coding of the file allows
-    bool fileInView = false;                     ///< otherwise it is in memory, and let go once it is decoded
+    double mostPixelsPerByte = bounds::kNone; ///< that the coding of the file allows
+    std::uint64_t decoderBytes = 0;           ///< that decoding takes of each pixel beside the result
+    bool fileInView = false;                  ///< otherwise it is in memory, and let go once it is decoded
 };
 
 /// Bytes of a pixel of the photograph.
@@ -38,5 +39,9 @@ void checkFileSize(std::uint64_t bytes, const std::filesystem::path& path, const
 /// @throws PhotographError, MemoryError
 void checkPicture(const DeclaredPicture& picture, const std::filesystem::path& path,
                   const ReadLimits& limits);
+
+/// Refuses a photograph before it is worked on when the memory does not suffice to encode the result, which
+/// takes so many bytes beside it. @param kind  of file, for the message @throws MemoryError
+void checkEncoding(const Photograph& photograph, const std::string& kind, std::uint64_t bytes);
 
 } // namespace orvela

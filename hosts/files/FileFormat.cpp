@@ -37,11 +37,24 @@ bool holds(ByteView file, std::size_t at, std::string_view text) {
                       [](char a, std::uint8_t b) { return static_cast<std::uint8_t>(a) == b; });
 }
 
+// Brands: the one that comes first, a number, and others that a reader may go by as well. What only says that
+// pictures are within counts as the first.
 bool isHeif(ByteView file) {
-    constexpr std::array<std::string_view, 10> brands = {"heic", "heix", "heim", "heis", "hevc",
-                                                         "hevx", "mif1", "msf1", "avif", "avis"};
-    return holds(file, 4, "ftyp") &&
-           std::any_of(brands.begin(), brands.end(), [&](auto brand) { return holds(file, 8, brand); });
+    constexpr std::array<std::string_view, 8> codings = {"heic", "heix", "heim", "heis",
+                                                         "hevc", "hevx", "avif", "avis"};
+    constexpr std::size_t first = 8;
+    constexpr std::size_t others = 16;
+    if (!holds(file, 4, "ftyp"))
+        return false;
+    const std::size_t end = std::min<std::size_t>(file.size(), number(file, 0, 4, ByteOrder::Big));
+    const auto isCoding = [&](std::size_t at) {
+        return std::any_of(codings.begin(), codings.end(),
+                           [&](auto brand) { return holds(file, at, brand); });
+    };
+    bool found = isCoding(first) || holds(file, first, "mif1") || holds(file, first, "msf1");
+    for (std::size_t at = others; at + 4 <= end && !found; at += 4)
+        found = isCoding(at);
+    return found;
 }
 
 std::string cannotHold(FileFormat format, const std::string& what, const char* instead) {

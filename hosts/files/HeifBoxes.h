@@ -1,14 +1,17 @@
 #pragma once
 
 #include "files/FileFormat.h"
+#include "files/PixelBounds.h"
 
 namespace orvela {
 
 /// How the primary picture of a HEIF is coded, its tiles together.
 struct HeifCoding {
     bool isAv1 = false;
+    bool lossless = false;                    ///< known of HEVC only
     Chroma chroma = Chroma::Half;             ///< of a grey picture Half too
     std::uint64_t bytes = 0;                  ///< that it takes, without metadata and other pictures
+    double mostPixelsPerByte = bounds::kNone; ///< of the file
     std::vector<std::string> otherProperties; ///< of the primary picture, by their four letters: "clli"
 };
 

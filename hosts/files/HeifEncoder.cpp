@@ -3,10 +3,10 @@
 #include "files/ChildProcess.h"
 #include "files/Conversion.h"
 #include "files/HeifBoxes.h"
-#include "files/HeifLibrary.h"
 #include "files/HeifRate.h"
 #include "files/Memory.h"
 #include "metadata/ExifBlock.h"
+#include "metadata/HeifLibrary.h"
 
 #include <algorithm>
 #include <array>
@@ -23,6 +23,7 @@ using HeifColors = HeifPointer<heif_color_profile_nclx, heif_nclx_color_profile_
 using HeifEncodingOptions = HeifPointer<heif_encoding_options, heif_encoding_options_free>;
 
 constexpr int kQuality = 90;
+constexpr int kLosslessQuality = 100;
 constexpr int kAv1Speed = 5; // of 0 to 9
 
 // What encoding takes beside the picture at the most.
@@ -34,16 +35,23 @@ struct Settings {
     Chroma chroma = Chroma::Full;
     int bitDepth = 8;
     int quality = 0;
-    int orientation = 1; ///< as Exif counts
+    bool lossless = false; ///< whatever the quality
+    int orientation = 1;   ///< as Exif counts
     std::optional<ColorCodes> colors;
 };
+
+bool isAv1(const Photograph& photograph, const fs::path& target) {
+    const Encoding& source = photograph.encoding;
+    const bool known = source.format == FileFormat::Heif;
+    return heifCodec(target).value_or(known ? source.compression : "hevc") == "av1";
+}
 
 Settings settingsFor(const Photograph& photograph, const fs::path& target, const WriteOptions& options,
                      const Metadata& metadata) {
     const Encoding& source = photograph.encoding;
     const bool known = source.format == FileFormat::Heif;
     Settings settings;
-    settings.isAv1 = heifCodec(target).value_or(known ? source.compression : "hevc") == "av1";
+    settings.isAv1 = isAv1(photograph, target);
     settings.orientation = ExifBlock(metadata.exif).orientation();
     settings.colors = metadata.colors;
     settings.chroma = known ? source.chroma : Chroma::Full;
@@ -52,6 +60,7 @@ Settings settingsFor(const Photograph& photograph, const fs::path& target, const
     if (photograph.depth == 16)
         settings.bitDepth = heifBitDepth(photograph);
     settings.quality = options.quality;
+    settings.lossless = known && source.lossless && options.quality == 0;
     return settings;
 }
 
@@ -88,7 +97,7 @@ HeifEncoder encoderFor(heif_context* context, const Settings& settings, int qual
         context, settings.isAv1 ? heif_compression_AV1 : heif_compression_HEVC, &created));
     HeifEncoder encoder(created);
     checkHeif(heif_encoder_set_lossy_quality(created, quality));
-    checkHeif(heif_encoder_set_lossless(created, 0));
+    checkHeif(heif_encoder_set_lossless(created, settings.lossless ? 1 : 0));
     checkHeif(heif_encoder_set_parameter_string(created, "chroma",
                                                 settings.chroma == Chroma::Full        ? "444"
                                                 : settings.chroma == Chroma::HalfWidth ? "422"
@@ -167,6 +176,8 @@ Bytes encode(const Photograph& photograph, const Settings& settings, int quality
 int qualityFor(const Photograph& photograph, const Settings& settings) {
     if (settings.quality > 0)
         return settings.quality;
+    if (settings.lossless)
+        return kLosslessQuality;
     const HeifRate* rate = photograph.encoding.heifRate.get();
     if (rate == nullptr)
         return kQuality;
@@ -178,6 +189,15 @@ int qualityFor(const Photograph& photograph, const Settings& settings) {
 }
 
 } // namespace
+
+std::uint64_t heifEncoderBytes(const Photograph& photograph, const fs::path& target) {
+    const auto pixels =
+        static_cast<std::uint64_t>(photograph.width) * static_cast<std::uint64_t>(photograph.height);
+    const bool av1 = isAv1(photograph, target);
+    const std::uint64_t each = av1 ? 40 : 28;
+    const std::uint64_t ahead = av1 ? std::min<std::uint64_t>(pixels * 20, 110'000'000) : 0;
+    return ahead + pixels * (photograph.depth == 16 ? each * 8 / 5 : each);
+}
 
 Bytes encodeHeif(const Photograph& photograph, const fs::path& target, const WriteOptions& options,
                  const Metadata& metadata) {

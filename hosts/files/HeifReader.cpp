@@ -2,10 +2,10 @@
 
 #include "files/ChildProcess.h"
 #include "files/HeifBoxes.h"
-#include "files/HeifLibrary.h"
 #include "files/HeifRate.h"
 #include "files/Memory.h"
 #include "files/Refusal.h"
+#include "metadata/HeifLibrary.h"
 
 #include <algorithm>
 #include <cstring>
@@ -20,7 +20,7 @@ namespace fs = std::filesystem;
 constexpr std::uint64_t kDecoderBytesPerPixel = 32;
 constexpr std::uint64_t kDecoderBytes = 100'000'000;
 
-/// What the child sends first; profile and samples follow.
+/// What the child sends first; profile and samples follow once it has decoded them.
 struct Head {
     std::int32_t width;
     std::int32_t height;
@@ -44,7 +44,8 @@ public:
 
 private:
     Bytes profile() const;
-    void sendSamples(const ChildProcess::Sink& sink, const Head& head) const;
+    HeifImage decoded(const Head& head) const;
+    void sendRows(const ChildProcess::Sink& sink, const Head& head, heif_image* image) const;
 
     HeifContext mContext;
     HeifHandle mHandle;
@@ -73,21 +74,26 @@ void Decoder::send(const ChildProcess::Sink& sink) const {
                     heif_image_handle_get_luma_bits_per_pixel(mHandle.get()),
                     heif_image_handle_has_alpha_channel(mHandle.get()), icc.size()};
     sink.send(head);
+    const HeifImage image = decoded(head);
     sink.send(icc.data(), icc.size());
-    sendSamples(sink, head);
+    sendRows(sink, head, image.get());
 }
 
-void Decoder::sendSamples(const ChildProcess::Sink& sink, const Head& head) const {
-    const bool deep = head.bits > 8;
+HeifImage Decoder::decoded(const Head& head) const {
     heif_image* decoded = nullptr;
     checkHeif(heif_decode_image(mHandle.get(), &decoded, heif_colorspace_RGB,
-                                interleavedChroma(deep, head.hasAlpha != 0), nullptr));
-    const HeifImage image(decoded);
+                                interleavedChroma(head.bits > 8, head.hasAlpha != 0), nullptr));
+    HeifImage image(decoded);
     if (heif_image_get_width(decoded, heif_channel_interleaved) != head.width ||
         heif_image_get_height(decoded, heif_channel_interleaved) != head.height)
         throw std::runtime_error("the picture has other dimensions than the file says");
+    return image;
+}
+
+void Decoder::sendRows(const ChildProcess::Sink& sink, const Head& head, heif_image* image) const {
+    const bool deep = head.bits > 8;
     int stride = 0;
-    std::uint8_t* plane = heif_image_get_plane(decoded, heif_channel_interleaved, &stride);
+    std::uint8_t* plane = heif_image_get_plane(image, heif_channel_interleaved, &stride);
     const bool multiplied =
         head.hasAlpha != 0 && heif_image_handle_is_premultiplied_alpha(mHandle.get()) != 0;
     std::vector<std::uint16_t> row(static_cast<std::size_t>(head.width) * (head.hasAlpha != 0 ? 4 : 3));
@@ -109,12 +115,12 @@ void Decoder::sendSamples(const ChildProcess::Sink& sink, const Head& head) cons
     }
 }
 
-void takeCoding(Photograph& photograph, ByteView file) {
-    const std::optional<HeifCoding> coding = heifCoding(file);
+void takeCoding(Photograph& photograph, const std::optional<HeifCoding>& coding) {
     photograph.encoding.compression = coding && coding->isAv1 ? "av1" : "hevc";
     photograph.encoding.chroma = coding ? coding->chroma : Chroma::Half;
     if (!coding)
         return;
+    photograph.encoding.lossless = coding->lossless;
     for (const std::string& property : coding->otherProperties)
         photograph.unheld.push_back("the HEIF property " + property);
     const double pixels = static_cast<double>(photograph.width) * photograph.height;
@@ -124,6 +130,7 @@ void takeCoding(Photograph& photograph, ByteView file) {
 
 Photograph receive(ChildProcess& child, ByteView file, const fs::path& path, const ReadLimits& limits,
                    std::uint64_t& pixels) {
+    const std::optional<HeifCoding> coding = heifCoding(file);
     const Head head = child.receive<Head>();
     Photograph photograph;
     photograph.source = path;
@@ -134,13 +141,18 @@ Photograph receive(ChildProcess& child, ByteView file, const fs::path& path, con
         refuse(path, "has an unknown number of bits per sample", "save it with 8, 10 or 12 bits");
     photograph.depth = head.bits > 8 ? 16 : 8;
     photograph.model = head.hasAlpha != 0 ? ColorModel::RgbAlpha : ColorModel::Rgb;
-    checkPicture({head.width, head.height, sampleBytes(photograph), file.size()}, path, limits);
+    // Measured with all kinds of chroma, HEVC and AV1.
+    const std::uint64_t decoderBytes = sampleBytes(photograph) * (photograph.depth == 16 ? 5 : 3);
+    checkPicture({head.width, head.height, sampleBytes(photograph), file.size(),
+                  coding ? coding->mostPixelsPerByte : bounds::kNone, decoderBytes},
+                 path, limits);
     photograph.encoding.format = FileFormat::Heif;
     photograph.encoding.bitDepth = head.bits;
     photograph.iccProfile.resize(head.profileSize);
     child.receive(photograph.iccProfile.data(), head.profileSize);
     photograph.samples.resize(pixels * sampleBytes(photograph));
     child.receive(photograph.samples.data(), photograph.samples.size());
+    takeCoding(photograph, coding);
     return photograph;
 }
 
@@ -150,9 +162,7 @@ Photograph readHeif(ByteView file, const fs::path& path, const ReadLimits& limit
     std::uint64_t pixels = 0;
     try {
         ChildProcess child([&](const ChildProcess::Sink& sink) { Decoder(file).send(sink); });
-        Photograph photograph = receive(child, file, path, limits, pixels);
-        takeCoding(photograph, file);
-        return photograph;
+        return receive(child, file, path, limits, pixels);
     } catch (const ChildFailure& failure) {
         // The decoder has no words of its own for want of memory.
         if (kDecoderBytes + pixels * kDecoderBytesPerPixel > obtainableMemory())

@@ -190,7 +190,7 @@ private:
     JpegErrors mErrors;
     Output mOutput;
     Watch mWatch{};
-    jpeg_scan_info mScans[MAX_COMPONENTS]{};
+    std::vector<jpeg_scan_info> mScans;
     jpeg_compress_struct mJpeg{};
 };
 
@@ -246,15 +246,21 @@ void Encoder::setScans() {
     int blocks = 0;
     for (const JpegLayout::Component& component : mLayout.components)
         blocks += component.horizontal * component.vertical;
-    if (blocks <= kMostBlocks || mLayout.components.size() == 1) {
-        if (mProgressive)
-            jpeg_simple_progression(&mJpeg);
+    if (mProgressive)
+        jpeg_simple_progression(&mJpeg);
+    if (blocks <= kMostBlocks || mLayout.components.size() == 1)
         return;
-    }
-    for (int i = 0; i < mJpeg.num_components; ++i)
-        mScans[i] = {1, {i}, 0, 63, 0, 0};
-    mJpeg.scan_info = mScans;
-    mJpeg.num_scans = mJpeg.num_components;
+    const jpeg_scan_info whole = {mJpeg.num_components, {0, 1, 2, 3}, 0, 63, 0, 0};
+    const jpeg_scan_info* const scans = mProgressive ? mJpeg.scan_info : &whole;
+    const int count = mProgressive ? mJpeg.num_scans : 1;
+    for (const jpeg_scan_info* scan = scans; scan != scans + count; ++scan)
+        for (int i = 0; i < scan->comps_in_scan; ++i) {
+            mScans.push_back(*scan);
+            mScans.back().comps_in_scan = 1;
+            mScans.back().component_index[0] = scan->component_index[i];
+        }
+    mJpeg.scan_info = mScans.data();
+    mJpeg.num_scans = static_cast<int>(mScans.size());
 }
 
 void Encoder::writeRows() {

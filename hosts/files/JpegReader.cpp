@@ -106,7 +106,6 @@ JpegLayout::Color Decoder::color() const {
     }
 }
 
-// Each block of 64 pixels takes a bit at least, unless its coding is arithmetic.
 DeclaredPicture Decoder::declared() const {
     DeclaredPicture picture;
     picture.width = mJpeg.image_width;
@@ -114,7 +113,7 @@ DeclaredPicture Decoder::declared() const {
     picture.sampleBytes = static_cast<std::uint64_t>(samplesPerPixel(model()));
     picture.fileBytes = mFile.size();
     if (mJpeg.arith_code == 0)
-        picture.mostPixelsPerByte = 64 * 8;
+        picture.mostPixelsPerByte = bounds::kJpeg;
     return picture;
 }
 

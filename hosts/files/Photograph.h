@@ -88,7 +88,7 @@ struct HeifRate;
 /// How the source was encoded, so that the result can be written alike.
 struct Encoding {
     FileFormat format = FileFormat::Png;
-    bool lossless = false;        ///< WebP without loss
+    bool lossless = false;        ///< WebP or HEIF without loss
     bool progressive = false;     ///< interlaced or progressive
     std::string compression;      ///< by its library name: TIFF "lzw" and others, HEIF "hevc" or "av1"
     int quality = 0;              ///< TIFF with JPEG compression: 1 to 100; 0 when unknown
@@ -104,6 +104,8 @@ struct TiffPage;
 /// Notes on what reading makes of the samples.
 inline constexpr char kPaletteNote[] = "its palette was resolved";
 inline constexpr char kBitsNote[] = "its samples were expanded to 8 bits";
+/// Name of a profile that cannot be kept.
+inline constexpr char kUnsuitedProfile[] = "the ICC profile, which does not suit its colours or is damaged";
 
 /// A photograph in memory: interleaved samples, rows from the top without padding, 8 bits or native 16 bits
 /// each. CMYK samples are raw ink values, 0 without ink; where a format stores them inverted, the inversion

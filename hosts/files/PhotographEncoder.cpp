@@ -1,5 +1,6 @@
 #include "files/PhotographEncoder.h"
 
+#include "files/Conversion.h"
 #include "files/HeifEncoder.h"
 #include "files/JpegEncoder.h"
 #include "files/Memory.h"
@@ -86,6 +87,26 @@ Bytes encodeWithVips(const Photograph& photograph, FileFormat format, const fs::
 }
 
 } // namespace
+
+std::uint64_t encoderBytes(const Photograph& photograph, FileFormat format, const fs::path& target,
+                           const WriteOptions& options) {
+    const auto pixels =
+        static_cast<std::uint64_t>(photograph.width) * static_cast<std::uint64_t>(photograph.height);
+    const std::uint64_t samples = photograph.samples.size();
+    const std::uint64_t changed = changesSamples(conversionFor(format, photograph)) ? samples : 0;
+    switch (format) {
+    case FileFormat::Heif:
+        return changed + heifEncoderBytes(photograph, target);
+    case FileFormat::WebP:
+        return changed + pixels * (settingsFor(photograph, format, options).lossless ? 32 : 8);
+    case FileFormat::Jpeg:
+        return changed + pixels * 8;
+    case FileFormat::Png: // the bytes of the file are held several times, those of noise are many
+        return changed + samples * 4;
+    default:
+        return changed; // a TIFF is written strip by strip
+    }
+}
 
 Bytes encodePhotograph(const Photograph& photograph, FileFormat format, const fs::path& target,
                        const WriteOptions& options, const Metadata& metadata) {

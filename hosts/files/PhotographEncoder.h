@@ -12,4 +12,9 @@ namespace orvela {
 Bytes encodePhotograph(const Photograph& photograph, FileFormat format, const std::filesystem::path& target,
                        const WriteOptions& options, const Metadata& metadata);
 
+/// Bytes of memory that encoding takes beside the photograph, at the most: as measured with pictures of 1 to
+/// 24 megapixels.
+std::uint64_t encoderBytes(const Photograph& photograph, FileFormat format,
+                           const std::filesystem::path& target, const WriteOptions& options);
+
 } // namespace orvela

@@ -10,19 +10,20 @@
 #include "files/TiffReader.h"
 #include "files/VipsPhotograph.h"
 #include "metadata/MetadataReader.h"
-#include "metadata/PngMetadata.h"
+#include "metadata/PngChunks.h"
 #include "metadata/WebPMetadata.h"
 
 #include <webp/decode.h>
 
 #include <algorithm>
-#include <limits>
 
 namespace orvela {
 
 namespace {
 
 namespace fs = std::filesystem;
+
+constexpr std::uint64_t kHeadBytes = 512; // that tell the kind of a file
 
 VipsImage* load(const Bytes& file, FileFormat format) {
     void* data = const_cast<std::uint8_t*>(file.data());
@@ -40,7 +41,7 @@ VipsImage* load(const Bytes& file, FileFormat format) {
         break;
     case FileFormat::Jpeg: // these have readers of their own
     case FileFormat::Heif:
-    case FileFormat::Tiff: // see loadPage
+    case FileFormat::Tiff: // see TiffReader
     case FileFormat::Psd:  // see PsdFile
         break;
     }
@@ -51,8 +52,9 @@ VipsImage* load(const Bytes& file, FileFormat format) {
 void checkWebp(const fs::path& path, const Bytes& file, const ReadLimits& limits) {
     WebPBitstreamFeatures features{};
     if (WebPGetFeatures(file.data(), file.size(), &features) == VP8_STATUS_OK)
-        checkPicture({features.width, features.height, features.has_alpha != 0 ? 4U : 3U, file.size()}, path,
-                     limits);
+        checkPicture({features.width, features.height, features.has_alpha != 0 ? 4U : 3U, file.size(),
+                      bounds::ofWebp(file)},
+                     path, limits);
 }
 
 VipsHandle open(const fs::path& path, const Bytes& file, FileFormat format, const ReadLimits& limits) {
@@ -87,11 +89,11 @@ void noteExpansion(Photograph& photograph, const Bytes& png) {
         photograph.notes.emplace_back(kBitsNote);
 }
 
-// Deflate makes at most 1032 bytes of one; the 25th byte tells the bits of a sample.
+// The 25th byte tells the bits of a sample. That of a WebP was looked at before.
 double mostPixelsPerByte(const Bytes& file, FileFormat format) {
     if (format == FileFormat::Png && file.size() > 24 && file[24] > 0)
-        return 1032.0 * 8 / file[24];
-    return std::numeric_limits<double>::infinity();
+        return bounds::kDeflate * 8 / file[24];
+    return bounds::kNone;
 }
 
 Photograph decodeFile(const Bytes& file, FileFormat format, const fs::path& path, const ReadLimits& limits) {
@@ -144,6 +146,27 @@ void takeResolution(Photograph& photograph) {
     photograph.yResolution = density->y.value() / density->millimetres();
 }
 
+// A profile tells what colours it is for.
+bool suits(const Bytes& profile, ColorModel model) {
+    constexpr std::size_t head = 128;
+    const bool grey = model == ColorModel::Grey || model == ColorModel::GreyAlpha;
+    const std::string_view text = asText(profile);
+    return text.size() > head && text.substr(36, 4) == "acsp" &&
+           text.substr(16, 4) == (grey ? "GRAY" : "RGB ");
+}
+
+// One that stands in a PNG as a text counts where none stands in its place.
+void takeProfile(Photograph& photograph, const Bytes& profile) {
+    if (profile.empty() || profile == photograph.iccProfile)
+        return;
+    if (!photograph.iccProfile.empty())
+        photograph.unheld.emplace_back("a second ICC profile");
+    else if (suits(profile, photograph.model))
+        photograph.iccProfile = profile;
+    else
+        photograph.unheld.emplace_back(kUnsuitedProfile);
+}
+
 Photograph read(const Bytes& file, FileFormat format, const fs::path& path, const ReadLimits& limits) {
     switch (format) {
     case FileFormat::Jpeg:
@@ -163,7 +186,7 @@ PhotographReader::PhotographReader(const fs::path& path, const ReadOptions& opti
     : mOptions(options), mFile(std::make_unique<SourceFile>(path)) {
     if (mFile->size() == 0)
         refuse(path, "the file is empty", kCopyAgain);
-    const Bytes head = mFile->read(0, std::min<std::uint64_t>(mFile->size(), 16));
+    const Bytes head = mFile->read(0, std::min(mFile->size(), kHeadBytes));
     if (isCameraRaw(head))
         refuseCameraRaw(path);
     const std::optional<FileFormat> format = formatOfContent(head);
@@ -202,6 +225,7 @@ Photograph PhotographReader::readOther() {
         photograph.unheld.push_back(frames > 2 ? "the other " + std::to_string(frames - 1) + " frames"
                                                : "the other frame");
     photograph.metadata = std::make_shared<const Metadata>(readMetadata(file, mFormat));
+    takeProfile(photograph, photograph.metadata->iccProfile);
     return photograph;
 }
 

@@ -1,6 +1,7 @@
 #include "files/PhotographWriter.h"
 
 #include "files/Conversion.h"
+#include "files/DeclaredPicture.h"
 #include "files/LibTiff.h"
 #include "files/PhotographEncoder.h"
 #include "files/TargetFile.h"
@@ -8,7 +9,7 @@
 #include "files/TiffFields.h"
 #include "files/TiffWriter.h"
 #include "metadata/MetadataWriter.h"
-#include "metadata/PngMetadata.h"
+#include "metadata/PngChunks.h"
 
 #include <algorithm>
 
@@ -66,8 +67,13 @@ FileFormat writtenFormat(const fs::path& target) {
 }
 
 void checkTarget(const Photograph& photograph, const fs::path& target, const WriteOptions& options) {
-    targetFormat(photograph, target);
+    const FileFormat format = targetFormat(photograph, target);
+    if (photograph.copied && (photograph.pages == 1 || format != FileFormat::Tiff))
+        throw PhotographError(photograph.source.string() +
+                              ": holds a transparency mask where a picture is wanted; choose the photograph "
+                              "that it belongs to, or a TIFF target for all its pages");
     checkTargetPath(target, photograph.source, options.overwrite);
+    checkEncoding(photograph, formatName(format), encoderBytes(photograph, format, target, options));
 }
 
 PhotographWriter::PhotographWriter(fs::path target, const WriteOptions& options)
@@ -112,7 +118,7 @@ void PhotographWriter::addPage(const Photograph& photograph, PreparedMetadata& p
             prepared.lost.emplace_back("what the maker note refers to by its place");
         }
         if (photograph.copied) {
-            mTiff->addCopy(photograph.tiffPage->blocks, copiedFields(*photograph.tiffPage));
+            mTiff->addCopy(photograph.tiffPage->blocks, copiedFields(*photograph.tiffPage, prepared.lost));
         } else {
             if (mOptions.compression.empty() && storage.compression != storedCompression(photograph, storage))
                 prepared.lost.push_back(std::string("its kind of compression (") +
@@ -130,7 +136,7 @@ void PhotographWriter::addEncoded(const Photograph& photograph, PreparedMetadata
     embedMetadata(metadata, encoded);
     // The library leaves out one that is damaged, or for other colours than the picture's.
     if (metadata.target == FileFormat::Png && !photograph.iccProfile.empty() && !hasPngChunk(encoded, "iCCP"))
-        metadata.lost.emplace_back("the ICC profile, which does not suit its colours or is damaged");
+        metadata.lost.emplace_back(kUnsuitedProfile);
     mFile = std::make_unique<TargetFile>(mTarget, mSource);
     mFile->write(encoded, mOptions.stop);
 }

@@ -29,8 +29,9 @@ FileFormat writtenFormat(const std::filesystem::path& target);
 
 /// Whether writing the photograph there can succeed, as far as can be told without writing: the format can
 /// hold it, the target is not its source, not a folder and does not exist (unless it may be overwritten), and
-/// its folder exists and may be written to.
+/// its folder exists and may be written to, and the memory suffices to encode it.
 /// @throws PhotographError when the format is unknown or cannot hold the picture
+/// @throws MemoryError when the memory does not suffice
 /// @throws TargetError for everything else
 void checkTarget(const Photograph& photograph, const std::filesystem::path& target,
                  const WriteOptions& options);

@@ -3,13 +3,12 @@
 #include "files/Refusal.h"
 
 #include <fcntl.h>
-#include <sys/mman.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
 #include <cerrno>
 #include <cstring>
-#include <new>
+#include <system_error>
 
 namespace orvela {
 
@@ -55,8 +54,6 @@ SourceFile::SourceFile(fs::path path) : mPath(std::move(path)), mHandle(openFile
 }
 
 SourceFile::~SourceFile() {
-    if (mView != nullptr)
-        ::munmap(mView, mSize);
     ::close(mHandle);
 }
 
@@ -76,18 +73,22 @@ Bytes SourceFile::read(std::uint64_t at, std::uint64_t size) const {
     return bytes;
 }
 
-ByteView SourceFile::view() {
-    if (mView == nullptr) {
-        void* const view = ::mmap(nullptr, mSize, PROT_READ, MAP_PRIVATE, mHandle, 0);
-        if (view == MAP_FAILED)
-            throw std::bad_alloc();
-        mView = view;
+FileView& SourceFile::view() {
+    try {
+        if (!mView)
+            mView = std::make_unique<FileView>(mHandle, mSize);
+    } catch (const std::system_error& error) {
+        refuse(mPath, "cannot be read in place (" + error.code().message() + ")", "copy it to another disk");
     }
-    // What the file does not hold any more must not be looked at: the system would end the program.
+    return *mView;
+}
+
+void SourceFile::checkView() const {
     struct stat status {};
     if (::fstat(mHandle, &status) != 0 || static_cast<std::uint64_t>(status.st_size) < mSize)
         refuseShorter(mPath);
-    return {static_cast<const std::uint8_t*>(mView), mSize};
+    if (mView->lacksBytes())
+        refuse(mPath, "changed while it was read, or cannot be read", "try again, and check the disk");
 }
 
 } // namespace orvela

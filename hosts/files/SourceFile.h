@@ -1,6 +1,9 @@
 #pragma once
 
 #include "files/FileFormat.h"
+#include "files/FileView.h"
+
+#include <memory>
 
 namespace orvela {
 
@@ -23,16 +26,30 @@ public:
     /// @throws PhotographError when the disk fails or the file became shorter
     Bytes read(std::uint64_t at, std::uint64_t size) const;
 
-    /// The whole file in the address space, to be looked at at once. Memory is taken by what is looked at
-    /// only, and can be taken back.
-    /// @throws PhotographError when the file became shorter; std::bad_alloc
-    ByteView view();
+    /// What `parse` makes of the whole file, of which it gets a view that holds as long as it runs.
+    /// @throws PhotographError when the file became shorter or the disk fails; std::bad_alloc
+    template <typename Parse>
+    auto look(const Parse& parse) {
+        FileView& file = view();
+        try {
+            const FileView::Look look(file);
+            auto result = parse(file.bytes());
+            checkView();
+            return result;
+        } catch (...) {
+            checkView();
+            throw;
+        }
+    }
 
 private:
+    FileView& view();
+    void checkView() const;
+
     std::filesystem::path mPath;
     int mHandle = -1;
     std::uint64_t mSize = 0;
-    void* mView = nullptr;
+    std::unique_ptr<FileView> mView;
 };
 
 } // namespace orvela

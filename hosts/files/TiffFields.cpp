@@ -65,12 +65,8 @@ bool isStorage(std::uint16_t tag) {
     return std::find(kStorage.begin(), kStorage.end(), tag) != kStorage.end();
 }
 
-bool isPointer(std::uint16_t tag) {
-    return tag == TIFFTAG_EXIFIFD || tag == TIFFTAG_GPSIFD || tag == TIFFTAG_INTEROPERABILITYIFD;
-}
-
 bool leadsAway(const TiffField& field) {
-    return isPointer(field.tag) || field.tag == TIFFTAG_SUBIFD || field.type == TIFF_IFD ||
+    return leadsToExif(field.tag) || field.tag == TIFFTAG_SUBIFD || field.type == TIFF_IFD ||
            field.type == TIFF_IFD8;
 }
 
@@ -89,7 +85,7 @@ void add(std::vector<TiffField>& fields, TiffField field) {
 std::vector<TiffField> fieldsOf(const TagDirectory& directory) {
     std::vector<TiffField> fields;
     for (const TagEntry& entry : directory.entries)
-        if (!entry.value.empty() && !isPointer(entry.tag))
+        if (!entry.value.empty() && !leadsToExif(entry.tag))
             fields.push_back(tiffField(entry));
     return fields;
 }
@@ -115,10 +111,16 @@ void addBlock(std::vector<TiffField>& fields, const Bytes& block) {
             add(fields, pointer);
 }
 
+// What has been read as metadata, and may have been left out since.
+bool isMetadata(std::uint16_t tag) {
+    return tag == tiff::Xmp || tag == tiff::Iptc || tag == tiff::Resources || tag == tiff::IccProfile;
+}
+
 // What metadata do not speak of: which page it is, its inks, ...
 void addRest(std::vector<TiffField>& fields, const TiffPage& page, std::vector<std::string>& lost) {
     for (const TiffField& field : page.fields) {
-        if (isStorage(field.tag) || isPointer(field.tag) || field.tag == TIFFTAG_SUBIFD)
+        if (isStorage(field.tag) || isMetadata(field.tag) || leadsToExif(field.tag) ||
+            field.tag == TIFFTAG_SUBIFD)
             continue; // metadata tell of the last
         if (leadsAway(field))
             lost.push_back("what the tag " + hexadecimal(field.tag) + " leads to");
@@ -145,9 +147,13 @@ std::vector<TiffField> pageFields(const Photograph& photograph, const Metadata& 
     return fields;
 }
 
-std::vector<TiffField> copiedFields(const TiffPage& page) {
-    std::vector<TiffField> fields = page.fields;
-    std::erase_if(fields, leadsAway);
+std::vector<TiffField> copiedFields(const TiffPage& page, std::vector<std::string>& lost) {
+    std::vector<TiffField> fields;
+    for (const TiffField& field : page.fields)
+        if (leadsAway(field))
+            lost.push_back("what the tag " + hexadecimal(field.tag) + " leads to");
+        else
+            fields.push_back(field);
     return fields;
 }
 

@@ -14,6 +14,7 @@ std::vector<TiffField> pageFields(const Photograph& photograph, const Metadata& 
                                   std::vector<std::string>& lost);
 
 /// The fields of a page that is copied with its strips or tiles: all but those that lead to other places.
-std::vector<TiffField> copiedFields(const TiffPage& page);
+/// @param lost  takes the names of what they lead to
+std::vector<TiffField> copiedFields(const TiffPage& page, std::vector<std::string>& lost);
 
 } // namespace orvela

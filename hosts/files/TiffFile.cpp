@@ -18,23 +18,6 @@ std::string ordinal(int index) {
     return "page " + std::to_string(index + 1);
 }
 
-class SourceStream : public TiffStream {
-public:
-    explicit SourceStream(const SourceFile& file) : mFile(file) {}
-
-    std::size_t read(std::uint64_t at, std::span<std::uint8_t> to) override {
-        const std::uint64_t first = std::min(at, mFile.size());
-        const Bytes bytes = mFile.read(first, std::min<std::uint64_t>(to.size(), mFile.size() - first));
-        std::copy(bytes.begin(), bytes.end(), to.begin());
-        return bytes.size();
-    }
-    void write(std::uint64_t, ByteView) override {} // never asked for by a handle for reading
-    std::uint64_t size() const override { return mFile.size(); }
-
-private:
-    const SourceFile& mFile;
-};
-
 // libtiff's conversion to RGB, which has an end of its own.
 class RgbConversion {
 public:
@@ -66,46 +49,67 @@ private:
 } // namespace
 
 TiffFile::TiffFile(SourceFile& file, int wanted) : mFile(file) {
-    std::size_t at = 0;
-    try {
-        at = TiffView(mFile.view()).first();
-    } catch (const DamagedBytes&) {
-        refuse(file.path(), "the file is cut short", kCopyAgain);
-    }
+    mHasMore = mFile.look([&](ByteView bytes) {
+        std::size_t at = 0;
+        try {
+            at = TiffView(bytes).first();
+        } catch (const DamagedBytes&) {
+            refuse(mFile.path(), "the file is cut short", kCopyAgain);
+        }
+        return follow(TiffView(bytes), at, wanted);
+    });
+}
+
+// Whether there are more pages than wanted.
+bool TiffFile::follow(const TiffView& tiff, std::size_t at, int wanted) {
     std::unordered_map<std::size_t, int> known;
     do {
         const auto [earlier, isNew] = known.emplace(at, pages());
         if (!isNew)
-            refuse(file.path(),
+            refuse(mFile.path(),
                    "is damaged: " + ordinal(pages() - 1) + " leads back to " + ordinal(earlier->second),
                    kCopyAgain);
         mPlaces.push_back(at);
-        at = directory(pages() - 1).next;
+        at = directory(tiff, pages() - 1).next;
     } while (at != 0 && pages() < wanted);
-    mHasMore = at != 0;
+    return at != 0;
 }
 
-TagDirectory TiffFile::directory(int index) const {
+TagDirectory TiffFile::directory(const TiffView& tiff, int index) const {
     try {
-        return TiffView(mFile.view()).directory(place(index));
+        return tiff.directory(place(index));
     } catch (const DamagedBytes&) {
         refusePage(index, "its directory is damaged or cut short");
     }
 }
 
 TiffPage TiffFile::page(int index) const {
-    TiffPage page;
-    page.order = TiffView(mFile.view()).order();
-    for (const TagEntry& entry : directory(index).entries)
-        if (entry.value.empty())
-            page.damaged.push_back(entry.tag);
-        else if (entry.tag != TIFFTAG_IMAGESOURCEDATA) // layers, perhaps larger than the picture
-            page.fields.push_back(tiffField(entry));
-    return page;
+    return mFile.look([&](ByteView bytes) {
+        const TiffView tiff(bytes);
+        TiffPage page;
+        page.order = tiff.order();
+        for (const TagEntry& entry : directory(tiff, index).entries)
+            if (entry.value.empty())
+                page.damaged.push_back(entry.tag);
+            else if (entry.tag != TIFFTAG_IMAGESOURCEDATA) // layers, perhaps larger than the picture
+                page.fields.push_back(tiffField(entry));
+        return page;
+    });
+}
+
+TiffPageStream TiffFile::alone(int index) const {
+    return {mFile, mFile.look([&](ByteView bytes) {
+                const TiffView tiff(bytes);
+                Bytes to;
+                append(to, place(index), tiff.offsetSize(), tiff.order());
+                return std::vector<TiffPageStream::Link>{
+                    {tiff.linkAt(), std::move(to)},
+                    {directory(tiff, index).linkAt, Bytes(tiff.offsetSize())}};
+            })};
 }
 
 bool TiffFile::isCameraRaw() const {
-    return orvela::isCameraRaw(TiffView(mFile.view()));
+    return mFile.look([](ByteView bytes) { return orvela::isCameraRaw(TiffView(bytes)); });
 }
 
 bool TiffFile::isMask(const TiffPage& page) {
@@ -132,9 +136,8 @@ std::vector<Bytes> TiffFile::readBlocks(const TiffPage& page, int index, std::si
 
 Bytes TiffFile::readRgb(int index) const {
     try {
-        SourceStream stream(mFile);
-        TiffHandle tiff(stream, "rhm");
-        tiff.check(TIFFSetSubDirectory(tiff.get(), place(index)) == 1);
+        TiffPageStream stream = alone(index);
+        TiffHandle tiff(stream, "rm");
         RgbConversion image(tiff.get());
         std::uint32_t step = 0;
         if (TIFFGetField(tiff.get(), TIFFTAG_TILELENGTH, &step) == 0)

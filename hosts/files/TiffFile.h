@@ -2,6 +2,7 @@
 
 #include "files/SourceFile.h"
 #include "files/TiffPage.h"
+#include "files/TiffPageStream.h"
 
 #include <limits>
 
@@ -38,6 +39,9 @@ public:
     /// @throws PhotographError when the file does not hold them
     std::vector<Bytes> readBlocks(const TiffPage& page, int index, std::size_t wanted = SIZE_MAX) const;
 
+    /// The file with this page alone, for libraries that look for a page along all before it.
+    TiffPageStream alone(int index) const;
+
     /// Decodes a page of samples that libtiff alone knows to turn into RGB, as rows of 8-bit RGB.
     /// @throws PhotographError
     Bytes readRgb(int index) const;
@@ -46,7 +50,8 @@ public:
     std::filesystem::path pageName(int index) const;
 
 private:
-    TagDirectory directory(int index) const;
+    bool follow(const TiffView& tiff, std::size_t at, int wanted);
+    TagDirectory directory(const TiffView& tiff, int index) const;
     [[noreturn]] void refusePage(int index, const std::string& cause) const;
 
     SourceFile& mFile;

@@ -2,35 +2,19 @@
 
 #include "files/JpegQuality.h"
 #include "files/Refusal.h"
+#include "files/TiffDeclaration.h"
 #include "files/TiffStorage.h"
 #include "files/VipsPhotograph.h"
+#include "files/VipsStream.h"
 #include "metadata/MetadataReader.h"
 
 #include <tiff.h>
-#include <unistd.h>
-
-#include <algorithm>
-#include <limits>
 
 namespace orvela {
 
 namespace {
 
 namespace fs = std::filesystem;
-
-struct SourceRelease {
-    void operator()(VipsSource* source) const { g_object_unref(source); }
-};
-
-VipsHandle loadPage(const SourceFile& file, int page) {
-    ::lseek(file.handle(), 0, SEEK_SET); // the library begins to read where the last page was
-    const std::unique_ptr<VipsSource, SourceRelease> source(vips_source_new_from_descriptor(file.handle()));
-    VipsImage* image = nullptr;
-    if (source)
-        vips_tiffload_source(source.get(), &image, "page", page, "access", VIPS_ACCESS_SEQUENTIAL, "fail_on",
-                             VIPS_FAIL_ON_TRUNCATED, nullptr);
-    return VipsHandle(image);
-}
 
 // libvips takes YCbCr samples for RGB, except those of JPEG compression.
 bool isPlainYcbcr(const TiffPage& page) {
@@ -43,36 +27,6 @@ int qualityOf(const TiffFile& tiff, const TiffPage& page, int index) {
     const TiffField* tables = page.find(TIFFTAG_JPEGTABLES);
     const int shared = tables == nullptr ? 0 : jpegQuality(tables->value);
     return shared > 0 ? shared : jpegQuality(tiff.readBlocks(page, index, 1).front());
-}
-
-// A code of LZW has 9 bits at least and stands for 4096 bytes at most.
-double mostBytesPerByte(const TiffPage& page) {
-    switch (page.number(TIFFTAG_COMPRESSION, COMPRESSION_NONE)) {
-    case COMPRESSION_NONE:
-        return 1;
-    case COMPRESSION_PACKBITS:
-        return 64;
-    case COMPRESSION_LZW:
-        return 4096.0 * 8 / 9;
-    case COMPRESSION_DEFLATE:
-    case COMPRESSION_ADOBE_DEFLATE:
-        return 1032;
-    default:
-        return std::numeric_limits<double>::infinity();
-    }
-}
-
-DeclaredPicture declared(const TiffPage& page, const SourceFile& file) {
-    const bool palette = page.number(TIFFTAG_PHOTOMETRIC, PHOTOMETRIC_MINISBLACK) == PHOTOMETRIC_PALETTE;
-    const std::uint64_t bits = std::max<std::uint64_t>(1, page.number(TIFFTAG_BITSPERSAMPLE, 1));
-    DeclaredPicture picture;
-    picture.width = static_cast<std::int64_t>(page.number(TIFFTAG_IMAGEWIDTH, 0));
-    picture.height = static_cast<std::int64_t>(page.number(TIFFTAG_IMAGELENGTH, 0));
-    picture.sampleBytes = palette ? 3 : page.number(TIFFTAG_SAMPLESPERPIXEL, 1) * (bits > 8 ? 2 : 1);
-    picture.fileBytes = file.size();
-    picture.mostPixelsPerByte = mostBytesPerByte(page) * 8 / static_cast<double>(bits);
-    picture.fileInView = true;
-    return picture;
 }
 
 // Size and profile, as the directory tells them.
@@ -100,14 +54,35 @@ Photograph decodeMask(const TiffFile& tiff, TiffPage& page, int index) {
     return photograph;
 }
 
-Photograph decodeWithVips(const SourceFile& file, const TiffPage& page, const fs::path& name, int index) {
+// The library tells what stopped the stream in its own words, and lazily: while samples are taken.
+Photograph takePage(const VipsStream& stream, const fs::path& name, VipsImage* image) {
+    Photograph photograph = describeImage(name, image);
+    try {
+        takeSamples(photograph, name, image);
+    } catch (...) {
+        stream.check();
+        throw;
+    }
+    return photograph;
+}
+
+Photograph decodeSamples(VipsStream& stream, const fs::path& name) {
     startVips();
     vips_error_clear();
-    const VipsHandle image = loadPage(file, index);
+    VipsImage* opened = nullptr;
+    vips_tiffload_source(stream.source(), &opened, "access", VIPS_ACCESS_SEQUENTIAL, "fail_on",
+                         VIPS_FAIL_ON_TRUNCATED, nullptr);
+    const VipsHandle image(opened);
+    stream.check();
     if (!image)
         refuseUnread(name, takeVipsError());
-    Photograph photograph = describeImage(name, image.get());
-    takeSamples(photograph, name, image.get());
+    return takePage(stream, name, image.get());
+}
+
+Photograph decodeWithVips(const TiffFile& tiff, const TiffPage& page, int index) {
+    TiffPageStream alone = tiff.alone(index);
+    VipsStream stream(alone);
+    Photograph photograph = decodeSamples(stream, tiff.pageName(index));
     photograph.extraChannel =
         hasAlpha(photograph.model) &&
         page.number(TIFFTAG_EXTRASAMPLES, EXTRASAMPLE_UNSPECIFIED) == EXTRASAMPLE_UNSPECIFIED;
@@ -122,17 +97,17 @@ Photograph decodeWithVips(const SourceFile& file, const TiffPage& page, const fs
 
 Photograph readTiffPage(SourceFile& file, const TiffFile& tiff, int index, const ReadLimits& limits) {
     const auto page = std::make_shared<TiffPage>(tiff.page(index));
-    checkPicture(declared(*page, file), tiff.pageName(index), limits);
+    checkPicture(declaredPicture(tiff, *page, index, file.size()), tiff.pageName(index), limits);
     Photograph photograph = TiffFile::isMask(*page) ? decodeMask(tiff, *page, index)
                             : isPlainYcbcr(*page)   ? decodeYcbcr(tiff, *page, index)
-                                                  : decodeWithVips(file, *page, tiff.pageName(index), index);
+                                                    : decodeWithVips(tiff, *page, index);
     const std::uint64_t compression = page->number(TIFFTAG_COMPRESSION, COMPRESSION_NONE);
     photograph.encoding.compression = tiffCompressionName(compression);
     if (compression == COMPRESSION_JPEG)
         photograph.encoding.quality = qualityOf(tiff, *page, index);
     if (!photograph.copied)
-        photograph.metadata =
-            std::make_shared<const Metadata>(readMetadata(file.view(), FileFormat::Tiff, tiff.place(index)));
+        photograph.metadata = std::make_shared<const Metadata>(file.look(
+            [&](ByteView bytes) { return readMetadata(bytes, FileFormat::Tiff, tiff.place(index)); }));
     photograph.tiffPage = page;
     return photograph;
 }

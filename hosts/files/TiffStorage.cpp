@@ -70,7 +70,7 @@ void setJpeg(TiffStorage& storage, const Photograph& photograph, const TiffPage*
     storage.quality = options.quality > 0                             ? options.quality
                       : likeSource && photograph.encoding.quality > 0 ? photograph.encoding.quality
                                                                       : kDefaultQuality;
-    if (photograph.model != ColorModel::Rgb)
+    if (photograph.model != ColorModel::Rgb || storage.separate) // whose planes are not turned into YCbCr
         return;
     if (likeSource && page->number(TIFFTAG_PHOTOMETRIC, PHOTOMETRIC_YCBCR) == PHOTOMETRIC_RGB)
         return;

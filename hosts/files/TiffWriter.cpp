@@ -13,22 +13,8 @@ namespace {
 constexpr std::size_t kShort = 8; // a value that may stand in an entry, depending on the form of the file
 constexpr std::size_t kLargeHeader = 16;
 
-// A kind of eight bytes that only a BigTIFF knows, and its kind of four.
-std::uint16_t narrowType(std::uint16_t type) {
-    switch (type) {
-    case TIFF_LONG8:
-        return TIFF_LONG;
-    case TIFF_SLONG8:
-        return TIFF_SLONG;
-    case TIFF_IFD8:
-        return TIFF_IFD;
-    default:
-        return type;
-    }
-}
-
 bool isWide(std::uint16_t type) {
-    return narrowType(type) != type;
+    return narrowTagType(type) != type;
 }
 
 } // namespace
@@ -158,7 +144,7 @@ Bytes TiffWriter::packed(const Entry& entry, bool large) {
         for (std::size_t at = 0; at < entry.value.size(); at += 8)
             orvela::append(value, number(entry.value, at, 8, mOrder), 4, mOrder);
     }
-    std::uint16_t type = narrow ? narrowType(entry.type) : entry.type;
+    std::uint16_t type = narrow ? narrowTagType(entry.type) : entry.type;
     std::uint64_t count = entry.count;
     std::uint64_t offset = entry.offset;
     if (!entry.below.empty()) {

@@ -2,8 +2,6 @@
 
 #include "files/Refusal.h"
 
-#include <cstring>
-
 namespace orvela {
 
 namespace {
@@ -17,8 +15,6 @@ ColorModel modelOf(const fs::path& path, VipsImage* image) {
     const bool grey = kind == VIPS_INTERPRETATION_B_W || kind == VIPS_INTERPRETATION_GREY16;
     const bool rgb = kind == VIPS_INTERPRETATION_sRGB || kind == VIPS_INTERPRETATION_RGB ||
                      kind == VIPS_INTERPRETATION_RGB16 || kind == VIPS_INTERPRETATION_scRGB;
-    if (bands > 4)
-        refuse(path, "has more than four channels", "save it flattened, without extra channels");
     if (grey && bands <= 2)
         return bands == 1 ? ColorModel::Grey : ColorModel::GreyAlpha;
     if (rgb && bands >= 3)
@@ -52,11 +48,12 @@ void takeProfile(Photograph& photograph, VipsImage* image) {
     photograph.iccProfile.assign(bytes, bytes + size);
 }
 
-int storeRows(VipsRegion* region, VipsRect* area, void* target) {
-    auto* samples = static_cast<std::uint8_t*>(target);
-    const std::size_t row = VIPS_IMAGE_SIZEOF_LINE(region->im);
-    for (int y = area->top; y < area->top + area->height; ++y)
-        std::memcpy(samples + static_cast<std::size_t>(y) * row, VIPS_REGION_ADDR(region, 0, y), row);
+int appendRows(VipsRegion* region, VipsRect* area, void* target) {
+    auto& samples = *static_cast<Bytes*>(target); // reserved before: nothing can be thrown
+    for (int y = area->top; y < area->top + area->height; ++y) {
+        const auto* row = VIPS_REGION_ADDR(region, 0, y);
+        samples.insert(samples.end(), row, row + VIPS_IMAGE_SIZEOF_LINE(region->im));
+    }
     return 0;
 }
 
@@ -72,9 +69,11 @@ Photograph describeImage(const fs::path& path, VipsImage* image) {
     return photograph;
 }
 
+// Rows come from the top on. Memory is taken as they come, so that a file that claims more than it has takes
+// no more than it has.
 void takeSamples(Photograph& photograph, const fs::path& path, VipsImage* image) {
-    photograph.samples.resize(VIPS_IMAGE_SIZEOF_IMAGE(image));
-    if (vips_sink_disc(image, storeRows, photograph.samples.data()) != 0)
+    photograph.samples.reserve(VIPS_IMAGE_SIZEOF_IMAGE(image));
+    if (vips_sink_disc(image, appendRows, &photograph.samples) != 0)
         refuseUnread(path, takeVipsError());
 }
 

@@ -1,6 +1,6 @@
 #include "metadata/ExifBlock.h"
 
-#include "metadata/JpegSegments.h"
+#include "metadata/TagDensity.h"
 
 #include <algorithm>
 #include <array>
@@ -14,24 +14,9 @@ namespace {
 // The block and the pictures behind it; more have not been seen.
 constexpr std::size_t kDirectories = 8;
 constexpr std::size_t kEntrySize = 12;
-constexpr std::array kQualities = {88, 80, 70, 60, 50, 40, 30, 20, 10};
 
 bool overlap(std::size_t a, std::size_t aSize, std::size_t b, std::size_t bSize) {
     return a < b + bSize && b < a + aSize;
-}
-
-Bytes rational(const Rational& value, ByteOrder order) {
-    Bytes bytes;
-    append(bytes, value.numerator, 4, order);
-    append(bytes, value.denominator, 4, order);
-    return bytes;
-}
-
-// A metre has no number among Exif's units.
-Rational perCentimetre(const Rational& perMetre) {
-    if (perMetre.denominator <= UINT32_MAX / 100)
-        return {perMetre.numerator, perMetre.denominator * 100};
-    return {perMetre.numerator / 100, perMetre.denominator};
 }
 
 Bytes emptyBlock() {
@@ -79,36 +64,14 @@ ExifDirectories exifDirectories(const TiffView& view, std::size_t first) {
     return found;
 }
 
-std::vector<TagField> densityFields(const Density& density, ByteOrder order) {
-    const bool metric = density.unit == DensityUnit::Metre || density.unit == DensityUnit::Centimetre;
-    const bool metre = density.unit == DensityUnit::Metre;
-    const std::uint64_t unit = metric ? 3 : density.unit == DensityUnit::Inch ? 2 : 1;
-    Bytes unitBytes;
-    append(unitBytes, unit, 2, order);
-    return {{tiff::XResolution, tiff::RationalType, 1,
-             rational(metre ? perCentimetre(density.x) : density.x, order)},
-            {tiff::YResolution, tiff::RationalType, 1,
-             rational(metre ? perCentimetre(density.y) : density.y, order)},
-            {tiff::ResolutionUnit, tiff::Short, 1, unitBytes}};
-}
-
-std::optional<Density> densityOf(const TiffView& view, const TagDirectory& directory) {
-    const auto rational = [&](std::uint16_t tag) -> Rational {
-        const TagEntry* entry = directory.find(tag);
-        if (entry == nullptr || entry->type != tiff::RationalType || entry->value.size() < 8)
-            return {0, 0};
-        const auto part = [&](std::size_t at) {
-            return static_cast<std::uint32_t>(number(entry->value, at, 4, view.order()));
-        };
-        return {part(0), part(4)};
-    };
-    Density density{rational(tiff::XResolution), rational(tiff::YResolution)};
-    if (density.x.value() <= 0 || density.y.value() <= 0)
-        return std::nullopt;
-    const TagEntry* entry = directory.find(tiff::ResolutionUnit);
-    const std::uint64_t unit = entry == nullptr || entry->value.empty() ? 2 : view.value(*entry);
-    density.unit = unit == 2 ? DensityUnit::Inch : unit == 3 ? DensityUnit::Centimetre : DensityUnit::None;
-    return density;
+Bytes thumbnailWithin(const ThumbnailMaker& make, const JpegSize& size, bool turned, std::size_t most) {
+    constexpr std::array qualities = {88, 80, 70, 60, 50, 40, 30, 20, 10};
+    for (const int quality : qualities) {
+        Bytes jpeg = turned ? make(size.height, size.width, quality) : make(size.width, size.height, quality);
+        if (!jpeg.empty() && jpeg.size() <= most)
+            return jpeg;
+    }
+    return {};
 }
 
 ExifBlock::ExifBlock(Bytes block) : mBytes(std::move(block)) {
@@ -185,7 +148,9 @@ std::optional<Density> ExifBlock::density() const {
     return orvela::densityOf(view, view.directory(view.first()));
 }
 
-void ExifBlock::setDensity(const Density& density) {
+bool ExifBlock::setDensity(const Density& density) {
+    if (mDamaged)
+        return false;
     std::vector<TagField> missing = densityFields(density, mOrder);
     std::erase_if(missing, [this](const TagField& field) {
         bool found = false;
@@ -199,6 +164,7 @@ void ExifBlock::setDensity(const Density& density) {
         return found;
     });
     add(missing);
+    return true;
 }
 
 std::vector<ExifBlock::Thumbnail> ExifBlock::thumbnails() const {
@@ -248,18 +214,14 @@ bool ExifBlock::renew(const Thumbnail& thumbnail, const ThumbnailMaker& make, bo
     const std::optional<JpegSize> size = jpegSize(slice(mBytes, thumbnail.at, thumbnail.length));
     if (!size || !isThumbnailSize(*size) || isShared(thumbnail))
         return false;
-    for (const int quality : kQualities) {
-        const Bytes jpeg =
-            turned ? make(size->height, size->width, quality) : make(size->width, size->height, quality);
-        if (jpeg.empty() || jpeg.size() > thumbnail.length)
-            continue;
-        const auto place = mBytes.begin() + static_cast<std::ptrdiff_t>(thumbnail.at);
-        std::fill_n(place, thumbnail.length, 0);
-        std::copy(jpeg.begin(), jpeg.end(), place);
-        patch(*thumbnail.directory.find(tiff::JpegLength), jpeg.size());
-        return true;
-    }
-    return false;
+    const Bytes jpeg = thumbnailWithin(make, *size, turned, thumbnail.length);
+    if (jpeg.empty())
+        return false;
+    const auto place = mBytes.begin() + static_cast<std::ptrdiff_t>(thumbnail.at);
+    std::fill_n(place, thumbnail.length, 0);
+    std::copy(jpeg.begin(), jpeg.end(), place);
+    patch(*thumbnail.directory.find(tiff::JpegLength), jpeg.size());
+    return true;
 }
 
 bool ExifBlock::renewThumbnails(const ThumbnailMaker& make, bool turned) {
@@ -309,9 +271,14 @@ void ExifBlock::add(const std::vector<TagField>& fields) {
         mBytes = emptyBlock();
     const TiffView view(mBytes);
     const TagDirectory old = view.directory(view.first());
-    std::map<std::uint16_t, Bytes> entries;
+    const auto isNew = [&](std::uint16_t tag) {
+        return std::any_of(fields.begin(), fields.end(),
+                           [tag](const TagField& field) { return field.tag == tag; });
+    };
+    std::multimap<std::uint16_t, Bytes> entries;
     for (const TagEntry& entry : old.entries)
-        entries.emplace(entry.tag, copyOf(slice(mBytes, entry.place, kEntrySize)));
+        if (!isNew(entry.tag))
+            entries.emplace(entry.tag, copyOf(slice(mBytes, entry.place, kEntrySize)));
     padToEven(mBytes);
     for (const TagField& field : fields) {
         Bytes entry;

@@ -1,6 +1,8 @@
 #pragma once
 
+#include "metadata/JpegSegments.h"
 #include "metadata/Metadata.h"
+#include "metadata/TagField.h"
 #include "metadata/TiffStructure.h"
 
 #include <functional>
@@ -11,13 +13,9 @@ namespace orvela {
 /// Makes a JPEG of that many pixels that shows the photograph; empty when it cannot.
 using ThumbnailMaker = std::function<Bytes(int width, int height, int quality)>;
 
-/// A tag with its value in the byte order of the block that it goes into.
-struct TagField {
-    std::uint16_t tag = 0;
-    std::uint16_t type = 0;
-    std::uint32_t count = 0;
-    Bytes value;
-};
+/// One of that size in so many bytes, in the best quality that fits; empty when none does.
+/// @param turned  swaps the edges
+Bytes thumbnailWithin(const ThumbnailMaker& make, const JpegSize& size, bool turned, std::size_t most);
 
 /// An Exif block that is edited in place: whatever is not asked for keeps its bytes and its distance from the
 /// beginning, so that the offsets in maker notes stay true. Of a damaged block the parts that cannot be
@@ -44,7 +42,8 @@ public:
     std::optional<Density> density() const;
 
     /// States the density in the resolution tags.
-    void setDensity(const Density& density);
+    /// @return false for a damaged block, which stays as it is
+    bool setDensity(const Density& density);
 
     /// Makes every thumbnail anew, in the pixel size and the place of the old one; one whose place is too
     /// small even in low quality, or that is no JPEG, is dropped.
@@ -91,11 +90,5 @@ struct ExifDirectories {
     const TagDirectory* find(std::uint16_t pointer) const;
 };
 ExifDirectories exifDirectories(const TiffView& view, std::size_t first);
-
-/// What the resolution tags of a directory state; none when they are not all there or state nothing.
-std::optional<Density> densityOf(const TiffView& view, const TagDirectory& directory);
-
-/// The resolution tags that state the density.
-std::vector<TagField> densityFields(const Density& density, ByteOrder order);
 
 } // namespace orvela

@@ -30,6 +30,18 @@ ImageResource firstOf(ByteView list) {
     return resource;
 }
 
+// Some programs count the length of IPTC in fours, with zeros behind the last record.
+ByteView significant(const ImageResource& resource) {
+    ByteView data = resource.data;
+    while (resource.id == resource::Iptc && !data.empty() && data.back() == 0)
+        data = data.first(data.size() - 1);
+    return data;
+}
+
+bool sameData(const ImageResource& a, const ImageResource& b) {
+    return sameBytes(significant(a), significant(b));
+}
+
 Bytes thumbnailResource(const JpegSize& size, ByteView jpeg) {
     const auto width = static_cast<std::uint64_t>(size.width);
     const std::uint64_t row = (width * 24 + 31) / 32 * 4;
@@ -92,14 +104,37 @@ void appendResource(Bytes& list, std::uint16_t id, ByteView data) {
         list.push_back(0);
 }
 
+void addResources(Bytes& list, ByteView more) {
+    if (list.empty()) {
+        list = copyOf(more);
+        return;
+    }
+    const ImageResources added = imageResources(more);
+    Bytes missing;
+    {
+        const ImageResources there = imageResources(list);
+        const auto isThere = [&](const ImageResource& one) {
+            return std::any_of(there.list.begin(), there.list.end(), [&](const ImageResource& other) {
+                return other.id == one.id && sameData(other, one);
+            });
+        };
+        for (const ImageResource& one : added.list)
+            if (!isThere(one))
+                append(missing, one.whole);
+        if (!sameBytes(added.rest, there.rest))
+            append(missing, added.rest);
+        if (there.rest.empty())
+            padToEven(list);
+    }
+    append(list, missing);
+}
+
 bool sameResources(ByteView a, ByteView b) {
     const auto sorted = [](ByteView list) {
         std::vector<std::pair<std::uint16_t, std::string_view>> all;
         const ImageResources resources = imageResources(list);
         for (const ImageResource& one : resources.list) {
-            std::string_view text = asText(one.data);
-            if (one.id == resource::Iptc)
-                text = text.substr(0, text.find_last_not_of('\0') + 1);
+            const std::string_view text = asText(significant(one));
             if (one.id != resource::Iptc || !text.empty())
                 all.emplace_back(one.id, text);
         }
@@ -115,12 +150,16 @@ std::optional<Density> resourceDensity(ByteView list) {
     const ImageResource* found = resources.find(resource::ResolutionInfo);
     if (found == nullptr || found->data.size() < 16)
         return std::nullopt;
-    // 16.16 pixels per inch, whatever unit is shown.
+    // 16.16 pixels per inch, whatever unit is shown. Some writers put the least there is where they know
+    // none.
     const auto value = [&](std::size_t at) {
         const auto fixed = static_cast<std::uint32_t>(number(found->data, at, 4, ByteOrder::Big));
-        return fixed % 65536 == 0 ? Rational{fixed / 65536, 1} : Rational{fixed, 65536};
+        return fixed <= 1           ? Rational{0, 1}
+               : fixed % 65536 == 0 ? Rational{fixed / 65536, 1}
+                                    : Rational{fixed, 65536};
     };
-    return Density{value(0), value(8), DensityUnit::Inch};
+    const Density density{value(0), value(8), DensityUnit::Inch};
+    return density.isMeant() ? std::optional(density) : std::nullopt;
 }
 
 bool renewResourceThumbnail(Bytes& list, const ThumbnailMaker& make) {

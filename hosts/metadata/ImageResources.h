@@ -40,6 +40,9 @@ Bytes withoutResources(ByteView list, const std::vector<std::uint16_t>& ids);
 
 void appendResource(Bytes& list, std::uint16_t id, ByteView data);
 
+/// Adds the resources of another list that are not there with the same data. Damaged lists come whole.
+void addResources(Bytes& list, ByteView more);
+
 /// Whether the lists hold the same, in any order. Zeros behind the IPTC records are not looked at.
 bool sameResources(ByteView a, ByteView b);
 

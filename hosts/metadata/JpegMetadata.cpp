@@ -57,7 +57,9 @@ void takeJfif(ByteView data, Metadata& metadata) {
                           data[7] == 1   ? DensityUnit::Inch
                           : data[7] == 2 ? DensityUnit::Centimetre
                                          : DensityUnit::None};
-    if (density.x.numerator > 0 && density.y.numerator > 0)
+    // Square pixels without a unit are what encoders write that know no density.
+    const bool says = density.unit != DensityUnit::None || density.x != density.y;
+    if (says && density.isMeant())
         metadata.density = density;
     if (data[12] > 0 && data[13] > 0)
         metadata.unheld.emplace_back("the JFIF thumbnail");
@@ -94,17 +96,15 @@ const char* unheldName(const JpegSegment& segment) {
     return nullptr;
 }
 
+bool isProfile(const JpegSegment& segment) {
+    return segment.marker == App2 && startsWith(segment.data, "ICC_PROFILE\0"sv);
+}
+
 // Whether the encoder of the result writes it itself.
 bool isEncoders(const JpegSegment& segment) {
     return segment.marker < App0 || segment.marker > Comment ||
-           (segment.marker > App15 && segment.marker < Comment) ||
-           (segment.marker == App2 && startsWith(segment.data, "ICC_PROFILE\0"sv)) ||
+           (segment.marker > App15 && segment.marker < Comment) || isProfile(segment) ||
            (segment.marker == App14 && startsWith(segment.data, "Adobe"));
-}
-
-void nameOnce(std::vector<std::string>& names, const std::string& name) {
-    if (std::find(names.begin(), names.end(), name) == names.end())
-        names.push_back(name);
 }
 
 void take(const JpegSegment& segment, Metadata& metadata) {
@@ -201,14 +201,19 @@ Metadata readJpegMetadata(ByteView file) {
     metadata.format = FileFormat::Jpeg;
     for (const JpegSegment& segment : jpegSegments(file))
         take(segment, metadata);
+    for (const JpegSegment& segment : laterJpegSegments(file))
+        if (isProfile(segment))
+            nameOnce(metadata.unheld, "an ICC profile behind the beginning of the picture");
+        else
+            take(segment, metadata);
     // As they are written.
     std::stable_partition(metadata.segments.begin(), metadata.segments.end(),
                           [](const Chunk& segment) { return segment.marker == App0; });
-    const std::size_t rest = behindJpeg(file).size();
-    const bool known = std::any_of(metadata.unheld.begin(), metadata.unheld.end(),
-                                   [](const std::string& name) { return name.ends_with("(MPF)"); });
-    if (rest > 0 && !known)
-        metadata.unheld.push_back(std::to_string(rest) + " bytes behind the picture");
+    const bool further = std::any_of(metadata.unheld.begin(), metadata.unheld.end(),
+                                     [](const std::string& name) { return name.ends_with("(MPF)"); });
+    const ByteView rest = behindJpeg(file);
+    if (!further || holdsFilm(rest))
+        nameRest(rest, metadata);
     return metadata;
 }
 

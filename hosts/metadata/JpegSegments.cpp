@@ -35,6 +35,23 @@ bool hasLength(int marker) {
     return marker > 1 && marker < 0xFF && (marker < 0xD0 || marker > 0xD9);
 }
 
+// Calls visit(marker, data) for each segment behind the first scan's beginning; returns what stands behind
+// the end marker.
+template <typename Visit>
+ByteView walkScans(ByteView file, Visit visit) {
+    ByteView rest = jpegScans(file);
+    while (rest.size() >= 2 && (rest[0] != 0xFF || rest[1] != kEnd)) {
+        std::size_t step = 1;
+        if (rest[0] == 0xFF && hasLength(rest[1]) && rest.size() >= 4) {
+            step = 2 + number(rest, 2, 2, ByteOrder::Big);
+            if (step >= 4 && step <= rest.size())
+                visit(rest[1], rest.subspan(4, step - 4));
+        }
+        rest = rest.subspan(std::min(step, rest.size()));
+    }
+    return rest.subspan(std::min<std::size_t>(2, rest.size()));
+}
+
 } // namespace
 
 std::vector<JpegSegment> jpegSegments(ByteView file) {
@@ -47,19 +64,14 @@ ByteView jpegScans(ByteView file) {
     return file.subspan(std::min(file.size(), walk(file, [](int, ByteView) {})));
 }
 
+std::vector<JpegSegment> laterJpegSegments(ByteView file) {
+    std::vector<JpegSegment> segments;
+    walkScans(file, [&](int marker, ByteView data) { segments.push_back({marker, data}); });
+    return segments;
+}
+
 ByteView behindJpeg(ByteView file) {
-    ByteView rest = jpegScans(file);
-    while (rest.size() >= 2 && (rest[0] != 0xFF || rest[1] != kEnd)) {
-        std::size_t step = 1;
-        if (rest[0] == 0xFF && hasLength(rest[1]) && rest.size() >= 4)
-            step = 2 + number(rest, 2, 2, ByteOrder::Big);
-        rest = rest.subspan(std::min(step, rest.size()));
-    }
-    rest = rest.subspan(std::min<std::size_t>(2, rest.size()));
-    const auto isFiller = [](std::uint8_t byte) { return byte == 0 || byte == 0xFF; };
-    while (!rest.empty() && isFiller(rest.back()))
-        rest = rest.first(rest.size() - 1);
-    return rest;
+    return walkScans(file, [](int, ByteView) {});
 }
 
 std::optional<JpegSize> jpegSize(ByteView file) {

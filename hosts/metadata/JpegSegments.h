@@ -6,7 +6,7 @@
 
 namespace orvela {
 
-/// A marker segment in front of the first scan.
+/// A marker segment.
 struct JpegSegment {
     int marker = 0; ///< 0xC0 to 0xFE
     ByteView data;  ///< behind the length
@@ -25,7 +25,10 @@ std::vector<JpegSegment> jpegSegments(ByteView file);
 /// From the first scan on; empty when there is none.
 ByteView jpegScans(ByteView file);
 
-/// What stands behind the end marker; zeros and the like at its end are left out.
+/// The segments behind that, between scans and behind the last one, as far as they are whole.
+std::vector<JpegSegment> laterJpegSegments(ByteView file);
+
+/// What stands behind the end marker.
 ByteView behindJpeg(ByteView file);
 
 /// Edges of the picture; none when the bytes are no JPEG with a frame.

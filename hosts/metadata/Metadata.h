@@ -34,6 +34,8 @@ struct Density {
         constexpr double lengths[] = {0, 25.4, 10, 1000};
         return lengths[static_cast<int>(unit)];
     }
+    /// Whether it says anything: some writers put zeros.
+    bool isMeant() const { return x.value() > 0 && y.value() > 0; }
     bool operator==(const Density&) const = default;
 };
 
@@ -80,6 +82,7 @@ struct Metadata {
     std::vector<Text> texts;        ///< of a PNG; a JPEG's comments by the keyword Comment
     std::optional<Density> density; ///< what the container itself says; Exif's never overrules it
     std::optional<ColorCodes> colors;
+    Bytes iccProfile;                ///< of a PNG that holds it as a text; every other goes with the picture
     int heifThumbnail = 0;           ///< longer edge of the thumbnail beside a HEIF's picture; 0 without one
     std::vector<Chunk> chunks;       ///< ancillary chunks of a PNG without neutral meaning, and its texts
     std::vector<Chunk> segments;     ///< APPn segments of a JPEG without neutral meaning
@@ -87,5 +90,17 @@ struct Metadata {
     std::vector<std::string>
         damaged; ///< what could not be understood and travels as it stands: "the Exif data"
 };
+
+/// Adds a name unless it is there.
+void nameOnce(std::vector<std::string>& names, const std::string& name);
+
+/// Takes a block into its place, which has room for one only: another that is not the same is named.
+void takeOnce(Bytes& place, ByteView block, const char* name, Metadata& metadata);
+
+/// Names what stands behind the end of a file's picture, if anything but filling does.
+void nameRest(ByteView rest, Metadata& metadata);
+
+/// Whether a film begins in there.
+bool holdsFilm(ByteView bytes);
 
 } // namespace orvela

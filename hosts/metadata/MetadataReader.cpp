@@ -10,8 +10,6 @@
 #include "metadata/TiffMetadata.h"
 #include "metadata/WebPMetadata.h"
 
-#include <algorithm>
-
 namespace orvela {
 
 namespace {
@@ -38,16 +36,12 @@ Metadata readContainer(ByteView file, FileFormat format, std::size_t page) {
 
 Metadata readMetadata(ByteView file, FileFormat format, std::size_t page) {
     Metadata metadata = readContainer(file, format, page);
-    const auto damaged = [&](const char* what) {
-        if (std::find(metadata.damaged.begin(), metadata.damaged.end(), what) == metadata.damaged.end())
-            metadata.damaged.emplace_back(what);
-    };
     if (ExifBlock(metadata.exif).isDamaged())
-        damaged("the Exif data");
+        nameOnce(metadata.damaged, "the Exif data");
     if (!imageResources(metadata.resources).rest.empty())
-        damaged("Photoshop's data");
+        nameOnce(metadata.damaged, "Photoshop's data");
     if (!metadata.xmp.empty() && !isWellFormedXmp(metadata.xmp))
-        damaged("the XMP data");
+        nameOnce(metadata.damaged, "the XMP data");
     return metadata;
 }
 

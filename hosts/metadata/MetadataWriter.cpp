@@ -4,13 +4,15 @@
 #include "metadata/ImageResources.h"
 #include "metadata/JpegMetadata.h"
 #include "metadata/MetadataReader.h"
+#include "metadata/NotePreviews.h"
 #include "metadata/PngMetadata.h"
+#include "metadata/PngTexts.h"
 #include "metadata/TagLibrary.h"
 #include "metadata/Utf8.h"
 #include "metadata/WebPMetadata.h"
 
 #include <algorithm>
-#include <array>
+#include <iterator>
 #include <regex>
 
 namespace orvela {
@@ -18,6 +20,8 @@ namespace orvela {
 namespace {
 
 using Names = std::vector<std::string>;
+
+constexpr std::size_t kLongestComment = 65533; // of a JPEG
 
 // A list that a line has room for.
 std::string joined(const Names& names, const char* between) {
@@ -31,16 +35,28 @@ std::string joined(const Names& names, const char* between) {
     return text;
 }
 
-// Tags of the first Exif directory that mean the same as keywords of PNG.
-std::uint16_t tagOf(const std::string& keyword) {
-    constexpr std::array<std::pair<std::string_view, std::uint16_t>, 4> table = {
-        {{"Author", tiff::Artist},
-         {"Copyright", tiff::Copyright},
-         {"Description", tiff::ImageDescription},
-         {"Software", tiff::Software}}};
-    const auto found =
-        std::find_if(table.begin(), table.end(), [&](const auto& entry) { return entry.first == keyword; });
-    return found == table.end() ? 0 : found->second;
+// The packet without what stands between these tags.
+std::string without(std::string_view open, std::string_view close, std::string_view packet) {
+    std::string kept;
+    std::size_t from = 0;
+    for (std::size_t at = packet.find(open); at != std::string_view::npos; at = packet.find(open, from)) {
+        const std::size_t last = packet.find(close, at);
+        if (last == std::string_view::npos)
+            break;
+        kept += packet.substr(from, at - from);
+        from = last + close.size();
+    }
+    return kept.append(packet.substr(from));
+}
+
+// @return whether the packet showed the picture as it was
+bool eraseThumbnails(Bytes& packet) {
+    const std::string kept = without("<xmp:Thumbnails", "</xmp:Thumbnails>",
+                                     without("<xap:Thumbnails", "</xap:Thumbnails>", asText(packet)));
+    if (kept.size() == packet.size())
+        return false;
+    packet = copyOf(asBytes(kept));
+    return true;
 }
 
 /// Makes the metadata of one format ready for another.
@@ -73,10 +89,11 @@ public:
 
 private:
     void adaptToPicture();
+    void dropXmpThumbnails();
     void dropSegments();
     void dropChunks();
     void moveTexts();
-    bool moveText(const Text& text);
+    bool moveText(Text text);
     void moveResources();
     void moveDensity();
     void moveColors();
@@ -84,7 +101,7 @@ private:
     void fitTiff();
 
     Metadata& metadata() { return mResult.metadata; }
-    void lose(const std::string& name) { mResult.lost.push_back(name); }
+    void lose(const std::string& name) { nameOnce(mResult.lost, name); }
 
     const Metadata& mSource;
     const PictureFacts& mPicture;
@@ -109,20 +126,33 @@ void Preparation::adaptToPicture() {
     const bool inHeif = mSource.heifThumbnail == 0 || mResult.target == FileFormat::Heif;
     if (!inExif || !inResources || !inHeif)
         lose("the thumbnail");
+    Bytes block = mExif.bytes();
+    if (!renewNotePreviews(block, mPicture.makeThumbnail, turned))
+        lose("the preview in the maker note");
+    mExif = ExifBlock(std::move(block));
+    dropXmpThumbnails();
+}
+
+// A long packet of a JPEG has them in further segments.
+void Preparation::dropXmpThumbnails() {
+    std::optional<Bytes> whole = joinXmp(metadata().xmp, metadata().segments);
+    const bool parted = whole.has_value();
+    Bytes packet = whole ? std::move(*whole) : metadata().xmp;
+    if (!eraseThumbnails(packet))
+        return;
+    lose("the thumbnail");
+    metadata().xmp = std::move(packet);
+    if (parted)
+        std::erase_if(metadata().segments, [](const Chunk& one) { return one.name == kExtendedXmp; });
 }
 
 void Preparation::dropSegments() {
-    if (mSource.segments.empty())
-        return;
-    Names names;
-    const std::optional<Bytes> xmp = joinXmp(mSource.xmp, mSource.segments);
+    const std::optional<Bytes> xmp = joinXmp(metadata().xmp, metadata().segments);
     if (xmp)
         metadata().xmp = *xmp;
-    for (const Chunk& segment : mSource.segments)
-        if (!(xmp && segment.name == kExtendedXmp) &&
-            std::find(names.begin(), names.end(), segment.name) == names.end())
-            names.push_back(segment.name);
-    mResult.lost.insert(mResult.lost.end(), names.begin(), names.end());
+    for (const Chunk& segment : metadata().segments)
+        if (!xmp || segment.name != kExtendedXmp)
+            lose(segment.name);
     metadata().segments.clear();
 }
 
@@ -130,8 +160,7 @@ void Preparation::dropSegments() {
 void Preparation::dropChunks() {
     Names names;
     for (const Chunk& chunk : mSource.chunks) {
-        const bool text = chunk.name == "tEXt" || chunk.name == "zTXt" || chunk.name == "iTXt";
-        if (!text && !isPlainColour(chunk))
+        if (!isPngText(chunk.name) && !isPlainColour(chunk))
             names.push_back(chunk.name);
     }
     if (!names.empty())
@@ -139,16 +168,21 @@ void Preparation::dropChunks() {
     metadata().chunks.clear();
 }
 
-bool Preparation::moveText(const Text& text) {
-    const bool png = mResult.target == FileFormat::Png;
-    const bool comment = text.keyword == "Comment" && mResult.target == FileFormat::Jpeg;
-    if (png || (comment && text.text.size() <= 65533)) {
-        const bool bytes = comment && mSource.format == FileFormat::Jpeg;
-        metadata().texts.push_back({text.keyword, bytes ? text.text : toUtf8(text.text)});
+// Some cameras fill up a comment with zeros. Within a text few places hold one.
+bool Preparation::moveText(Text text) {
+    const bool bytes = text.keyword == kCommentKeyword && mResult.target == FileFormat::Jpeg;
+    if (!bytes) {
+        text.text.erase(text.text.find_last_not_of('\0') + 1);
+        if (text.text.find('\0') != std::string::npos)
+            return false;
+    }
+    if (mResult.target == FileFormat::Png || (bytes && text.text.size() <= kLongestComment)) {
+        const bool plain = bytes && mSource.format == FileFormat::Jpeg;
+        metadata().texts.push_back({text.keyword, plain ? text.text : toUtf8(text.text)});
         return true;
     }
-    const std::uint16_t tag = tagOf(text.keyword);
-    if (tag == 0 || mExif.isDamaged() || text.text.find('\0') != std::string::npos)
+    const std::uint16_t tag = tagOfKeyword(text.keyword);
+    if (tag == 0 || mExif.isDamaged())
         return false;
     if (const std::optional<std::string> there = mExif.text(tag))
         return *there == text.text;
@@ -174,10 +208,13 @@ void Preparation::moveResources() {
     if (mResult.target != FileFormat::WebP && mResult.target != FileFormat::Heif)
         return;
     const ImageResources resources = imageResources(mSource.resources);
-    if (const ImageResource* iptc = resources.find(resource::Iptc)) {
-        const Names names = iptcNames(iptc->data);
+    Names names;
+    for (const ImageResource& one : resources.list)
+        if (one.id == resource::Iptc)
+            for (const std::string& name : iptcNames(one.data))
+                nameOnce(names, name);
+    if (resources.find(resource::Iptc) != nullptr)
         lose(names.empty() ? "IPTC" : "IPTC " + joined(names, ", "));
-    }
     const bool others = std::any_of(resources.list.begin(), resources.list.end(),
                                     [](const ImageResource& one) { return one.id != resource::Iptc; });
     if (others || !resources.rest.empty())
@@ -190,10 +227,12 @@ void Preparation::moveDensity() {
     if (!mSource.density || mResult.target == FileFormat::Jpeg || mResult.target == FileFormat::Png ||
         mResult.target == FileFormat::Tiff)
         return;
-    if (mSource.density->unit != DensityUnit::None)
-        mExif.setDensity(*mSource.density);
-    else if (mSource.density->x.value() != mSource.density->y.value())
+    if (mSource.density->unit != DensityUnit::None) {
+        if (!mExif.setDensity(*mSource.density))
+            lose("the density");
+    } else if (mSource.density->x.value() != mSource.density->y.value()) {
         lose("the shape of its pixels");
+    }
     metadata().density.reset();
 }
 
@@ -223,12 +262,13 @@ void Preparation::fitJpeg() {
         lose("the Exif data, of over 64 KiB");
         mExif = ExifBlock({});
     }
-    if (mSource.xmp.size() <= kJpegXmpLimit)
+    if (metadata().xmp.size() <= kJpegXmpLimit)
         return;
+    const Bytes packet = std::move(metadata().xmp);
     metadata().xmp.clear();
-    if (std::optional<PartedXmp> parted = partXmp(mSource.xmp)) {
+    if (std::optional<PartedXmp> parted = partXmp(packet)) {
         metadata().xmp = std::move(parted->main);
-        metadata().segments = std::move(parted->segments);
+        std::move(parted->segments.begin(), parted->segments.end(), std::back_inserter(metadata().segments));
     } else {
         lose("the XMP data");
     }
@@ -267,11 +307,6 @@ PreparedMetadata prepareMetadata(const Metadata& source, FileFormat target, cons
 
 void embedMetadata(PreparedMetadata& prepared, Bytes& encoded) {
     const Metadata& metadata = prepared.metadata;
-    const auto lose = [&](const Names& names) {
-        for (const std::string& name : names)
-            if (std::find(prepared.lost.begin(), prepared.lost.end(), name) == prepared.lost.end())
-                prepared.lost.push_back(name);
-    };
     switch (prepared.target) {
     case FileFormat::Jpeg:
         embedIntoJpeg(metadata, encoded);
@@ -287,7 +322,8 @@ void embedMetadata(PreparedMetadata& prepared, Bytes& encoded) {
     case FileFormat::Psd:
         break;
     }
-    lose(differences(metadata, readMetadata(encoded, prepared.target)));
+    for (const std::string& name : differences(metadata, readMetadata(encoded, prepared.target)))
+        nameOnce(prepared.lost, name);
 }
 
 std::vector<std::string> metadataNotes(const PreparedMetadata& prepared) {

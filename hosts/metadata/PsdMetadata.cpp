@@ -2,6 +2,7 @@
 
 #include "metadata/ImageResources.h"
 
+#include <array>
 #include <cstdlib>
 
 namespace orvela {
@@ -13,6 +14,22 @@ constexpr std::size_t kHeader = 26;
 Bytes dataOf(const ImageResources& resources, std::uint16_t id) {
     const ImageResource* found = resources.find(id);
     return found == nullptr ? Bytes() : copyOf(found->data);
+}
+
+// Of a kind that has one place, what stands behind the first.
+void nameFurther(const ImageResources& resources, Metadata& metadata) {
+    constexpr std::array<std::pair<std::uint16_t, const char*>, 4> kinds = {
+        {{resource::Exif, "a second Exif block"},
+         {resource::Exif3, "a second Exif block"},
+         {resource::Xmp, "a second XMP packet"},
+         {resource::IccProfile, "a second ICC profile"}}};
+    for (const ImageResource& one : resources.list)
+        for (const auto& [id, name] : kinds) {
+            const std::uint16_t taken = id == resource::Exif3 ? std::uint16_t{resource::Exif} : id;
+            const ImageResource* first = resources.find(taken);
+            if (one.id == id && (first == nullptr || !sameBytes(one.data, first->data)))
+                nameOnce(metadata.unheld, name);
+        }
 }
 
 // Among the file's resources, those that another format has a place of its own for, or that tell of layers.
@@ -47,6 +64,7 @@ Metadata readPsdMetadata(ByteView file) {
         metadata.exif = dataOf(resources, resource::Exif);
         metadata.xmp = dataOf(resources, resource::Xmp);
         metadata.density = resourceDensity(list);
+        nameFurther(resources, metadata);
         metadata.resources = withoutResources(list, kElsewhere);
         if (psdLayers(cursor.block()).count > 0)
             metadata.unheld.emplace_back("the layers");

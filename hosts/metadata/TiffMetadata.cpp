@@ -2,6 +2,7 @@
 
 #include "metadata/ExifBlock.h"
 #include "metadata/ImageResources.h"
+#include "metadata/TagDensity.h"
 #include "metadata/TagLibrary.h"
 
 #include <algorithm>
@@ -17,10 +18,6 @@ constexpr std::size_t kNoteLimit = 60000;
 
 bool isResolution(std::uint16_t tag) {
     return tag == tiff::XResolution || tag == tiff::YResolution || tag == tiff::ResolutionUnit;
-}
-
-bool isPointer(std::uint16_t tag) {
-    return tag == tiff::ExifIfd || tag == tiff::GpsIfd || tag == tiff::InteropIfd;
 }
 
 /// Lays out directories and their values around a maker note that has to stay where it is.
@@ -88,14 +85,10 @@ private:
 
 // Numbers of eight bytes, which only a BigTIFF has, in four.
 TagField classic(const TiffView& view, const TagEntry& entry) {
-    constexpr std::uint16_t long8 = 16;
-    constexpr std::uint16_t slong8 = 17;
-    constexpr std::uint16_t ifd8 = 18;
-    constexpr std::uint16_t slong = 9;
-    TagField field{entry.tag, entry.type, static_cast<std::uint32_t>(entry.count), copyOf(entry.value)};
-    if (entry.type != long8 && entry.type != slong8 && entry.type != ifd8)
+    TagField field{entry.tag, narrowTagType(entry.type), static_cast<std::uint32_t>(entry.count),
+                   copyOf(entry.value)};
+    if (field.type == entry.type)
         return field;
-    field.type = entry.type == slong8 ? slong : static_cast<std::uint16_t>(tiff::Long);
     field.value.clear();
     for (std::size_t i = 0; i < entry.count; ++i)
         append(field.value, view.value(entry, i), 4, view.order());
@@ -106,7 +99,7 @@ TagField classic(const TiffView& view, const TagEntry& entry) {
 std::vector<TagField> fieldsOf(const TiffView& view, const TagDirectory& directory, bool first) {
     std::vector<TagField> fields;
     for (const TagEntry& entry : directory.entries)
-        if (!entry.value.empty() && !isPointer(entry.tag) && !(first && isTiffStructure(entry.tag)))
+        if (!entry.value.empty() && !leadsToExif(entry.tag) && !(first && isTiffStructure(entry.tag)))
             fields.push_back(classic(view, entry));
     return fields;
 }
@@ -175,13 +168,12 @@ ByteView withoutPadding(ByteView iptc) {
     return iptc;
 }
 
+// The tag goes before what Photoshop's list holds of the kind, often the same.
 void takeResources(const TagDirectory& page, Metadata& metadata) {
     const ByteView iptc = withoutPadding(valueOf(page, tiff::Iptc));
-    metadata.resources = copyOf(valueOf(page, tiff::Resources));
-    if (iptc.empty())
-        return;
-    metadata.resources = withoutResources(metadata.resources, {resource::Iptc});
-    appendResource(metadata.resources, resource::Iptc, iptc);
+    if (!iptc.empty())
+        appendResource(metadata.resources, resource::Iptc, iptc);
+    addResources(metadata.resources, valueOf(page, tiff::Resources));
 }
 
 } // namespace
@@ -220,12 +212,18 @@ std::vector<TagField> tiffFields(const Metadata& metadata, ByteOrder order) {
     };
     add(tiff::Xmp, tiff::Byte, metadata.xmp);
     const ImageResources resources = imageResources(metadata.resources);
-    if (const ImageResource* iptc = resources.find(resource::Iptc)) {
+    const ImageResource* iptc = resources.find(resource::Iptc);
+    if (iptc != nullptr) {
         Bytes padded = copyOf(iptc->data);
         padded.resize((padded.size() + 3) / 4 * 4);
         add(tiff::Iptc, tiff::Long, std::move(padded));
     }
-    add(tiff::Resources, tiff::Byte, withoutResources(metadata.resources, {resource::Iptc}));
+    Bytes others;
+    for (const ImageResource& one : resources.list)
+        if (&one != iptc)
+            append(others, one.whole);
+    append(others, resources.rest);
+    add(tiff::Resources, tiff::Byte, std::move(others));
     if (metadata.density)
         for (TagField& field : densityFields(*metadata.density, order))
             fields.push_back(std::move(field));

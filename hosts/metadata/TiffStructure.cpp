@@ -32,6 +32,23 @@ std::size_t tagTypeSize(std::uint16_t type) {
     return type < sizes.size() ? sizes.at(type) : type == utf8 ? 1 : 0;
 }
 
+std::uint16_t narrowTagType(std::uint16_t type) {
+    switch (type) {
+    case tiff::Long8:
+        return tiff::Long;
+    case tiff::SLong8:
+        return tiff::SLong;
+    case tiff::Ifd8:
+        return tiff::Ifd;
+    default:
+        return type;
+    }
+}
+
+bool leadsToExif(std::uint16_t tag) {
+    return tag == tiff::ExifIfd || tag == tiff::GpsIfd || tag == tiff::InteropIfd;
+}
+
 TiffView::TiffView(ByteView bytes) : mBytes(bytes) {
     using namespace std::string_view_literals;
     mBig = startsWith(bytes, "II+\0\x08\0\0\0"sv) || startsWith(bytes, "MM\0+\0\x08\0\0"sv);

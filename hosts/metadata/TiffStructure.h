@@ -5,7 +5,19 @@
 namespace orvela {
 
 namespace tiff {
-enum Type : std::uint16_t { Byte = 1, Ascii = 2, Short = 3, Long = 4, RationalType = 5, Undefined = 7 };
+enum Type : std::uint16_t {
+    Byte = 1,
+    Ascii = 2,
+    Short = 3,
+    Long = 4,
+    RationalType = 5,
+    Undefined = 7,
+    SLong = 9,
+    Ifd = 13,
+    Long8 = 16,
+    SLong8 = 17,
+    Ifd8 = 18
+};
 enum Tag : std::uint16_t {
     ImageWidth = 0x0100,
     ImageLength = 0x0101,
@@ -64,6 +76,12 @@ struct TagChain {
 
 /// Bytes of one value; 0 for types that are unknown.
 std::size_t tagTypeSize(std::uint16_t type);
+
+/// Of a type of eight bytes that only a BigTIFF knows the one of four, of others the same.
+std::uint16_t narrowTagType(std::uint16_t type);
+
+/// Whether the tag leads to one of Exif's directories.
+bool leadsToExif(std::uint16_t tag);
 
 /// A TIFF, classic or BigTIFF, of either byte order, or an Exif block. Refers to the bytes.
 class TiffView {

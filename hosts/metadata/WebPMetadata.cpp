@@ -73,8 +73,7 @@ Metadata readWebPMetadata(ByteView file) {
         else if (!isPicture(chunk.name))
             metadata.unheld.push_back("the WebP chunk " + std::string(chunk.name));
     }
-    if (whole.size() < file.size())
-        metadata.unheld.push_back(std::to_string(file.size() - whole.size()) + " bytes behind the picture");
+    nameRest(behind(file, whole.size()), metadata);
     // Some writers leave the head of a JPEG segment before it.
     if (startsWith(metadata.exif, "Exif\0\0"sv))
         metadata.exif.erase(metadata.exif.begin(), metadata.exif.begin() + 6);

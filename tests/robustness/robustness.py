@@ -4,13 +4,15 @@
     robustness.py PROGRAM SAMPLES [--mutants N] [--cuts N] [--kills N] [--seed N] [--keep FOLDER]
 
 Every file of seeds.txt is changed at random places (mutants), cut short (cuts), and enhanced by runs that are ended by
-a signal at a random moment (kills). Whatever happens, the program must
+a signal at a random moment (kills). One mutant of six goes into a file of another format, each of them by turns.
+Whatever happens, the program must
   - end by itself, with a status that it documents, and never by a signal of its own making,
   - tell each failure in one short line that names the file,
   - leave every source as it was, every result whole or not there at all, and no other file.
 Prints the damaged file of each failure and exits 1; with --keep it is kept.
 """
 import argparse
+import itertools
 import os
 import random
 import shutil
@@ -24,6 +26,7 @@ HERE = os.path.dirname(os.path.realpath(__file__))
 STATUSES = {0, 1, 5}  # done, a photograph failed, not enough memory
 SECONDS = 60          # for a batch of pictures of a few thousand pixels
 MAX_LINE = 400        # bytes of a message
+TARGETS = (".jpg", ".png", ".webp", ".heic", ".tif")
 
 
 def make_seeds(samples, folder, size="96x64", wanted=None):
@@ -89,23 +92,26 @@ class Judge:
             os.makedirs(self.options.keep, exist_ok=True)
             shutil.copy(path, f"{self.options.keep}/{self.failures}-{os.path.basename(path)}")
 
-    def run(self, folder, names):
+    def run(self, folder, names, extension):
         """Status and messages of one batch; None for a status when it did not end."""
-        command = [self.options.program, "enhance", "-d", "out", "--quiet", *names]
+        os.makedirs(f"{folder}/out", exist_ok=True)
+        target = ["-o", f"out/{os.path.splitext(names[0])[0]}{extension}"] if extension else ["-d", "out"]
+        command = [self.options.program, "enhance", *target, "--quiet", *names]
         try:
             done = subprocess.run(command, cwd=folder, stdin=subprocess.DEVNULL, capture_output=True, timeout=SECONDS)
             return done.returncode, done.stderr.decode("utf-8", "replace").splitlines()
         except subprocess.TimeoutExpired:
             return None, []
 
-    def judge(self, files, what):
-        """Enhances the files, given as name to content, in one batch; apart when that goes wrong."""
+    def judge(self, files, what, extension=None):
+        """Enhances the files, given as name to content, in one batch; apart when that goes wrong. With an extension
+        there is one file, and that is the format that it goes into."""
         self.files += len(files)
         with tempfile.TemporaryDirectory() as folder:
             for name, data in files.items():
                 with open(f"{folder}/{name}", "wb") as file:
                     file.write(data)
-            status, lines = self.run(folder, list(files))
+            status, lines = self.run(folder, list(files), extension)
             if status not in STATUSES:
                 if len(files) > 1:
                     self.files -= len(files)
@@ -120,7 +126,7 @@ class Judge:
     def look(self, folder, files, status, lines, what):
         results = set(os.listdir(f"{folder}/out")) if os.path.isdir(f"{folder}/out") else set()
         for line in lines:
-            if len(line.encode()) > MAX_LINE or not any(name in line for name in files):
+            if len(line.encode()) > MAX_LINE or not any(os.path.splitext(name)[0] in line for name in files):
                 self.fail(f"{what}: a message is long or names no file: {line[:600]}")
         for name, data in files.items():
             path = f"{folder}/{name}"
@@ -129,7 +135,7 @@ class Judge:
                     self.fail(f"{what}: {name} was changed", path)
             base = os.path.splitext(name)[0]
             made = [each for each in results if os.path.splitext(each)[0] == base]
-            told = any(name in line for line in lines)
+            told = any(f"{base}." in line for line in lines) # itself or its result
             if not made and not told:
                 self.fail(f"{what}: {name} failed without a message", path)
             if len(made) > 1:
@@ -173,11 +179,11 @@ class Judge:
                 self.fail(f"{name}: an interrupted run left a result that is not whole")
 
 
-def batches(data, name, count, change, rng):
-    """Changed forms of one seed, twenty at a time, as name to content."""
+def batches(data, name, count, change, rng, size=20):
+    """Changed forms of one seed, so many at a time, as name to content."""
     base, extension = os.path.splitext(name)
-    for start in range(0, count, 20):
-        numbers = range(start, min(start + 20, count))
+    for start in range(0, count, size):
+        numbers = range(start, min(start + size, count))
         yield {f"{base}-{number}{extension}": change(data, rng) for number in numbers}
 
 
@@ -185,7 +191,7 @@ def main():
     parser = argparse.ArgumentParser(description=__doc__, formatter_class=argparse.RawDescriptionHelpFormatter)
     parser.add_argument("program", type=os.path.realpath)
     parser.add_argument("samples", type=os.path.realpath)
-    parser.add_argument("--mutants", type=int, default=6, help="of each seed")
+    parser.add_argument("--mutants", type=int, default=5, help="of each seed")
     parser.add_argument("--cuts", type=int, default=3, help="of each seed")
     parser.add_argument("--kills", type=int, default=6, help="in all")
     parser.add_argument("--seed", type=int, default=1, help="of the random numbers")
@@ -195,8 +201,12 @@ def main():
     rng = random.Random(options.seed)
     with tempfile.TemporaryDirectory() as folder:
         seeds = make_seeds(options.samples, folder)
+        targets = itertools.cycle(TARGETS)
         for name, data in seeds.items():
             judge.judge({name: data}, "the whole file")
+            for files in batches(data, name, (options.mutants + 5) // 6, mutant, rng, 1):
+                target = next(targets)
+                judge.judge(files, "a mutant", next(targets) if name.endswith(target) else target)
             for files in batches(data, name, options.mutants, mutant, rng):
                 judge.judge(files, "a mutant")
             for files in batches(data, name, options.cuts, cut, rng):

@@ -57,6 +57,30 @@ TEST(HeifFile, KeepsTheResolutionOfColour) {
     EXPECT_EQ(codingOf(folder, "asked.heic").chroma, Chroma::Half);
 }
 
+// Only a given quality makes it lossy. A lossy one does not become lossless, however good it is.
+TEST(HeifFile, StaysWithoutLoss) {
+    const TestFolder folder;
+    folder.run("convert $S/coffee.png -resize 128x96! p.png && vips heifsave p.png l.heic --lossless "
+               "--subsample-mode off && vips heifsave p.png q.heic --Q 100");
+    const Photograph photograph = readPhotograph(folder / "l.heic");
+    for (const char* target : {"t.heic", "t.avif"}) {
+        writePhotograph(photograph, folder / target);
+        const Photograph read = readPhotograph(folder / target);
+        ASSERT_EQ(read.samples.size(), photograph.samples.size());
+        int most = 0; // rounding between the models of colour
+        for (std::size_t i = 0; i < read.samples.size(); ++i)
+            most = std::max(most, std::abs(read.samples[i] - photograph.samples[i]));
+        EXPECT_LE(most, 2) << target;
+    }
+    EXPECT_TRUE(codingOf(folder, "t.heic").lossless);
+    WriteOptions lossy = overwriting();
+    lossy.quality = 80;
+    writePhotograph(photograph, folder / "t.heic", lossy);
+    EXPECT_FALSE(codingOf(folder, "t.heic").lossless);
+    writePhotograph(readPhotograph(folder / "q.heic"), folder / "u.heic");
+    EXPECT_FALSE(codingOf(folder, "u.heic").lossless);
+}
+
 // The same pixels written once more take about as many bytes, whatever the quality was.
 TEST(HeifFile, TakesAsManyBytesAsTheSource) {
     const TestFolder folder;

@@ -157,11 +157,17 @@ TEST(JpegFile, WritesEveryLayoutThatCanBeRead) {
         component.quantizer.fill(2);
     layout.components[0].horizontal = layout.components[0].vertical = 4;
     layout.components[2].quantizer.fill(0);
-    const Photograph read = readJpeg(encodeJpeg(wide, "t.jpg", {}), "t.jpg");
-    layout.components[1].table = 1;
-    layout.components[2].table = 2;
-    layout.components[2].quantizer.fill(1);
-    EXPECT_EQ(read.encoding.jpeg, layout);
+    JpegLayout expected = layout;
+    expected.components[1].table = 1;
+    expected.components[2].table = 2;
+    expected.components[2].quantizer.fill(1);
+    wide.encoding.format = FileFormat::Jpeg;
+    for (const bool progressive : {false, true}) {
+        wide.encoding.progressive = progressive;
+        const Photograph read = readJpeg(encodeJpeg(wide, "t.jpg", {}), "t.jpg");
+        EXPECT_EQ(read.encoding.jpeg, expected);
+        EXPECT_EQ(read.encoding.progressive, progressive);
+    }
 }
 
 TEST(JpegFile, TakesGivenQualityAndChroma) {

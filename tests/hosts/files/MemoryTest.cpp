@@ -111,6 +111,70 @@ TEST(DeclaredPicture, OfNothingButWhiteIsTaken) {
         }
 }
 
+// One colour is the least that a picture can be: a file that claims more for its size is refused, not this.
+TEST(DeclaredPicture, OfOneColourIsTaken) {
+    const TestFolder folder;
+    folder.run(
+        "convert -size 6000x4000 'xc:rgb(90,140,200)' -depth 8 -type TrueColor -compress none f.tif && "
+        "for c in zstd webp; do vips tiffsave f.tif $c.tif --compression $c --Q 1 --tile --tile-width 4096 "
+        "--tile-height 4096; done && "
+        "vips tiffsave f.tif jpeg.tif --compression jpeg --Q 20 && "
+        "convert f.tif -define tiff:rows-per-strip=4000 -compress LZMA lzma.tif && "
+        "vips webpsave f.tif lossy.webp --Q 0 && "
+        "convert f.tif -crop 3000x2000+0+0 +repage c.tif && "
+        "vips heifsave c.tif f.heic --Q 1 --effort 0 && rm c.tif && "
+        "vips heifsave f.tif f.avif --Q 1 --effort 0 --compression av1 && rm f.tif");
+    for (const auto& file : std::filesystem::directory_iterator(folder.path()))
+        if (const std::string name = file.path().filename(); name != "log") {
+            const Photograph photograph = readPhotograph(file.path());
+            EXPECT_EQ(photograph.width * photograph.height, name == "f.heic" ? 6'000'000 : 24'000'000)
+                << name;
+            EXPECT_NEAR(photograph.samples.back(), 200, 40) << name;
+        }
+}
+
+// The same value in every place where a file of 64 x 64 pixels tells its edges.
+std::string claiming(std::string file, const std::string& width, const std::string& height,
+                     const std::string& claimed) {
+    for (const std::string& edge : {width, height}) {
+        EXPECT_NE(file.find(edge), file.npos);
+        file.replace(file.find(edge) + edge.size() - claimed.size(), claimed.size(), claimed);
+    }
+    return file;
+}
+
+TEST(DeclaredPicture, OfMoreThanAFewBytesCanHoldIsRefused) {
+    using namespace std::string_literals;
+    const TestFolder folder;
+    folder.run("convert $S/coffee.png -resize 64x64! -depth 8 p.png && "
+               "for c in jpeg zstd webp; do vips copy p.png $c.tif[compression=$c]; done && "
+               "convert p.png -compress LZMA lzma.tif && "
+               "for c in Group4 Fax; do convert p.png -monochrome -compress $c $c.tif; done && "
+               "convert p.png -strip -quality 80 lossy.webp && vips copy p.png photo.heic && rm p.png log");
+    for (const auto& file : std::filesystem::directory_iterator(folder.path())) {
+        const std::string name = file.path().filename();
+        const std::string whole = folder.text(name);
+        std::string claims;
+        if (name.ends_with(".tif"))
+            claims = claiming(whole, "\0\1\3\0\1\0\0\0\x40\0"s, "\1\1\3\0\1\0\0\0\x40\0"s, "\x30\x75"s);
+        else if (name.ends_with(".webp"))
+            claims = claiming(whole, "\x9D\x01\x2A\x40\0"s, "\x9D\x01\x2A\xFF\x3F\x40\0"s, "\xFF\x3F"s);
+        else
+            claims = claiming(whole, "ispe\0\0\0\0\0\0\0\x40"s, "ispe\0\0\0\0\0\0\x75\x30\0\0\0\x40"s,
+                              "\x75\x30"s);
+        folder.put("claims", claims);
+        try {
+            readPhotograph(folder / "claims");
+            ADD_FAILURE() << name;
+        } catch (const PhotographError& error) {
+            EXPECT_THAT(error.what(), testing::HasSubstr("more than its " + std::to_string(whole.size()) +
+                                                         " bytes can hold"))
+                << name;
+        }
+        std::filesystem::remove(folder / "claims");
+    }
+}
+
 // What libraries say of memory is not laid to the file's charge.
 TEST(Refusal, TellsWantOfMemoryFromDamage) {
     for (const char* text : {"No space for YCbCr->RGB conversion state", "out of memory --- size == 3MB",

@@ -6,6 +6,8 @@
 #include <sys/wait.h>
 
 using namespace orvela;
+using testing::ElementsAre;
+using testing::HasSubstr;
 
 namespace {
 
@@ -51,12 +53,16 @@ TEST(PhotographReader, NamesMissingPermission) {
 TEST(PhotographReader, ReadsBitmapsAsGreyAndTheFirstPageOfSeveral) {
     const TestFolder folder;
     folder.run("convert -size 9x2 xc:white -fill black -draw 'point 8,1' -monochrome -compress None m.png && "
-               "convert m.png -compress Group4 m.tif && convert m.png -compress None m.psd && "
+               "convert m.png -compress Group4 m.tif && "
+               "convert m.png -negate -depth 1 GRAY:rows && python3 -c \"open('m.psd', 'wb').write("
+               "b'8BPS\\0\\1' + bytes(7) + b'\\1' + bytes([0, 0, 0, 2, 0, 0, 0, 9, 0, 1]) + bytes(16) + "
+               "open('rows', 'rb').read())\" && "
                "convert $S/coffee.png -resize 5x3! $S/rocket.jpg pages.tif");
     for (const char* name : {"m.png", "m.tif", "m.psd"}) {
         const Photograph read = readPhotograph(folder / name);
         std::vector<std::uint8_t> expected(18, 255);
         expected[17] = 0;
+        EXPECT_THAT(read.notes, ElementsAre(HasSubstr("expanded"))) << name; // they have one bit
         EXPECT_EQ(read.model, ColorModel::Grey) << name;
         EXPECT_EQ(read.samples, expected) << name;
     }
@@ -64,6 +70,26 @@ TEST(PhotographReader, ReadsBitmapsAsGreyAndTheFirstPageOfSeveral) {
     EXPECT_EQ(first.pages, 2);
     EXPECT_EQ(first.width, 5);
     EXPECT_EQ(first.height, 3);
+}
+
+// The first brand is a matter of who wrote the file; each that a reader may go by as well counts.
+TEST(PhotographReader, KnowsHeifByAnyOfItsBrands) {
+    const TestFolder folder;
+    folder.run("convert $S/coffee.png -resize 64x48! p.png && vips heifsave p.png heic && "
+               "vips heifsave p.png avif.avif --compression av1 --effort 0 && mv avif.avif avif");
+    for (const char* kind : {"heic", "avif"}) {
+        const std::string whole = folder.text(kind);
+        for (const char* first : {"miaf", "mif1", "msf1", "isom"}) {
+            folder.put("s.bin", std::string(whole).replace(8, 4, first));
+            EXPECT_EQ(readPhotograph(folder / "s.bin").width, 64) << kind << first;
+        }
+        const std::size_t end = static_cast<unsigned char>(whole[3]);
+        std::string film = std::string(whole).replace(8, 4, "isom");
+        for (std::size_t at = 16; at < end; at += 4)
+            film.replace(at, 4, "mp41");
+        folder.put("s.bin", film);
+        EXPECT_THAT(refusal(folder / "s.bin"), testing::HasSubstr("is not a picture of a known kind"));
+    }
 }
 
 // 10 bits of HEIF reach full scale.

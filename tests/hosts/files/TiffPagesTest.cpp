@@ -381,6 +381,45 @@ TEST(TiffPages, OfCameraRawFilesAreRefused) {
     }
 }
 
+// The first strip stands where one maker's raw files have their mark.
+TEST(TiffPages, OfOneGreyAreNoCameraRawFile) {
+    const TestFolder folder;
+    folder.run("convert -size 16x16 'xc:rgb(73,73,73)' -type TrueColor -depth 8 -compress none s.tif && "
+               "head -c 12 s.tif | tail -c 4 | grep -q IIII");
+    EXPECT_EQ(readPhotograph(folder / "s.tif").width, 16);
+}
+
+TEST(TiffPages, ThatAreAMaskStandForNoPicture) {
+    const TestFolder folder;
+    writeTiff(folder / "m.tif", "wl", {kPages.back()});
+    writeTiff(folder / "two.tif", "wl", {kPages.back(), kPages.front()});
+    for (const auto& [source, target] :
+         {std::pair("m.tif", "t.tif"), {"m.tif", "t.jpg"}, {"two.tif", "t.png"}}) {
+        PhotographReader reader(folder / source);
+        const Photograph page = reader.next();
+        EXPECT_THROW(checkTarget(page, folder / target, {}), PhotographError) << source << target;
+    }
+    EXPECT_THAT(rewrite(folder / "two.tif", folder / "t.tif"), IsEmpty());
+    std::vector<std::string> lost;
+    TiffPage page;
+    page.fields = {{TIFFTAG_IMAGEWIDTH, TIFF_SHORT, {9, 0}}, {TIFFTAG_EXIFIFD, TIFF_LONG, Bytes(4)}};
+    EXPECT_EQ(copiedFields(page, lost).size(), 1U);
+    EXPECT_THAT(lost, ElementsAre("what the tag 0x8769 leads to"));
+}
+
+TEST(TiffPages, OfSeparatePlanesKeepTheirColoursAsJpeg) {
+    const TestFolder folder;
+    folder.run("convert -size 32x32 'xc:rgb(220,60,20)' -depth 8 -interlace plane -compress none s.tif");
+    WriteOptions options;
+    options.compression = "jpeg";
+    writePhotograph(readPhotograph(folder / "s.tif"), folder / "t.tif", options);
+    std::uint32_t pixel[32 * 32] = {};
+    ASSERT_EQ(TIFFReadRGBAImage(openTiff(folder / "t.tif", "r").get(), 32, 32, pixel, 0), 1);
+    EXPECT_NEAR(TIFFGetR(pixel[500]), 220, 3);
+    EXPECT_NEAR(TIFFGetG(pixel[500]), 60, 3);
+    EXPECT_NEAR(TIFFGetB(pixel[500]), 20, 3);
+}
+
 TEST(TiffPages, ThatAreDamagedAreNamed) {
     const TestFolder folder;
     writeTiff(folder / "s.tif", "wl", {kPages[0], kPages[1], kPages[3]});
@@ -425,6 +464,29 @@ END
     EXPECT_THROW(reader.next(), PhotographError);
     EXPECT_THAT(writePhotograph(readPhotograph(folder / "beyond.tif", {.firstOnly = true}), folder / "t.png"),
                 ElementsAre(HasSubstr("the other pages")));
+}
+
+// Nobody walks along all pages for each of them: what is read of a file grows as its pages do.
+TEST(TiffPages, AreReadOnceEach) {
+    const TestFolder folder;
+    const Page page = {8, 8, 8, 1, PHOTOMETRIC_MINISBLACK};
+    const auto read = [] { // bytes by this process
+        std::ifstream file("/proc/self/io");
+        std::string name;
+        double bytes = 0;
+        file >> name >> bytes;
+        return bytes;
+    };
+    std::map<int, double> taken;
+    for (const int pages : {10, 50, 250}) {
+        writeTiff(folder / "s.tif", "wb", std::vector<Page>(static_cast<std::size_t>(pages), page));
+        const double before = read();
+        PhotographReader reader(folder / "s.tif");
+        for (int i = 0; i < pages; ++i)
+            EXPECT_EQ(reader.next().samples[1], (1 + i * 31) % 251);
+        taken[pages] = read() - before;
+    }
+    EXPECT_LT(taken[250] - taken[50], 5.5 * (taken[50] - taken[10]));
 }
 
 #if !defined(__SANITIZE_ADDRESS__) && !defined(__SANITIZE_THREAD__) // they keep what is freed

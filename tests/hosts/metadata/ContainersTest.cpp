@@ -4,7 +4,7 @@
 #include "files/PhotographWriter.h"
 #include "files/TiffFields.h"
 #include "files/TiffWriter.h"
-#include "hosts/TestFiles.h"
+#include "hosts/ChangedFiles.h"
 #include "hosts/TestPhotograph.h"
 #include "metadata/ExtendedXmp.h"
 #include "metadata/ImageResources.h"
@@ -29,23 +29,6 @@ using testing::HasSubstr;
 using testing::IsEmpty;
 using testing::Not;
 
-// Puts `piece`, given as Python, behind the first `at` bytes of a file.
-std::string insert(const char* file, int at, const std::string& piece) {
-    return "python3 -c \"import struct, zlib\nb = open('" + std::string(file) + "', 'rb').read()\n" +
-           "def chunk(n, d): return struct.pack('>I', len(d)) + n + d + struct.pack('>I', zlib.crc32(n + "
-           "d))\n" +
-           "def segment(m, d): return bytes([255, m]) + struct.pack('>H', len(d) + 2) + d\n" + "open('" +
-           file + "', 'wb').write(b[:" + std::to_string(at) + "] + " + piece + " + b[" + std::to_string(at) +
-           ":])\"";
-}
-
-constexpr int kBehindPngHeader = 33;
-constexpr int kBehindJpegStart = 2;
-
-std::vector<std::string> convert(const TestFolder& folder, const char* from, const char* to) {
-    return writePhotograph(readPhotograph(folder / from), folder / to);
-}
-
 TEST(Containers, KeepTheirOwnDensityWhateverExifSays) {
     const TestFolder folder;
     folder.run("convert $S/coffee.png -resize 64x48! -strip -units PixelsPerInch -density 300x150 s.jpg && "
@@ -56,7 +39,9 @@ TEST(Containers, KeepTheirOwnDensityWhateverExifSays) {
                "cp s.jpg e.jpg && exiftool -q -overwrite_original -Make=M -IFD0:XResolution=72 "
                "-IFD0:YResolution=72 e.jpg && vips copy s.jpg n.jpg[strip] && "
                "exiftool -q -overwrite_original -JFIF:ResolutionUnit=None -JFIF:XResolution=1 "
-               "-JFIF:YResolution=1 n.jpg");
+               "-JFIF:YResolution=1 n.jpg && cp n.jpg h.jpg && exiftool -q -overwrite_original "
+               "-IFD0:ResolutionUnit=inches -IFD0:XResolution=240 -IFD0:YResolution=240 h.jpg && "
+               "convert s.png -density 0 z.psd");
     const struct {
         const char* source;
         const char* target;
@@ -76,6 +61,9 @@ TEST(Containers, KeepTheirOwnDensityWhateverExifSays) {
         {"s.tif", "t.jpg", "JFIF:ResolutionUnit -JFIF:XResolution", "2 120"},
         {"s.tif", "t.tif", "IFD0:ResolutionUnit -IFD0:XResolution", "3 120"},
         {"n.jpg", "t.jpg", "JFIF:ResolutionUnit -JFIF:XResolution", "0 1"},
+        {"h.jpg", "t.jpg", "IFD0:ResolutionUnit -IFD0:XResolution", "2 240"}, // square pixels say no density
+        {"z.psd", "t.png", "PNG:PixelUnits -PNG:PixelsPerUnitX", ""},         // zeros say none
+        {"h.jpg", "t.tif", "IFD0:ResolutionUnit -IFD0:XResolution", "2 240"},
     };
     for (const auto& c : cases) {
         EXPECT_THAT(convert(folder, c.source, c.target), IsEmpty()) << c.source << ' ' << c.target;
@@ -85,6 +73,12 @@ TEST(Containers, KeepTheirOwnDensityWhateverExifSays) {
         folder.run(std::string("rm ") + c.target);
     }
     EXPECT_NEAR(readPhotograph(folder / "e.jpg").xResolution, 300 / 25.4, 1e-9);
+    EXPECT_NEAR(readPhotograph(folder / "h.jpg").xResolution, 240 / 25.4, 1e-9);
+    // Of the scan of a wall map, say.
+    folder.run("exiftool -q -overwrite_original -XResolution=0.005 -YResolution=0.005 s.tif");
+    EXPECT_THAT(convert(folder, "s.tif", "t.jpg"), IsEmpty());
+    EXPECT_EQ(folder.output("exiftool -s3 -IFD0:XResolution -IFD0:ResolutionUnit t.jpg | xargs"),
+              "0.005 cm\n");
     // Without a unit it is the shape of the pixels, for which not every format has a place.
     folder.run("exiftool -q -overwrite_original -JFIF:YResolution=2 n.jpg");
     EXPECT_THAT(convert(folder, "n.jpg", "t.png"), IsEmpty());

@@ -2,6 +2,7 @@
 
 #include "hosts/TestFiles.h"
 #include "metadata/JpegMetadata.h"
+#include "metadata/NotePreviews.h"
 
 #include <gmock/gmock.h>
 
@@ -131,6 +132,47 @@ TEST(ExifBlock, DropsThumbnailsThatDoNotFitOrCannotBeRead) {
     Bytes shared = smallBlock();
     shared[78] = 0;
     EXPECT_EQ(dropped(shared).size(), shared.size());
+}
+
+// At 8 the first directory, at 38 Exif's with the note at 68: its tag, a preview of 30 bytes, its end; behind
+// it a preview of 40 bytes that the note refers to. Another tag holds a JPEG too.
+TEST(ExifBlock, MakesPreviewsOfMakerNotesAnew) {
+    const auto preview = [](int width, std::size_t size) {
+        Bytes jpeg = jpegOf(width, 3, size - 6);
+        append(jpeg, 0xFFDA0002FFD9, 6, ByteOrder::Big);
+        return jpeg;
+    };
+    Bytes block = header();
+    addDirectory(block, {{0xC000, tiff::Undefined, 148}, {tiff::ExifIfd, tiff::Long, 38}}, 0);
+    store(block, 14, 30, 4, ByteOrder::Little);
+    addDirectory(block, {{tiff::MakerNote, tiff::Undefined, 68}}, 0);
+    store(block, 44, 40, 4, ByteOrder::Little);
+    block.resize(68);
+    append(block, "NOTE ");
+    append(block, preview(4, 30));
+    append(block, " END ");
+    append(block, preview(8, 40));
+    append(block, preview(4, 30));
+    const ThumbnailMaker maker = [](int width, int height, int) {
+        return Bytes(20, static_cast<std::uint8_t>(width * 16 + height));
+    };
+    const auto at = [](const Bytes& bytes, std::size_t from, std::size_t size) {
+        return copyOf(ByteView(bytes).subspan(from, size));
+    };
+    Bytes renewed = block;
+    EXPECT_TRUE(renewNotePreviews(renewed, maker, false));
+    Bytes expected = block;
+    std::fill_n(expected.begin() + 73, 30, 0);
+    std::fill_n(expected.begin() + 73, 20, 0x43);
+    std::fill_n(expected.begin() + 108, 40, 0);
+    std::fill_n(expected.begin() + 108, 20, 0x83);
+    EXPECT_EQ(renewed, expected);
+    const ThumbnailMaker large = [](int, int, int) { return Bytes(31, 1); };
+    renewed = block;
+    EXPECT_FALSE(renewNotePreviews(renewed, large, true));
+    EXPECT_THAT(at(renewed, 73, 30), testing::Each(0));
+    EXPECT_THAT(at(renewed, 108, 31), testing::Each(1));
+    EXPECT_EQ(at(renewed, 148, 30), at(block, 148, 30));
 }
 
 TEST(ExifBlock, AddsTagsWithoutMovingAnything) {
