@@ -180,7 +180,7 @@ TEST(Translations, TakesTheFirstLanguageOfTheUserThatItSpeaks) {
 TEST(Translations, KnowsEveryTextOfTheTables) {
     for (const QString& language : Translations::languages()) {
         QTranslator catalogue;
-        ASSERT_TRUE(catalogue.load(QStringLiteral(":/translations/orvela_") + language));
+        ASSERT_TRUE(catalogue.load(QStringLiteral(":/orvela/translations/orvela_") + language));
         const auto expectKnown = [&](const char* context, const char* text) {
             EXPECT_FALSE(catalogue.translate(context, text).isEmpty())
                 << qPrintable(language) << ": " << text;
