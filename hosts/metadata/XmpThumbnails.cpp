@@ -2,69 +2,112 @@
 
 #include "metadata/TagLibrary.h"
 
-#include <QXmlStreamReader>
+#include <expat.h>
 
+#include <algorithm>
+#include <climits>
+#include <memory>
+#include <new>
+#include <optional>
+#include <string_view>
+#include <type_traits>
+#include <utility>
 #include <vector>
 
 namespace orvela {
 
 namespace {
 
+constexpr std::string_view kThumbnails = "http://ns.adobe.com/xap/1.0/ Thumbnails"; // a blank parts them
+
 struct Element {
-    qsizetype begin;
-    qsizetype end;
+    std::size_t begin;
+    std::size_t end;
 };
 
-bool isThumbnails(const QXmlStreamReader& reader) {
-    return reader.name() == u"Thumbnails" && reader.namespaceUri() == u"http://ns.adobe.com/xap/1.0/";
-}
+struct ParserRelease {
+    void operator()(XML_Parser parser) const { XML_ParserFree(parser); }
+};
+using Parser = std::unique_ptr<std::remove_pointer_t<XML_Parser>, ParserRelease>;
 
-// Behind the element whose beginning was read. @return whether there are others within
-bool skip(QXmlStreamReader& reader) {
-    bool full = false;
-    for (int depth = 1; depth > 0 && !reader.atEnd();) {
-        reader.readNext();
-        full = full || reader.isStartElement();
-        depth += reader.isStartElement() ? 1 : reader.isEndElement() ? -1 : 0;
+// Finds the elements that hold thumbnails, and stops at each one's end: nothing may be thrown through the
+// parser.
+class Search {
+public:
+    explicit Search(ByteView packet) : mParser(XML_ParserCreateNS(nullptr, ' ')) {
+        if (!mParser)
+            throw std::bad_alloc();
+        XML_SetUserData(mParser.get(), this);
+        XML_SetElementHandler(mParser.get(), begin, end);
+        const int size = static_cast<int>(std::min<std::size_t>(packet.size(), INT_MAX));
+        mStatus = XML_Parse(mParser.get(), reinterpret_cast<const char*>(packet.data()), size, XML_TRUE);
     }
-    return full;
-}
 
-// The elements that hold thumbnails, as far as the packet can be read.
-std::vector<Element> thumbnailsIn(const QString& packet) {
+    /// The next one, as far as the packet can be read.
+    std::optional<Element> next() {
+        if (mStatus == XML_STATUS_ERROR && XML_GetErrorCode(mParser.get()) == XML_ERROR_NO_MEMORY)
+            throw std::bad_alloc();
+        if (mStatus != XML_STATUS_SUSPENDED)
+            return std::nullopt;
+        const Element found = mFound;
+        mStatus = XML_ResumeParser(mParser.get());
+        return found;
+    }
+
+private:
+    std::size_t place() const { return static_cast<std::size_t>(XML_GetCurrentByteIndex(mParser.get())); }
+
+    static void begin(void* search, const char* name, const char**) {
+        auto& self = *static_cast<Search*>(search);
+        if (self.mDepth == 0 && name != kThumbnails)
+            return;
+        if (self.mDepth++ == 0)
+            self.mFound.begin = self.place();
+        else
+            self.mHolds = true;
+    }
+
+    static void end(void* search, const char*) {
+        auto& self = *static_cast<Search*>(search);
+        if (self.mDepth == 0 || --self.mDepth > 0)
+            return;
+        self.mFound.end =
+            self.place() + static_cast<std::size_t>(XML_GetCurrentByteCount(self.mParser.get()));
+        if (std::exchange(self.mHolds, false))
+            XML_StopParser(self.mParser.get(), XML_TRUE);
+    }
+
+    Parser mParser;
+    XML_Status mStatus = XML_STATUS_OK;
+    Element mFound{};
+    int mDepth = 0;
+    bool mHolds = false; ///< an element without others within shows nothing
+};
+
+std::vector<Element> thumbnailsIn(ByteView packet) {
     std::vector<Element> found;
-    QXmlStreamReader reader(packet);
-    while (!reader.atEnd()) {
-        reader.readNext();
-        if (!reader.isStartElement() || !isThumbnails(reader))
-            continue;
-        const qsizetype begin = packet.lastIndexOf('<', reader.characterOffset() - 1); // no value holds one
-        if (skip(reader))
-            found.push_back({begin, reader.characterOffset()});
-    }
+    Search search(packet);
+    while (const std::optional<Element> element = search.next())
+        found.push_back(*element);
     return found;
 }
 
 } // namespace
 
 ThumbnailsOfXmp takeThumbnails(Bytes& packet) {
-    const QString before = QString::fromStdString(std::string(asText(packet)));
-    const std::vector<Element> found = thumbnailsIn(before);
+    const std::vector<Element> found = thumbnailsIn(packet);
     if (found.empty())
         return ThumbnailsOfXmp::None;
-    QString after;
-    qsizetype from = 0;
+    Bytes after;
+    std::size_t from = 0;
     for (const Element& element : found) {
-        after += before.mid(from, element.begin - from);
+        append(after, slice(packet, from, element.begin - from));
         from = element.end;
     }
-    after += before.mid(from);
-    const std::string kept = after.toStdString();
-    const ByteView bytes = asBytes(kept);
-    const bool exact = asText(packet) == before.toStdString();
-    if (!exact || !thumbnailsIn(after).empty() || !isWellFormedXmp(bytes))
+    append(after, slice(packet, from, packet.size() - from));
+    if (!thumbnailsIn(after).empty() || !isWellFormedXmp(after))
         return ThumbnailsOfXmp::Kept;
-    packet = copyOf(bytes);
+    packet = std::move(after);
     return ThumbnailsOfXmp::Taken;
 }
 
