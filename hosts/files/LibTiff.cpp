@@ -19,7 +19,7 @@ struct TiffHandle::Calls {
         } catch (...) {
             if (!self.mFailure)
                 self.mFailure = std::current_exception();
-            return -1;
+            return 0; // the library counts below zero, too, before it clears what it did not get
         }
     }
 

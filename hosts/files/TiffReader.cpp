@@ -63,6 +63,7 @@ Photograph takePage(const VipsStream& stream, const fs::path& name, VipsImage* i
         stream.check();
         throw;
     }
+    stream.check();
     return photograph;
 }
 

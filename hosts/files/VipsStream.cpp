@@ -29,7 +29,7 @@ gint64 VipsStream::read(VipsSourceCustom*, void* data, gint64 size, VipsStream* 
     } catch (...) {
         if (!self->mFailure)
             self->mFailure = std::current_exception();
-        return -1;
+        return 0; // libtiff counts below zero, too, before it clears what it did not get
     }
 }
 
