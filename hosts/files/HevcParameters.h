@@ -5,7 +5,8 @@
 namespace orvela {
 
 /// Whether the pictures of a HEVC configuration ("hvcC") may be coded without loss, by their picture
-/// parameter sets: encoders set the flag for nothing else. False where that cannot be read.
+/// parameter sets. The flag only allows it, block by block; a picture of which some blocks are lossy counts
+/// as well. False where that cannot be read.
 bool isLosslessHevc(ByteView configuration);
 
 } // namespace orvela

@@ -8,6 +8,7 @@
 #include <algorithm>
 #include <array>
 #include <cctype>
+#include <memory>
 #include <new>
 
 namespace orvela {
@@ -24,6 +25,7 @@ Bytes inflated(ByteView packed, TextRoom& room) {
     z_stream stream{};
     if (inflateInit(&stream) != Z_OK)
         throw DamagedBytes("it cannot be unpacked");
+    const std::unique_ptr<z_stream, decltype(&inflateEnd)> end(&stream, inflateEnd);
     Bytes plain;
     stream.next_in = const_cast<Bytef*>(packed.data());
     stream.avail_in = static_cast<uInt>(packed.size());
@@ -35,7 +37,6 @@ Bytes inflated(ByteView packed, TextRoom& room) {
         state = inflate(&stream, Z_NO_FLUSH);
         append(plain, ByteView(piece).first(piece.size() - stream.avail_out));
     }
-    inflateEnd(&stream);
     room.tried -= std::min(room.tried, plain.size());
     if (plain.size() > most)
         throw LongText("there is no room for it");

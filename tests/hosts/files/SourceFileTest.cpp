@@ -67,21 +67,33 @@ TEST_F(SourceFileView, TellsThatTheFileWasWrittenAnew) {
 // Of a page the samples come last, in pieces, and the library tells only that it could not read.
 TEST_F(SourceFileView, TellsThatTheFileBecameShorterWhileSamplesWereRead) {
     constexpr std::uint64_t edge = 2000;
+    constexpr std::uint64_t strips = 100;
+    constexpr std::uint64_t begin = 1200;
+    constexpr std::uint64_t bytes = edge * edge / strips;
     std::string tiff("II*\0\x8\0\0\0\x9\0", 10);
-    const auto put = [&tiff](std::uint64_t value, int bytes) {
-        for (int i = 0; i < bytes; ++i)
+    const auto put = [&tiff](std::uint64_t value, int size) {
+        for (int i = 0; i < size; ++i)
             tiff += static_cast<char>(value >> 8 * i);
     };
-    constexpr std::pair<int, std::uint64_t> fields[] = {{256, edge}, {257, edge}, {258, 8},
-                                                        {259, 1},    {262, 1},    {273, 200},
-                                                        {277, 1},    {278, edge}, {279, edge * edge}};
-    for (const auto& [tag, value] : fields) {
-        put(static_cast<std::uint64_t>(tag), 2);
+    const auto field = [&](std::uint64_t tag, std::uint64_t count, std::uint64_t value) {
+        put(tag, 2);
         put(4, 2);
-        put(1, 4);
+        put(count, 4);
         put(value, 4);
-    }
-    tiff.resize(200 + edge * edge);
+    };
+    for (const auto& [tag, value] :
+         {std::pair<std::uint64_t, std::uint64_t>{256, edge}, {257, edge}, {258, 8}, {259, 1}, {262, 1}})
+        field(tag, 1, value);
+    field(273, strips, 200);
+    field(277, 1, 1);
+    field(278, 1, edge / strips);
+    field(279, strips, 600);
+    tiff.resize(200);
+    for (std::uint64_t strip = 0; strip < strips; ++strip)
+        put(begin + strip * bytes, 4);
+    for (std::uint64_t strip = 0; strip < strips; ++strip)
+        put(bytes, 4);
+    tiff.resize(begin + edge * edge);
     mFolder.put("s.tif", tiff);
     SourceFile file(path());
     const TiffFile parsed(file);
