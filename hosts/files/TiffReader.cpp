@@ -3,9 +3,8 @@
 #include "files/JpegQuality.h"
 #include "files/Refusal.h"
 #include "files/TiffDeclaration.h"
+#include "files/TiffDecoder.h"
 #include "files/TiffStorage.h"
-#include "files/VipsPhotograph.h"
-#include "files/VipsStream.h"
 #include "metadata/MetadataReader.h"
 
 #include <tiff.h>
@@ -54,36 +53,9 @@ Photograph decodeMask(const TiffFile& tiff, TiffPage& page, int index) {
     return photograph;
 }
 
-// The library tells what stopped the stream in its own words, and lazily: while samples are taken.
-Photograph takePage(const VipsStream& stream, const fs::path& name, VipsImage* image) {
-    Photograph photograph = describeImage(name, image);
-    try {
-        takeSamples(photograph, name, image);
-    } catch (...) {
-        stream.check();
-        throw;
-    }
-    stream.check();
-    return photograph;
-}
-
-Photograph decodeSamples(VipsStream& stream, const fs::path& name) {
-    startVips();
-    vips_error_clear();
-    VipsImage* opened = nullptr;
-    vips_tiffload_source(stream.source(), &opened, "access", VIPS_ACCESS_SEQUENTIAL, "fail_on",
-                         VIPS_FAIL_ON_TRUNCATED, nullptr);
-    const VipsHandle image(opened);
-    stream.check();
-    if (!image)
-        refuseUnread(name, takeVipsError());
-    return takePage(stream, name, image.get());
-}
-
 Photograph decodeWithVips(const TiffFile& tiff, const TiffPage& page, int index) {
     TiffPageStream alone = tiff.alone(index);
-    VipsStream stream(alone);
-    Photograph photograph = decodeSamples(stream, tiff.pageName(index));
+    Photograph photograph = decodeTiff(alone, tiff.pageName(index));
     photograph.extraChannel =
         hasAlpha(photograph.model) &&
         page.number(TIFFTAG_EXTRASAMPLES, EXTRASAMPLE_UNSPECIFIED) == EXTRASAMPLE_UNSPECIFIED;

@@ -1,11 +1,11 @@
 #include "files/SourceFile.h"
 
 #include "files/Photograph.h"
-#include "files/TiffFile.h"
-#include "files/TiffReader.h"
+#include "files/TiffDecoder.h"
 #include "hosts/TestFiles.h"
 
-#include <gmock/gmock.h>
+#include <algorithm>
+#include <csignal>
 
 using namespace orvela;
 
@@ -64,46 +64,42 @@ TEST_F(SourceFileView, TellsThatTheFileWasWrittenAnew) {
     EXPECT_THROW(file.look([](ByteView) { return 0; }), PhotographError); // the view stays without its bytes
 }
 
-// Of a page the samples come last, in pieces, and the library tells only that it could not read.
-TEST_F(SourceFileView, TellsThatTheFileBecameShorterWhileSamplesWereRead) {
-    constexpr std::uint64_t edge = 2000;
-    constexpr std::uint64_t strips = 100;
-    constexpr std::uint64_t begin = 1200;
-    constexpr std::uint64_t bytes = edge * edge / strips;
-    std::string tiff("II*\0\x8\0\0\0\x9\0", 10);
-    const auto put = [&tiff](std::uint64_t value, int size) {
-        for (int i = 0; i < size; ++i)
-            tiff += static_cast<char>(value >> 8 * i);
-    };
-    const auto field = [&](std::uint64_t tag, std::uint64_t count, std::uint64_t value) {
-        put(tag, 2);
-        put(4, 2);
-        put(count, 4);
-        put(value, 4);
-    };
-    for (const auto& [tag, value] :
-         {std::pair<std::uint64_t, std::uint64_t>{256, edge}, {257, edge}, {258, 8}, {259, 1}, {262, 1}})
-        field(tag, 1, value);
-    field(273, strips, 200);
-    field(277, 1, 1);
-    field(278, 1, edge / strips);
-    field(279, strips, 600);
-    tiff.resize(200);
-    for (std::uint64_t strip = 0; strip < strips; ++strip)
-        put(begin + strip * bytes, 4);
-    for (std::uint64_t strip = 0; strip < strips; ++strip)
-        put(bytes, 4);
-    tiff.resize(begin + edge * edge);
-    mFolder.put("s.tif", tiff);
-    SourceFile file(path());
-    const TiffFile parsed(file);
-    fs::resize_file(path(), 1'000'000);
-    try {
-        readTiffPage(file, parsed, 0, {});
-        FAIL() << "There were not enough bytes.";
-    } catch (const PhotographError& error) {
-        EXPECT_THAT(error.what(), testing::HasSubstr("became shorter while it was read"));
+// Its n-th reading fails.
+class FailingTiff : public TiffStream {
+public:
+    FailingTiff(std::string bytes, int failing) : mBytes(std::move(bytes)), mLeft(failing) {}
+
+    std::size_t read(std::uint64_t at, std::span<std::uint8_t> to) override {
+        if (--mLeft == 0)
+            throw std::runtime_error("the disk failed");
+        const std::size_t first = std::min<std::size_t>(at, mBytes.size());
+        return mBytes.copy(reinterpret_cast<char*>(to.data()), to.size(), first);
     }
+    void write(std::uint64_t, ByteView) override {}
+    std::uint64_t size() const override { return mBytes.size(); }
+
+private:
+    std::string mBytes;
+    int mLeft;
+};
+
+// The library tells only that it could not read; of a page the samples come last, in pieces.
+TEST(TiffStreamOfVips, TellsWhatStoppedItAtWhicheverRead) {
+    const TestFolder folder;
+    folder.run("vips tiffsave $S/rocket.jpg s.tif --compression lzw");
+    const std::string bytes = folder.text("s.tif");
+    int failing = 1;
+    for (std::string told = "the disk failed"; told != "read"; ++failing) {
+        FailingTiff stream(bytes, failing);
+        try {
+            EXPECT_EQ(decodeTiff(stream, "s.tif").samples.size() % 3, 0u);
+            told = "read";
+        } catch (const std::exception& error) {
+            told = error.what();
+        }
+        ASSERT_TRUE(told == "the disk failed" || told == "read") << failing << ": " << told;
+    }
+    EXPECT_GT(failing, 20); // most of them while samples were taken
 }
 
 // Of the cause that parsing tells and that of the file, the latter.
