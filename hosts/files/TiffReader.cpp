@@ -13,8 +13,6 @@ namespace orvela {
 
 namespace {
 
-namespace fs = std::filesystem;
-
 // libvips takes YCbCr samples for RGB, except those of JPEG compression.
 bool isPlainYcbcr(const TiffPage& page) {
     return page.number(TIFFTAG_PHOTOMETRIC, PHOTOMETRIC_MINISBLACK) == PHOTOMETRIC_YCBCR &&
