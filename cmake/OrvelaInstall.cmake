@@ -3,10 +3,15 @@
 
 include(GNUInstallDirs)
 
-# orvela_install(FOLDER FILE [NAME]) or (FOLDER TARGET PROGRAM): installs it into a folder below the prefix. Folders
-# that are not there yet are recorded, so that uninstalling knows which were made.
-function(orvela_install folder file)
+# orvela_record_folders(FOLDER): records it and the folders around it, below the prefix, where they are not there yet,
+# so that uninstalling knows which were made.
+function(orvela_record_folders folder)
     install(CODE "set(folder \"${folder}\")\ninclude(\"${PROJECT_SOURCE_DIR}/cmake/RecordFolders.cmake\")")
+endfunction()
+
+# orvela_install(FOLDER FILE [NAME]) or (FOLDER TARGET PROGRAM): installs it into a folder below the prefix.
+function(orvela_install folder file)
+    orvela_record_folders(${folder})
     if(file STREQUAL TARGET)
         install(TARGETS ${ARGV2} RUNTIME DESTINATION ${folder})
     elseif(ARGC GREATER 2)

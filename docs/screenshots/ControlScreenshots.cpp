@@ -2,8 +2,8 @@
 #include "GUI/Controls/CColorPickerPopup.h"
 #include "GUI/Controls/COrvelaSliderBlockImpl.h"
 #include "GUI/Controls/COrvelaStatusIndicator.h"
-#include "GUI/Controls/CSignaledGraphicsView.h"
-#include "GUI/Controls/PreviewScene.h"
+#include "GUI/Preview/CSignaledGraphicsView.h"
+#include "GUI/Preview/PreviewScene.h"
 #include "Shots.h"
 #include "Utility/CARGBPlane.h"
 
@@ -61,6 +61,12 @@ Widget colorPickers() {
         layout->addWidget(picker);
     }
     return frame;
+}
+
+Widget colorField() {
+    auto field = std::make_unique<CColorPickerPopup>();
+    field->open({}, QColor(200, 128, 0), {});
+    return field;
 }
 
 Widget statusIndicators() {
@@ -137,7 +143,7 @@ std::vector<Shot> controlShots(CARGBPlane& plane) {
     std::vector<Shot> shots;
     shots.emplace_back("slider-blocks", sliderBlocks());
     shots.emplace_back("color-pickers", colorPickers());
-    shots.emplace_back("color-field", std::make_unique<CColorPickerPopup>());
+    shots.emplace_back("color-field", colorField());
     shots.emplace_back("status-indicators", statusIndicators());
     shots.emplace_back("preview", preview(plane));
     shots.emplace_back("icons", icons());

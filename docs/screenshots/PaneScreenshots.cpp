@@ -9,19 +9,9 @@ using namespace orvela;
 
 namespace {
 
-// The window of a pane, as far as the pane sees it.
-class Frame : public QWidget {
-    Q_OBJECT
-
-public Q_SLOTS:
-    void onMy_slider_valueChanged(double) {}
-    void onMy_slider_stateChanged(bool) {}
-    void onMy_colorPicker_colorChanged(QColor) {}
-};
-
 template <class P>
 std::pair<std::unique_ptr<QWidget>, P*> framed(EGUIMode mode) {
-    auto frame = std::make_unique<Frame>();
+    auto frame = std::make_unique<QWidget>();
     auto* pane = new P(frame.get(), mode);
     auto* layout = new QVBoxLayout(frame.get());
     layout->setContentsMargins(0, 0, 0, 0);
@@ -39,7 +29,16 @@ std::unique_ptr<QWidget> advanced(bool extended, int tab) {
     pane->sldrTemperature->setEnabled(true);
     pane->sldrTemperature->setValue(1000);
     pane->colrPickAutoColor->setColor(QColor(240, 160, 60));
+    pane->wgtSettings->layout()->activate();
+    const int hidden = pane->wgtSettings->sizeHint().height() - pane->scrSettings->sizeHint().height();
+    frame->resize(frame->sizeHint() + QSize(0, hidden)); // the screen of the offscreen platform is low
     return std::move(frame);
+}
+
+std::unique_ptr<QWidget> running() {
+    auto shown = advanced(false, 1);
+    shown->setEnabled(false);
+    return shown;
 }
 
 std::unique_ptr<QWidget> finalTouch(int tab, int channel) {
@@ -71,6 +70,7 @@ std::unique_ptr<QWidget> generic(EGUIMode mode, double position) {
 std::vector<Shot> paneShots() {
     std::vector<Shot> shots;
     shots.emplace_back("advanced-collapsed", advanced(false, 0));
+    shots.emplace_back("advanced-running", running());
     shots.emplace_back("advanced-perceptual", advanced(true, 0));
     shots.emplace_back("advanced-absolute", advanced(true, 1));
     shots.emplace_back("final-touch-perceptual-red", finalTouch(0, 0));
@@ -83,5 +83,3 @@ std::vector<Shot> paneShots() {
     shots.emplace_back("color-filter", generic(Mode_ColorFilter, 400));
     return shots;
 }
-
-#include "PaneScreenshots.moc"

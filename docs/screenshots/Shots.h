@@ -17,3 +17,6 @@ std::vector<Shot> controlShots(CARGBPlane& plane);
 
 /// Every pane: folded and extended, each tab, the modes that differ.
 std::vector<Shot> paneShots();
+
+/// The small windows.
+std::vector<Shot> windowShots();

@@ -1,6 +1,7 @@
 #include "command/PresetFiles.h"
 
 #include "Settings/FactoryPresets.h"
+#include "Settings/PaneTable.h"
 #include "Settings/PresetConversion.h"
 #include "Settings/SettingsStore.h"
 #include "files/SourceFile.h"
@@ -62,7 +63,10 @@ std::optional<CSliderParams> stored(EGUIMode mode, const QString& name) {
         content = FactoryPresets::contentOf(name);
     if (!content)
         return std::nullopt;
-    return PresetConversion::paramsOf(mode, *content);
+    CSliderParams settings = PresetConversion::paramsOf(mode, *content);
+    if (mode != Mode_FinalTouch) // no preset of another pane holds it
+        PaneTable::startFinalTouch(settings);
+    return settings;
 }
 
 std::vector<std::string> names(EGUIMode mode) {

@@ -96,13 +96,6 @@ void applyField(CSliderParams& sliders, const std::string& text) {
     sliders.*enabled = TextValues::onOrOff("--set " + name, given.substr(comma + 1));
 }
 
-// Puts the final-touch sliders to where their pane starts: a midtone filter that one of them switches on
-// reads the others' positions too.
-void startFinalTouch(CSliderParams& sliders) {
-    for (const PaneSlider& each : PaneTable::sliders(Mode_FinalTouch))
-        sliders.*each.slider.value = static_cast<float>(each.initial);
-}
-
 void applyFinalTouch(CSliderParams& sliders, const std::string& text) {
     const std::vector<NamedSlider> known = ModeNames::finalTouchSliders();
     for (const std::string& part : TextValues::split(text, ',')) {
@@ -183,7 +176,7 @@ RunSettings settle(const SettingOptions& options) {
     RunSettings run;
     run.params = CUserParamsPhotoshop(mode.mode);
     CSliderParams sliders = run.params.mSliderParams;
-    startFinalTouch(sliders);
+    PaneTable::startFinalTouch(sliders);
     if (options.preset)
         applyPreset(run, sliders, mode, *options.preset);
     if (options.value)

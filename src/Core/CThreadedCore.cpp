@@ -1,6 +1,7 @@
 #include "Core/CThreadedCore.h"
 
 #include "Core/Snapshot.h"
+#include "Filters/MeasurementTape.h"
 #include "Settings/PresetTree.h"
 #include "Settings/SettingsStore.h"
 #include "Utility/CGenericEx.h"
@@ -17,6 +18,10 @@ namespace {
 // be felt at once, seldom enough to cost a pass nothing.
 constexpr qint64 kServiceMilliseconds = 8;
 
+bool isMeasurement(const PipelineTask& task, const TaskBase& made) {
+    return task.kind == TaskKind::Histogram || made.onlyMeasures();
+}
+
 } // namespace
 
 CThreadedCore::CThreadedCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* parent)
@@ -31,24 +36,29 @@ void CThreadedCore::setParams(const CUserParamsPhotoshop& params) {
 void CThreadedCore::run() {
     const LogDepth ownDepth;
     mContext.dumpsPictures =
+        !mContext.playsTape &&
         openSettings().value(PresetTree::guiKey(QStringLiteral("dumpImageAfterFile"))).toInt() != 0;
     mTotalSteps = 0;
     mCurrentStep = 0;
     mRunThread = QThread::currentThread();
     mSinceService.start();
     mParams.mProgressCallback = [this](int percent) { reportProgress(percent); };
+    mContext.onSilentRow = [this] { serveEvents(); };
     mLastProcessingDone = false;
     mReports.clear();
+    mTaskNumber = 0;
     mFailure = {};
+    if (mContext.tape && !mContext.playsTape)
+        *mContext.tape = MeasurementTape(mInPlane->pixelCount());
 
-    announce(0, 1, "Duplicating Input Plane", "Copying the picture");
+    announce(0, 1, "Duplicating Input Plane", QT_TRANSLATE_NOOP("PipelineTable", "Copying the picture"));
     emitPercentDone(0);
     if (runPipeline()) {
-        announce(1, 1, "All Done", "Done");
+        announce(1, 1, "All Done", QT_TRANSLATE_NOOP("PipelineTable", "Done"));
         emitPercentDone(100);
         mLastProcessingDone = true;
     } else {
-        announce(0, 1, "Failed", "Failed");
+        announce(0, 1, "Failed", QT_TRANSLATE_NOOP("PipelineTable", "Failed"));
         emitPercentDone(0);
     }
 }
@@ -85,6 +95,16 @@ std::unique_ptr<CARGBPlane> CThreadedCore::snapshot(const QRect& area, int reduc
     return takeSnapshot(*mInPlane, area, reduction);
 }
 
+void CThreadedCore::recordTape(MeasurementTape* tape) {
+    mContext.tape = tape;
+    mContext.playsTape = false;
+}
+
+void CThreadedCore::playTape(MeasurementTape& tape) {
+    mContext.tape = &tape;
+    mContext.playsTape = true;
+}
+
 void CThreadedCore::stop() {
     mParams.mCancelRequested = true;
     mSemaphore.release();
@@ -118,36 +138,55 @@ void CThreadedCore::announce(int step, int total, const char* name, const char* 
         QCoreApplication::processEvents();
 }
 
-void CThreadedCore::runTask(const PipelineTask& task) {
+void CThreadedCore::runTask(const PipelineTask& task, const char* stepTitle) {
+    if (mContext.tape)
+        mContext.tape->moveTo(mTaskNumber++, task.name);
     if (!task.condition || task.condition(mParams)) {
         QElapsedTimer timer;
         timer.start();
         const std::unique_ptr<TaskBase> made = task.make(mContext, &mParams, mInPlane, mOutPlane);
         const auto report = [&] {
-            mReports.push_back({task.name, task.kind, made->outcome(), made->failure(),
+            mReports.push_back({task.name, stepTitle, task.kind, made->outcome(), made->failure(),
                                 static_cast<double>(timer.nsecsElapsed()) / 1e6});
             if (mObserver)
                 mObserver(mReports.back());
         };
         try {
-            made->Apply();
+            if (!playsInstead(task, *made))
+                made->Apply();
         } catch (...) { // an analyzer's failure ends the run
             report();
             throw;
         }
+        record(task, *made);
         report();
     }
     if (task.afterwards)
         task.afterwards(mParams);
 }
 
+bool CThreadedCore::playsInstead(const PipelineTask& task, const TaskBase& made) {
+    return mContext.playsTape && isMeasurement(task, made) && mContext.tape->play(mParams);
+}
+
+void CThreadedCore::record(const PipelineTask& task, const TaskBase& made) {
+    if (mContext.tape && !mContext.playsTape && isMeasurement(task, made))
+        mContext.tape->record(mParams);
+}
+
 // Called for every row, from any thread. Only the thread of the run processes events and emits; the others
 // leave their percentage for it.
 void CThreadedCore::reportProgress(int percent) {
     mReportedPercent.store(percent, std::memory_order_relaxed);
+    if (serveEvents())
+        emitPercentDone(mReportedPercent.load(std::memory_order_relaxed));
+}
+
+// Now and then only, so that rows cost no more for it.
+bool CThreadedCore::serveEvents() {
     if (QThread::currentThread() != mRunThread || !mSinceService.hasExpired(kServiceMilliseconds))
-        return;
+        return false;
     QCoreApplication::processEvents();
-    emitPercentDone(mReportedPercent.load(std::memory_order_relaxed));
     mSinceService.start();
+    return true;
 }

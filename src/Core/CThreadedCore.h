@@ -20,7 +20,8 @@ namespace orvela {
 
 /// What one task of a run did.
 struct TaskReport {
-    const char* name; ///< class name of the task
+    const char* name;      ///< class name of the task
+    const char* stepTitle; ///< of its step, for people
     TaskKind kind;
     TaskOutcome outcome;
     Failure failure;
@@ -51,11 +52,17 @@ public:
     /// proxy.
     void setProxy(const CARGBPlaneProxy* proxy) { mContext.proxy = proxy; }
 
+    /// Has the next runs record what they measure, each over what was recorded before; null ends it.
+    void recordTape(orvela::MeasurementTape* tape);
+    /// Makes the next runs drafts: the planes hold a part or a reduced copy of the picture that the tape was
+    /// recorded of.
+    void playTape(orvela::MeasurementTape& tape);
+
     /// Runs the pipeline; the result is told by lastProcessingDone() and the last announcement, "All Done" or
     /// "Failed". A stopped run walks on through its announcements and ends with "All Done".
     void run();
 
-    /// Asks the run to end: rows not yet begun are not worked on. From any thread.
+    /// Asks the run to end: no task that tests it begins another row. From any thread.
     void stop();
 
     /// What the step that was announced last does, in words for people.
@@ -102,7 +109,7 @@ protected:
     void announce(int step, int total, const char* name, const char* title);
 
     /// Makes, applies and destroys one task.
-    void runTask(const orvela::PipelineTask& task);
+    void runTask(const orvela::PipelineTask& task, const char* stepTitle);
 
     CARGBPlane* mInPlane;
     CARGBPlane* mOutPlane;
@@ -114,6 +121,9 @@ private:
     bool runPipeline();
     bool guarded(const std::function<bool()>& action);
     void reportProgress(int percent);
+    bool serveEvents();
+    bool playsInstead(const orvela::PipelineTask& task, const TaskBase& made);
+    void record(const orvela::PipelineTask& task, const TaskBase& made);
 
     QSemaphore mSemaphore;
     const char* mStepTitle = "";
@@ -123,6 +133,7 @@ private:
     QThread* mRunThread = nullptr;
     QElapsedTimer mSinceService;
     orvela::RunContext mContext;
+    int mTaskNumber = 0;
     std::function<void(const orvela::TaskReport&)> mObserver;
     std::vector<orvela::TaskReport> mReports;
     orvela::Failure mFailure;

@@ -29,7 +29,7 @@ bool CThreadedCore_FinalTouch::doRun() {
         mInPlane->copyFrom(*mOriginalPlane);
         mOutPlane->copyFrom(*mOriginalPlane);
         for (const PipelineTask& task : PipelineTable::finalTouchTasks())
-            runTask(task);
+            runTask(task, QT_TRANSLATE_NOOP("PipelineTable", "Final touch"));
     } catch (...) {
         Log::scopeExit(LogLevel::Error, "Unable to complete the 16th filters block.");
         std::throw_with_nested(

@@ -27,7 +27,7 @@ bool CThreadedCore_Orvela::doRun() {
         if (!step.announced || step.announced(mParams))
             announce(mCurrentStep++, mTotalSteps, step.label, step.title);
         for (const PipelineTask& task : step.tasks)
-            runTask(task);
+            runTask(task, step.title);
         if (step.logAfter)
             Log::log(LogLevel::Debug, "%s", step.logAfter);
     }

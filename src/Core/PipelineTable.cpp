@@ -45,6 +45,8 @@
 #include "SmartAnalyzers/CSmartAnalyzer_Perceptual_Level_Right.h"
 #include "Utility/Logger.h"
 
+#include <QtGlobal>
+
 #include <algorithm>
 #include <cstring>
 
@@ -108,58 +110,122 @@ void takeInputLuma(CUserParams& params) {
 
 constexpr char kFinished[] = "  finished";
 
+// The main pipeline: what measures, brings out texture, and works on colour and noise.
+std::vector<PipelineStep> stepsToSpots() {
+    return {
+        {"Sharp_Smart", QT_TRANSLATE_NOOP("PipelineTable", "Measuring detail"), {FILTER(Sharp_Smart)}},
+        {"Histogram (00)",
+         QT_TRANSLATE_NOOP("PipelineTable", "Measuring"),
+         {HISTOGRAM(CHistogram0)},
+         nullptr,
+         "  CHistogram00",
+         kFinished},
+        {"Histogram (0)",
+         QT_TRANSLATE_NOOP("PipelineTable", "Measuring"),
+         {HISTOGRAM(CHistogram0)},
+         nullptr,
+         "  CHistogram0",
+         kFinished},
+        {"Auto_Gamma",
+         QT_TRANSLATE_NOOP("PipelineTable", "Automatic gamma, first pass"),
+         {FILTER(Auto_Gamma)}},
+        {"Histogram (0)",
+         QT_TRANSLATE_NOOP("PipelineTable", "Measuring"),
+         {HISTOGRAM(CHistogram0)},
+         nullptr,
+         "  CHistogram0",
+         kFinished},
+        {"Orvela (Iteration Phase I)",
+         QT_TRANSLATE_NOOP("PipelineTable", "Illumination, first pass"),
+         {FILTER(COrv_I_Iter)}},
+        {"Orvela (Iteration Phase II)",
+         QT_TRANSLATE_NOOP("PipelineTable", "Illumination, second pass"),
+         {FILTER(COrv_II_Iter)}},
+        {"Histo_I", QT_TRANSLATE_NOOP("PipelineTable", "Measuring"), {HISTOGRAM(CHistogram_Luma_after_Orv)}},
+        {"Auto_Contrast_I",
+         QT_TRANSLATE_NOOP("PipelineTable", "Contrast, first pass"),
+         {FILTER(CAuto_Contrast_I)}},
+        {"Super_ORV_II", QT_TRANSLATE_NOOP("PipelineTable", "Brightness limit"), {FILTER(Super_ORV_II)}},
+        {"Smart Blur",
+         QT_TRANSLATE_NOOP("PipelineTable", "Smart blur"),
+         {FILTER(Super_ORV), HISTOGRAM(CHistogram_IV)}},
+        {"Auto_Color",
+         QT_TRANSLATE_NOOP("PipelineTable", "Automatic colour"),
+         {followed(FILTER(CAuto_Color), logAutoContrast)}},
+        {"Clarity",
+         QT_TRANSLATE_NOOP("PipelineTable", "Clarity"),
+         {FILTER(CClarity), HISTOGRAM(CHistogram_VII)}},
+        {"NEW Auto_Contrast",
+         QT_TRANSLATE_NOOP("PipelineTable", "Contrast, second pass"),
+         {FILTER(Auto_Contrast)}},
+        {"Saturation", QT_TRANSLATE_NOOP("PipelineTable", "Saturation"), {FILTER(Saturation)}},
+        {"Noise", QT_TRANSLATE_NOOP("PipelineTable", "Noise"), {followed(FILTER(CBilinear), testDarkness)}},
+        {"Black & White spot",
+         QT_TRANSLATE_NOOP("PipelineTable", "Black and white spots"),
+         {FILTER(CMedian_Salt_Pepper)},
+         removesSpots},
+    };
+}
+
+// What follows: tones, levels and light.
+std::vector<PipelineStep> stepsFromGamma() {
+    return {
+        {"Gamma", QT_TRANSLATE_NOOP("PipelineTable", "Gamma"), {FILTER(CGamma_Simple_Filter)}},
+        {"Contrast", QT_TRANSLATE_NOOP("PipelineTable", "Contrast"), {FILTER(CContrast_Simple_Filter)}},
+        {"Moire", QT_TRANSLATE_NOOP("PipelineTable", "Moire"), {FILTER(CMoire), FILTER(CAverage)}},
+        {"Temperature", QT_TRANSLATE_NOOP("PipelineTable", "Temperature"), {FILTER(CTemperature)}},
+        {"Color",
+         QT_TRANSLATE_NOOP("PipelineTable", "Colour filter"),
+         {FILTER(CColor), HISTOGRAM(CHistogram_VII)}},
+        {"Dark_Level", QT_TRANSLATE_NOOP("PipelineTable", "Dark level"), {FILTER(CLevel_Dark_Left)}},
+        {"Middle_Level", QT_TRANSLATE_NOOP("PipelineTable", "Middle level"), {FILTER(CLevel_Middle)}},
+        {"Light_Level",
+         QT_TRANSLATE_NOOP("PipelineTable", "Light level"),
+         {FILTER(CLevel_Light_Right), HISTOGRAM(CHistogram_VII),
+          ANALYZER(CSmartAnalyzer_Perceptual_Contrast_Brightness)}},
+        {" Contrast_Brightness_Perceptual",
+         QT_TRANSLATE_NOOP("PipelineTable", "Brightness and contrast"),
+         {FILTER(CContrast_Brightness_Perceptual), HISTOGRAM(CHistogram_VIII),
+          ANALYZER(CSmartAnalyzer_Digital_Flash), FILTER_WHEN(CDigital_Flash_Perceptual, usesFlash)}},
+        {"Histogram XI", QT_TRANSLATE_NOOP("PipelineTable", "Measuring"), {HISTOGRAM(CHistogram_III)}},
+        {"cAuto_Contrast_TEST",
+         QT_TRANSLATE_NOOP("PipelineTable", "Contrast, third pass"),
+         {FILTER(CAuto_Contrast_TEST)}},
+        {"Histogram III",
+         QT_TRANSLATE_NOOP("PipelineTable", "Measuring levels"),
+         {HISTOGRAM(CHistogram_III), ANALYZER(CSmartAnalyzer_Perceptual_Level_Dark),
+          ANALYZER(CSmartAnalyzer_Perceptual_Level_Middle), ANALYZER(CSmartAnalyzer_Perceptual_Level_Right)}},
+        {"Gamma_Perceptual", QT_TRANSLATE_NOOP("PipelineTable", "Smart gamma"), {FILTER(CGamma_Perceptual)}},
+        {"Level_Dark_Perceptual",
+         QT_TRANSLATE_NOOP("PipelineTable", "Smart dark level"),
+         {FILTER(CLevel_Dark_Left_Perceptual)}},
+        {"Level_Middle_Perceptual",
+         QT_TRANSLATE_NOOP("PipelineTable", "Smart middle level"),
+         {FILTER(CLevel_Middle_Perceptual)}},
+        {"Level_Light_Perceptual",
+         QT_TRANSLATE_NOOP("PipelineTable", "Smart light level"),
+         {FILTER(CLevel_Light_Right_Perceptual)}},
+        {"Histogram XI", QT_TRANSLATE_NOOP("PipelineTable", "Measuring"), {HISTOGRAM(CHistogram_III)}},
+        {"cAuto_Contrast_TEST II",
+         QT_TRANSLATE_NOOP("PipelineTable", "Contrast, fourth pass"),
+         {FILTER(CAuto_Contrast_TEST_II)}},
+        {"Auto_Gamma",
+         QT_TRANSLATE_NOOP("PipelineTable", "Automatic gamma, second pass"),
+         {FILTER(Auto_Gamma)}},
+    };
+}
+
 } // namespace
 
 namespace PipelineTable {
 
 std::span<const PipelineStep> mainSteps() {
-    static const std::vector<PipelineStep> steps = {
-        {"Sharp_Smart", "Measuring detail", {FILTER(Sharp_Smart)}},
-        {"Histogram (00)", "Measuring", {HISTOGRAM(CHistogram0)}, nullptr, "  CHistogram00", kFinished},
-        {"Histogram (0)", "Measuring", {HISTOGRAM(CHistogram0)}, nullptr, "  CHistogram0", kFinished},
-        {"Auto_Gamma", "Automatic gamma, first pass", {FILTER(Auto_Gamma)}},
-        {"Histogram (0)", "Measuring", {HISTOGRAM(CHistogram0)}, nullptr, "  CHistogram0", kFinished},
-        {"Orvela (Iteration Phase I)", "Illumination, first pass", {FILTER(COrv_I_Iter)}},
-        {"Orvela (Iteration Phase II)", "Illumination, second pass", {FILTER(COrv_II_Iter)}},
-        {"Histo_I", "Measuring", {HISTOGRAM(CHistogram_Luma_after_Orv)}},
-        {"Auto_Contrast_I", "Contrast, first pass", {FILTER(CAuto_Contrast_I)}},
-        {"Super_ORV_II", "Brightness limit", {FILTER(Super_ORV_II)}},
-        {"Smart Blur", "Smart blur", {FILTER(Super_ORV), HISTOGRAM(CHistogram_IV)}},
-        {"Auto_Color", "Automatic colour", {followed(FILTER(CAuto_Color), logAutoContrast)}},
-        {"Clarity", "Clarity", {FILTER(CClarity), HISTOGRAM(CHistogram_VII)}},
-        {"NEW Auto_Contrast", "Contrast, second pass", {FILTER(Auto_Contrast)}},
-        {"Saturation", "Saturation", {FILTER(Saturation)}},
-        {"Noise", "Noise", {followed(FILTER(CBilinear), testDarkness)}},
-        {"Black & White spot", "Black and white spots", {FILTER(CMedian_Salt_Pepper)}, removesSpots},
-        {"Gamma", "Gamma", {FILTER(CGamma_Simple_Filter)}},
-        {"Contrast", "Contrast", {FILTER(CContrast_Simple_Filter)}},
-        {"Moire", "Moire", {FILTER(CMoire), FILTER(CAverage)}},
-        {"Temperature", "Temperature", {FILTER(CTemperature)}},
-        {"Color", "Colour filter", {FILTER(CColor), HISTOGRAM(CHistogram_VII)}},
-        {"Dark_Level", "Dark level", {FILTER(CLevel_Dark_Left)}},
-        {"Middle_Level", "Middle level", {FILTER(CLevel_Middle)}},
-        {"Light_Level",
-         "Light level",
-         {FILTER(CLevel_Light_Right), HISTOGRAM(CHistogram_VII),
-          ANALYZER(CSmartAnalyzer_Perceptual_Contrast_Brightness)}},
-        {" Contrast_Brightness_Perceptual",
-         "Brightness and contrast",
-         {FILTER(CContrast_Brightness_Perceptual), HISTOGRAM(CHistogram_VIII),
-          ANALYZER(CSmartAnalyzer_Digital_Flash), FILTER_WHEN(CDigital_Flash_Perceptual, usesFlash)}},
-        {"Histogram XI", "Measuring", {HISTOGRAM(CHistogram_III)}},
-        {"cAuto_Contrast_TEST", "Contrast, third pass", {FILTER(CAuto_Contrast_TEST)}},
-        {"Histogram III",
-         "Measuring levels",
-         {HISTOGRAM(CHistogram_III), ANALYZER(CSmartAnalyzer_Perceptual_Level_Dark),
-          ANALYZER(CSmartAnalyzer_Perceptual_Level_Middle), ANALYZER(CSmartAnalyzer_Perceptual_Level_Right)}},
-        {"Gamma_Perceptual", "Smart gamma", {FILTER(CGamma_Perceptual)}},
-        {"Level_Dark_Perceptual", "Smart dark level", {FILTER(CLevel_Dark_Left_Perceptual)}},
-        {"Level_Middle_Perceptual", "Smart middle level", {FILTER(CLevel_Middle_Perceptual)}},
-        {"Level_Light_Perceptual", "Smart light level", {FILTER(CLevel_Light_Right_Perceptual)}},
-        {"Histogram XI", "Measuring", {HISTOGRAM(CHistogram_III)}},
-        {"cAuto_Contrast_TEST II", "Contrast, fourth pass", {FILTER(CAuto_Contrast_TEST_II)}},
-        {"Auto_Gamma", "Automatic gamma, second pass", {FILTER(Auto_Gamma)}},
-    };
+    static const std::vector<PipelineStep> steps = [] {
+        std::vector<PipelineStep> all = stepsToSpots();
+        const std::vector<PipelineStep> rest = stepsFromGamma();
+        all.insert(all.end(), rest.begin(), rest.end());
+        return all;
+    }();
     return steps;
 }
 

@@ -23,7 +23,7 @@ struct PipelineTask {
 /// One announced step and the tasks run under it, in order.
 struct PipelineStep {
     const char* label; ///< as announced and logged
-    const char* title; ///< the same for people
+    const char* title; ///< the same for people, marked for translation in the context "PipelineTable"
     std::vector<PipelineTask> tasks;
     bool (*announced)(const CUserParams& params) = nullptr; ///< null: always
     const char* logBefore = nullptr;                        ///< debug line before the announcement

@@ -42,7 +42,7 @@ void Auto_Contrast::setUp() {
     Log::log(LogLevel::Debug, "IN 2 AUTOCONTRAST MODE DETECTED");
     Log::log(LogLevel::Debug, "Bicromic:%d", mParams->Bicromic);
     mParams->Shift_Level = 1.0F;
-    scanChannels(PixelMath::trunc(TonalStretch::baseThreshold(mInPlane->pixelCount())));
+    scanChannels(PixelMath::trunc(TonalStretch::baseThreshold(picturePixels())));
     mParams->m_Opaco = mLimits.isHazy();
     scanChannels(chooseThreshold());
     mCurve = makeTable([this](int value) {
@@ -72,7 +72,7 @@ void Auto_Contrast::scanChannels(double threshold) {
 
 // Of the second scans, in samples.
 int Auto_Contrast::chooseThreshold() const {
-    const double root = std::sqrt(static_cast<double>(mInPlane->pixelCount()));
+    const double root = std::sqrt(static_cast<double>(picturePixels()));
     if (mParams->m_Opaco) {
         Log::log(LogLevel::Debug, "m_Opaco: %d ", mParams->m_Opaco);
         Log::log(LogLevel::Debug, "C_Left_limit: %f ", static_cast<double>(mLimits.black));

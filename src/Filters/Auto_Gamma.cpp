@@ -26,7 +26,7 @@ bool Auto_Gamma::applies() {
 }
 
 void Auto_Gamma::setUp() {
-    addSamplesToHistogram();
+    measured([this] { addSamplesToHistogram(); });
     const float gamma = gammaFor(meanLuma());
     Log::log(LogLevel::Debug, "Level_M %f", static_cast<double>(gamma));
     mTable = GammaCurve::table(gamma);

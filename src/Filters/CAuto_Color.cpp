@@ -46,7 +46,7 @@ void CAuto_Color::setUp() {
     logFlags();
     const float s = mParams->mSliderParams.mAuto_Color_Value / 1000;
     mParams->Shift_Level = s;
-    const double threshold = (s * 6.67 - 3.67) * std::sqrt(static_cast<double>(mInPlane->pixelCount()));
+    const double threshold = (s * 6.67 - 3.67) * std::sqrt(static_cast<double>(picturePixels()));
     Log::log(LogLevel::Debug, "AUTO COLOR threshold=: %f", threshold);
 
     const auto histograms = TonalStretch::channelHistograms(*mParams);

@@ -116,8 +116,8 @@ void CAuto_Contrast_I::logRatios() const {
     logOne("RatioB", RatioB);
 }
 
-float CAuto_Contrast_I::sharpnessFactor(int width, int height) {
-    const float pixels = static_cast<float>(height) * static_cast<float>(width);
+float CAuto_Contrast_I::sharpnessFactor(std::int32_t pixelCount) {
+    const auto pixels = static_cast<float>(pixelCount);
     const auto side = static_cast<float>(std::sqrt(static_cast<double>(pixels)));
     return static_cast<float>((std::tanh((1500.0 - side) / 750) + 1) * 0.5 / 2 + 0.5);
 }
@@ -128,7 +128,7 @@ void CAuto_Contrast_I::prepareFade() {
     const float a = iterationShare(sliders.OrvelaLevelEnabled, sliders.OrvelaLevelValue);
     const float b = iterationShare(sliders.OrvelaLevel2Enabled, sliders.OrvelaLevel2Value);
     const auto g = static_cast<float>((static_cast<double>(a) + b) / 10 + 1.1);
-    const float Sharpness_factor = sharpnessFactor(mInPlane->width(), mInPlane->height());
+    const float Sharpness_factor = sharpnessFactor(picturePixels());
     Log::log(LogLevel::Debug, "Sharpness_factor: %f", static_cast<double>(Sharpness_factor));
     const auto w = static_cast<float>(static_cast<double>(share) * Sharpness_factor * g);
     Fade_Value_factor = std::min(w, 1.0F);

@@ -16,8 +16,8 @@ class CAuto_Contrast_I final : public orvela::PointFilter {
 public:
     using orvela::PointFilter::PointFilter;
 
-    /// Share of the fade that a picture of this size gets: 0.5 for large, near 1 for small ones.
-    static float sharpnessFactor(int width, int height);
+    /// Share of the fade that a picture of so many pixels gets: 0.5 for large, near 1 for small ones.
+    static float sharpnessFactor(std::int32_t pixelCount);
 
 protected:
     const orvela::TaskDescription& description() const override;

@@ -36,9 +36,9 @@ bool CAuto_Contrast_TEST::applies() {
 void CAuto_Contrast_TEST::setUp() {
     Log::log(LogLevel::Debug, "CAuto_Contrast_TEST Condition matched and Soft_Orvela is %d.",
              mParams->Soft_Orvela);
-    recountHistograms(*mInPlane, *mParams, 3, 3);
+    measured([this] { recountHistograms(*mInPlane, *mParams, 3, 3); });
 
-    const int pixels = mInPlane->pixelCount();
+    const int pixels = picturePixels();
     mThreshold = PixelMath::trunc(TonalStretch::baseThreshold(pixels));
     const int root = PixelMath::trunc(std::sqrt(static_cast<double>(pixels)));
     TonalStretch::Limits luma;

@@ -32,9 +32,9 @@ void CAuto_Contrast_TEST_II::setUp() {
     mParams->Shift_Level = 1.0F;
     storeHistograms();
 
-    const double root = std::sqrt(static_cast<double>(mInPlane->pixelCount()));
+    const double root = std::sqrt(static_cast<double>(picturePixels()));
     const auto hazyThreshold = static_cast<float>(root >= 700 ? root : 0);
-    mThreshold = static_cast<float>(TonalStretch::baseThreshold(mInPlane->pixelCount()));
+    mThreshold = static_cast<float>(TonalStretch::baseThreshold(picturePixels()));
     TonalStretch::Limits luma;
     mHazy = TonalStretch::storeHaze(*mParams, luma, mThreshold * mParams->Shift_Level,
                                     hazyThreshold * mParams->Shift_Level);
@@ -46,8 +46,8 @@ void CAuto_Contrast_TEST_II::setUp() {
 }
 
 void CAuto_Contrast_TEST_II::storeHistograms() {
-    recountHistograms(*mInPlane, *mParams, 1, 1);
-    Log::log(LogLevel::Debug, "iImageSize: %f ", static_cast<double>(mInPlane->pixelCount()));
+    measured([this] { recountHistograms(*mInPlane, *mParams, 1, 1); });
+    Log::log(LogLevel::Debug, "iImageSize: %f ", static_cast<double>(picturePixels()));
     if (!Log::writes(LogLevel::Debug))
         return;
     for (std::size_t i = 0; i < 256; ++i) {

@@ -19,8 +19,8 @@ constexpr std::size_t kRanges = 3 * 255 * 255 + 1;
 constexpr double kRangeScale = 0.05;
 constexpr float kLargeSide = 700; // square root of the pixel count
 
-float sideOf(const CARGBPlane& plane) {
-    return static_cast<float>(std::sqrt(static_cast<double>(plane.pixelCount())));
+float sideOf(std::int32_t pixels) {
+    return static_cast<float>(std::sqrt(static_cast<double>(pixels)));
 }
 
 // Null when there is no memory.
@@ -44,7 +44,7 @@ const TaskDescription& CBilinear::description() const {
 }
 
 bool CBilinear::applies() {
-    const float side = sideOf(*mInPlane);
+    const float side = sideOf(picturePixels());
     Log::log(LogLevel::Debug, "Size_Factor: %f", static_cast<double>(side));
     Log::log(LogLevel::Debug, "Bilinear_Filtering_Enabled && Normal_Picture");
     // The flag as it was on entry counts for the large pictures, the new one for all.
@@ -63,7 +63,7 @@ void CBilinear::storeSharpnessSwitch() {
 
 void CBilinear::setUp() {
     const double position = mParams->mSliderParams.BilinearFilteringValue;
-    const auto value = static_cast<float>(sideOf(*mInPlane) > kLargeSide ? position * 0.6 : position);
+    const auto value = static_cast<float>(sideOf(picturePixels()) > kLargeSide ? position * 0.6 : position);
     const float sigma = value * 4.5F / 1000 + 0.5F;
     prepareTables(sigma * sigma);
     mVertStart = 1;

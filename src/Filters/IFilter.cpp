@@ -35,11 +35,14 @@ IFilter::IFilter(const RunContext& context, CUserParams* params, CARGBPlane* inP
     : TaskBase(context, params, inPlane), mOutPlane(outPlane) {
     if (!params) {
         Log::log(LogLevel::Error, "The User Settings object was invalid.");
-        throw CBadPtrEx(QStringLiteral("The User Settings object was invalid."), kSource, 31);
+        throw CBadPtrEx(QStringLiteral(QT_TRANSLATE_NOOP("Failure", "The User Settings object was invalid.")),
+                        kSource, 31);
     }
     if (!outPlane) {
         Log::log(LogLevel::Error, "The Output plane was invalid!");
-        throw CBadPtrEx(QStringLiteral("The filter has an invalid Output plane."), kSource, 41);
+        throw CBadPtrEx(
+            QStringLiteral(QT_TRANSLATE_NOOP("Failure", "The filter has an invalid Output plane.")), kSource,
+            41);
     }
 }
 
@@ -83,7 +86,8 @@ void IFilter::useHostPicture() {
     const CARGBPlaneProxy* proxy = mContext.proxy ? mContext.proxy : CARGBPlaneProxy::current();
     const auto* direct = dynamic_cast<const CARGBPlaneProxyDirect*>(proxy);
     require(direct != nullptr, "IFilter::GetRGBFromHost",
-            "This version of GetRGBFromHost requires direct proxy.", kSource, 89);
+            QT_TRANSLATE_NOOP("Failure", "This version of GetRGBFromHost requires direct proxy."), kSource,
+            89);
     mHostPicture = &direct->plane();
 }
 

@@ -38,7 +38,7 @@ void Saturation::setUp() {
     Log::log(LogLevel::Debug, " Saturation alfa: %f", static_cast<double>(mAlfa));
     mStep = PixelMath::samplingStep(mInPlane->width(), mInPlane->height());
     Log::log(LogLevel::Debug, " Saturation Histo_Step %d", mStep);
-    const Means means = measure(*mInPlane, mStep);
+    const Means means = ofWholePicture(measure(*mInPlane, mStep));
     mMeanIn = restoresOriginalLuma() ? mParams->m_OriginalLuma0 : means.all;
     Log::log(LogLevel::Debug, " Saturation mean_in %f", static_cast<double>(mMeanIn));
     if (mDominant)
@@ -58,6 +58,15 @@ void Saturation::chooseStrength(float position) {
         mAlfa = static_cast<float>(above / 500 + 0.2);
     else
         mAlfa = static_cast<float>(1 - static_cast<double>(position) / 500);
+}
+
+// What the plane's own means say of the whole picture's is kept for the means of the result.
+Saturation::Means Saturation::ofWholePicture(const Means& here) {
+    std::array numbers = {here.all, here.r, here.g, here.b};
+    mKnowsWhole = measured(numbers);
+    const Means whole = {numbers[0], numbers[1], numbers[2], numbers[3]};
+    mWholeShare = here.all > 0 ? whole.all / here.all : 1.0F;
+    return whole;
 }
 
 // Means over the samples up to `margin` before the last column and row; 0 without a sample.
@@ -84,8 +93,9 @@ Saturation::Means Saturation::measure(const CARGBPlane& plane, int margin) const
 // After an illumination iteration the brightness to restore is the unprocessed picture's.
 bool Saturation::restoresOriginalLuma() const {
     const CSliderParams& sliders = mParams->mSliderParams;
-    return (sliders.OrvelaLevelEnabled || sliders.OrvelaLevel2Enabled) && !mParams->Switch_TOO_SHARP &&
-           mParams->Normal_Picture && !mParams->Under_Exposed_Picture && !isAutomaticMode(sliders);
+    return mKnowsWhole && (sliders.OrvelaLevelEnabled || sliders.OrvelaLevel2Enabled) &&
+           !mParams->Switch_TOO_SHARP && mParams->Normal_Picture && !mParams->Under_Exposed_Picture &&
+           !isAutomaticMode(sliders);
 }
 
 void Saturation::prepareDominant(const Means& means) {
@@ -116,10 +126,19 @@ void Saturation::mapRow(const PixelRow& row) const {
         mHsv->applyRow(row);
 }
 
-void Saturation::complete() {
-    const float meanOut = measure(*mOutPlane, mStep + 1).all;
-    const float ratio = meanOut > 0 ? mMeanIn / meanOut : 1.0F;
+// An excerpt takes the ratio of the whole picture where that was found at the same strength, and else
+// estimates it.
+float Saturation::lumaRatio() {
+    const float meanOut = measure(*mOutPlane, mStep + 1).all * mWholeShare;
     Log::log(LogLevel::Debug, " Saturation mean_out %f", static_cast<double>(meanOut));
+    const float ratio = meanOut > 0 ? mMeanIn / meanOut : 1.0F;
+    const float position = mParams->mSliderParams.SaturationValue;
+    std::array numbers = {position, ratio};
+    return measured(numbers) && numbers[0] == position ? numbers[1] : ratio;
+}
+
+void Saturation::complete() {
+    const float ratio = lumaRatio();
     Log::log(LogLevel::Debug, " Saturation Radion_iso_Luma %f", static_cast<double>(ratio));
     const auto height = static_cast<unsigned>(mOutPlane->height());
     forEachRange(0, height, kRowGrain, [&](unsigned first, unsigned last) {

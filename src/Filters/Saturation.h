@@ -41,7 +41,9 @@ private:
 
     void chooseStrength(float position);
     Means measure(const CARGBPlane& plane, int margin) const;
+    Means ofWholePicture(const Means& here);
     bool restoresOriginalLuma() const;
+    float lumaRatio();
     void prepareDominant(const Means& means);
 
     float mAlfa = 1; ///< saturation factor
@@ -49,6 +51,8 @@ private:
     bool mDominant = false;                       ///< dominant-colour mode
     float mStrength = 0;                          ///< k
     float mMeanIn = 0;                            ///< brightness to restore
+    bool mKnowsWhole = true;                      ///< the means are those of the whole picture
+    float mWholeShare = 1;                        ///< mean of the whole picture / mean of the plane
     std::int32_t mStep = 5;                       ///< distance of the samples in rows and columns
     orvela::WideTables mCurves = {};              ///< dominant-colour mode
     std::optional<orvela::SaturationKernel> mHsv; ///< otherwise

@@ -1,5 +1,6 @@
 #include "Filters/TaskBase.h"
 
+#include "Filters/MeasurementTape.h"
 #include "Utility/Assertion.h"
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
@@ -46,6 +47,28 @@ TaskBase::TaskBase(const RunContext& context, CUserParams* params, CARGBPlane* i
     : mContext(context), mParams(params), mInPlane(inPlane),
       mVertEnd(inPlane ? static_cast<std::uint32_t>(inPlane->height()) : 0) {}
 
+void TaskBase::measured(const std::function<void()>& measure) {
+    MeasurementTape* tape = mContext.tape;
+    if (mContext.playsTape && tape->play(*mParams))
+        return;
+    measure();
+    if (tape && !mContext.playsTape)
+        tape->record(*mParams);
+}
+
+bool TaskBase::measured(std::span<float> numbers) {
+    MeasurementTape* tape = mContext.tape;
+    if (mContext.playsTape)
+        return tape->play(numbers);
+    if (tape)
+        tape->record(numbers);
+    return true;
+}
+
+std::int32_t TaskBase::picturePixels() const {
+    return mContext.playsTape ? mContext.tape->picturePixels() : mInPlane->pixelCount();
+}
+
 bool TaskBase::Apply() {
     guarded([this] { return runPhases() ? TaskOutcome::Applied : TaskOutcome::Skipped; });
     if (mOutcome != TaskOutcome::Applied && mPassBegun)
@@ -87,6 +110,7 @@ bool TaskBase::runPhases() {
     pre.done();
 
     const PhaseTimer pass("Pre DoApplyParallel");
+    testStop(); // before a pass that would have to be undone
     mPassBegun = true;
     if (!DoApplyParallel()) {
         Log::scopeExit(LogLevel::Debug, "Task canceled in DoApplyParallel.");
@@ -155,15 +179,20 @@ const TaskDescription& TaskBase::description() const {
     return kNone;
 }
 
+void TaskBase::testStop() const {
+    if (const TaskDescription& own = description(); own.testsStop && mParams->mCancelRequested)
+        throw CanceledEx(own.source, own.line);
+}
+
 std::uint32_t TaskBase::enterRow(std::uint32_t index) {
     const std::uint32_t row = index * mVertStep;
-    if (const TaskDescription& own = description(); own.testsStop) {
-        if (mParams->mCancelRequested)
-            throw CanceledEx(own.source, own.line);
-        if (mParams->mProgressCallback) {
-            const float perRow = 100.0F / static_cast<float>(mInPlane->height());
-            mParams->mProgressCallback(static_cast<std::int32_t>(perRow * static_cast<float>(row + 1)));
-        }
+    testStop();
+    if (!description().testsStop) {
+        if (mContext.onSilentRow)
+            mContext.onSilentRow();
+    } else if (mParams->mProgressCallback) {
+        const float perRow = 100.0F / static_cast<float>(mInPlane->height());
+        mParams->mProgressCallback(static_cast<std::int32_t>(perRow * static_cast<float>(row + 1)));
     }
     onRow(row);
     return row;
@@ -179,7 +208,7 @@ Failure Failure::current() noexcept {
     } catch (const std::bad_alloc&) {
         return {{}, true};
     } catch (...) {
-        return {QStringLiteral("unknown error"), false};
+        return {QStringLiteral(QT_TRANSLATE_NOOP("Failure", "unknown error")), false};
     }
 }
 

@@ -8,6 +8,7 @@
 #include <cstdint>
 #include <experimental/propagate_const>
 #include <functional>
+#include <span>
 
 class TaskBase;
 
@@ -91,6 +92,9 @@ public:
     /// Why it failed.
     const orvela::Failure& failure() const { return mFailure; }
 
+    /// Whether it changes no pixel, by its description.
+    bool onlyMeasures() const { return description().writes == orvela::Writes::Nothing; }
+
 protected:
     /// The pointers are not owned and not checked.
     TaskBase(const orvela::RunContext& context, CUserParams* params, CARGBPlane* inPlane);
@@ -125,6 +129,13 @@ protected:
     /// Works through the bands of the indices from mVertStart, (mVertEnd - mVertStart) / mVertStep of them;
     /// the row of index i is i * mVertStep. A range that ends before it starts is empty.
     bool DoApplyParallel();
+    /// Does a measurement that leaves histograms in the parameters, or takes what it found from the tape.
+    void measured(const std::function<void()>& measure);
+    /// The same for numbers that only this task knows: in an excerpt those of the whole picture take their
+    /// place. False when these are not known.
+    bool measured(std::span<float> numbers);
+    /// Number of pixels of the whole picture, which thresholds grow with.
+    std::int32_t picturePixels() const;
     /// The index after the last one of the pass.
     std::uint32_t passEnd() const;
 
@@ -145,6 +156,7 @@ private:
 
     bool runPhases();
     void restore();
+    void testStop() const;
     std::uint32_t enterRow(std::uint32_t index);
     void logPlanes(const char* text) const;
     /// The second plane whose address the opening lines show.

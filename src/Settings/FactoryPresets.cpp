@@ -48,7 +48,7 @@ bool isFactoryPreset(EGUIMode mode, const QString& name) {
 
 PresetContent contentOf(const QString& name) {
     const CUserParamsPhotoshop factory(factoryPresetMode(name));
-    return PresetConversion::shownContentOf(Mode_Advanced, factory.mSliderParams);
+    return PresetConversion::contentOf(Mode_Advanced, factory.mSliderParams);
 }
 
 EGUIMode factoryPresetMode(const QString& name) {

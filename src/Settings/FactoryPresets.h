@@ -20,8 +20,8 @@ bool isFactoryPresetName(const QString& name);
 /// True for the presets of Advanced with such a name.
 bool isFactoryPreset(EGUIMode mode, const QString& name);
 
-/// What the preset of that name holds when it comes: the settings of its mode as the controls of Advanced
-/// would have them once they took them.
+/// What the preset of that name holds when it comes: the exact settings of its mode, by the controls of
+/// Advanced.
 PresetContent contentOf(const QString& name);
 
 /// The mode of the factory preset of exactly that name. Any other name gives a message box and Portrait.

@@ -17,9 +17,9 @@ struct FactorySetting {
 /// What the system knows of a mode.
 struct ModeDescription {
     EGUIMode mode;
-    const char* displayName;
-    const char* presetName; ///< identifier of its factory preset; null when it has none
-    bool hasSettings;       ///< false when no parameter object can be made for it
+    const char* displayName; ///< marked for translation in the context "ModeTable"
+    const char* presetName;  ///< identifier of its factory preset; null when it has none
+    bool hasSettings;        ///< false when no parameter object can be made for it
     std::span<const FactorySetting> factory;
     const char* summary; ///< what the mode does, in a few words
 };

@@ -143,6 +143,14 @@ std::span<const PaneSlider> threeSliders(EGUIMode mode) {
     return {};
 }
 
+void startFinalTouch(CSliderParams& settings) {
+    for (const PaneSlider& each : sliders(Mode_FinalTouch))
+        settings.*each.slider.value = static_cast<float>(each.initial);
+    for (const PaneColor& each : colors(Mode_FinalTouch))
+        for (float CSliderParams::*part : each.color.parts)
+            settings.*part = 255; // white, as pickers start
+}
+
 } // namespace PaneTable
 
 } // namespace orvela

@@ -40,6 +40,10 @@ const PaneSlider* single(EGUIMode mode);
 /// The three sliders of Smart Levels or Adjustments; empty for any other mode.
 std::span<const PaneSlider> threeSliders(EGUIMode mode);
 
+/// Puts the sliders and the colour of Final Touch to where its pane starts, and leaves the switches alone. A
+/// midtone filter that one of the sliders switches on reads the positions of others, too.
+void startFinalTouch(CSliderParams& settings);
+
 } // namespace PaneTable
 
 } // namespace orvela

@@ -20,30 +20,6 @@ double positionOf(const SliderDescription& slider, const CSliderParams& sliders)
     return slider.value ? static_cast<double>(sliders.*slider.value) : 0;
 }
 
-// Controls are set from their middle position; one whose text does not change by it keeps the exact position.
-double toldPositionOf(const SliderDescription& slider, const CSliderParams& sliders) {
-    constexpr double kMiddle = 500;
-    const double position = positionOf(slider, sliders);
-    const SliderScale& scale = *slider.scale;
-    return scale.text(position) == scale.text(kMiddle) ? position : scale.told(position);
-}
-
-using PositionOf = double (*)(const SliderDescription& slider, const CSliderParams& sliders);
-
-PresetContent content(EGUIMode mode, const CSliderParams& sliders, PositionOf position) {
-    PresetContent content;
-    for (const PaneSlider& each : PaneTable::sliders(mode))
-        if (!each.mirror)
-            content.sliders.append({QString::fromLatin1(each.object), position(each.slider, sliders),
-                                    sliders.*each.slider.enabled});
-    for (const auto& [object, color] : PaneTable::colors(mode)) {
-        const auto& [red, green, blue] = color.parts;
-        content.colors.append({QString::fromLatin1(object), static_cast<int>(sliders.*red),
-                               static_cast<int>(sliders.*green), static_cast<int>(sliders.*blue)});
-    }
-    return content;
-}
-
 } // namespace
 
 namespace PresetConversion {
@@ -53,11 +29,17 @@ bool hasControls(EGUIMode mode) {
 }
 
 PresetContent contentOf(EGUIMode mode, const CSliderParams& sliders) {
-    return content(mode, sliders, positionOf);
-}
-
-PresetContent shownContentOf(EGUIMode mode, const CSliderParams& sliders) {
-    return content(mode, sliders, toldPositionOf);
+    PresetContent content;
+    for (const PaneSlider& each : PaneTable::sliders(mode))
+        if (!each.mirror)
+            content.sliders.append({QString::fromLatin1(each.object), positionOf(each.slider, sliders),
+                                    sliders.*each.slider.enabled});
+    for (const auto& [object, color] : PaneTable::colors(mode)) {
+        const auto& [red, green, blue] = color.parts;
+        content.colors.append({QString::fromLatin1(object), static_cast<int>(sliders.*red),
+                               static_cast<int>(sliders.*green), static_cast<int>(sliders.*blue)});
+    }
+    return content;
 }
 
 CSliderParams paramsOf(EGUIMode mode, const PresetContent& content) {

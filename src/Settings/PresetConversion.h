@@ -15,10 +15,6 @@ bool hasControls(EGUIMode mode);
 /// The controls of the mode's pane as the settings would have them.
 PresetContent contentOf(EGUIMode mode, const CSliderParams& sliders);
 
-/// The same as the controls themselves would have it once they took the settings: at the positions that their
-/// texts tell.
-PresetContent shownContentOf(EGUIMode mode, const CSliderParams& sliders);
-
 /// The settings of a stored preset of the mode: positions are clamped to 0 to 1000, entries without a control
 /// are skipped, controls without an entry are off and at 0.
 CSliderParams paramsOf(EGUIMode mode, const PresetContent& content);

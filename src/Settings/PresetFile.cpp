@@ -2,6 +2,7 @@
 
 #include "Settings/SettingFields.h"
 
+#include <QCoreApplication>
 #include <QJsonDocument>
 
 namespace orvela {
@@ -12,8 +13,8 @@ constexpr int kVersion = 1;
 const QString kVersionKey = QStringLiteral("version");
 const QString kSettingsKey = QStringLiteral("settings");
 
-[[noreturn]] void fail(const QString& path, const QString& cause) {
-    throw PresetError((path + QStringLiteral(": ") + cause).toStdString());
+[[noreturn]] void fail(const char* text, const QStringList& values) {
+    throw PresetError(ErrorText("PresetFile", text, values));
 }
 
 const SliderField* fieldNamed(const QString& name) {
@@ -26,30 +27,33 @@ void checkValue(const QString& path, const QString& name, const QJsonValue& valu
         return;
     if (field->flag) {
         if (!value.isBool())
-            fail(path, QStringLiteral("%1 must be true or false").arg(name));
+            fail(QT_TRANSLATE_NOOP("PresetFile", "%1: %2 must be true or false"), {path, name});
         return;
     }
     const float high = SettingFields::highest(*field);
     if (!value.isDouble() || value.toDouble() < 0 || value.toDouble() > high)
-        fail(path, QStringLiteral("%1 must be a number from 0 to %2").arg(name).arg(high));
+        fail(QT_TRANSLATE_NOOP("PresetFile", "%1: %2 must be a number from 0 to %3"),
+             {path, name, QString::number(high)});
 }
 
 QJsonObject rootOf(const QByteArray& text, const QString& path) {
     QJsonParseError error;
     const QJsonDocument document = QJsonDocument::fromJson(text, &error);
     if (document.isNull())
-        fail(path, QStringLiteral("is not JSON (%1 at byte %2); name a file that --save-preset wrote")
-                       .arg(error.errorString())
-                       .arg(error.offset));
+        fail(QT_TRANSLATE_NOOP("PresetFile",
+                               "%1: is not JSON (%2 at byte %3); name a file that --save-preset wrote"),
+             {path, error.errorString(), QString::number(error.offset)});
     QJsonObject root = document.object();
     if (!root.value(kVersionKey).isDouble() || !root.value(kSettingsKey).isObject())
-        fail(path, QStringLiteral("is not a preset (a number \"version\" and an object \"settings\" are "
-                                  "needed); name a file that --save-preset wrote"));
+        fail(QT_TRANSLATE_NOOP("PresetFile",
+                               "%1: is not a preset (a number \"version\" and an object "
+                               "\"settings\" are needed); name a file that --save-preset wrote"),
+             {path});
     if (root.value(kVersionKey).toDouble() != kVersion)
-        fail(path,
-             QStringLiteral("has version %1, this program reads version %2; use the program that wrote it")
-                 .arg(root.value(kVersionKey).toVariant().toString())
-                 .arg(kVersion));
+        fail(QT_TRANSLATE_NOOP(
+                 "PresetFile",
+                 "%1: has version %2, this program reads version %3; use the program that wrote it"),
+             {path, root.value(kVersionKey).toVariant().toString(), QString::number(kVersion)});
     return root;
 }
 

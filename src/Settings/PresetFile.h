@@ -1,18 +1,30 @@
 #pragma once
 
 #include "Settings/CSliderParams.h"
+#include "Utility/ErrorText.h"
 
 #include <QJsonObject>
 #include <QStringList>
 
 #include <stdexcept>
+#include <string>
 
 namespace orvela {
 
 /// A file that is no preset, or cannot be read: the text names the file, the cause and what to do.
 class PresetError : public std::runtime_error {
 public:
-    using std::runtime_error::runtime_error;
+    explicit PresetError(const ErrorText& text)
+        : std::runtime_error(text.english().toStdString()), mText(text) {}
+    /// In English only, for the command line.
+    explicit PresetError(const std::string& text)
+        : PresetError(ErrorText("", "%1", {QString::fromStdString(text)})) {}
+
+    /// In the language of the user.
+    QString shown() const { return mText.shown(); }
+
+private:
+    ErrorText mText;
 };
 
 /// Settings as the text of a JSON file, by field name:

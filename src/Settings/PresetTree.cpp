@@ -127,6 +127,14 @@ QStringList offeredNames(EGUIMode mode) {
     return offered;
 }
 
+bool exists(EGUIMode mode, const QString& name) {
+    if (groupOf(mode).isEmpty() || name.isEmpty())
+        return false;
+    QSettings settings = openSettings();
+    settings.beginGroup(groupOf(mode, name));
+    return !settings.childGroups().isEmpty() || !settings.childKeys().isEmpty();
+}
+
 bool hasPresets() {
     QSettings settings = openSettings();
     settings.beginGroup(kPresets);
@@ -135,7 +143,7 @@ bool hasPresets() {
 
 std::optional<PresetContent> read(EGUIMode mode, const QString& name) {
     QSettings settings = openSettings(); // kept open, so that the file is read once
-    if (!names(mode).contains(name))
+    if (!exists(mode, name))
         return std::nullopt;
     settings.beginGroup(groupOf(mode, name));
     return contentOf(settings);

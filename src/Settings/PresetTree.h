@@ -13,6 +13,8 @@ struct PresetSlider {
     QString object;
     double value = 0; ///< position, 0 to 1000
     bool enabled = false;
+
+    bool operator==(const PresetSlider&) const = default;
 };
 
 /// What a stored preset says of a colour picker: 0 to 255 each.
@@ -21,12 +23,16 @@ struct PresetColor {
     int red = 0;
     int green = 0;
     int blue = 0;
+
+    bool operator==(const PresetColor&) const = default;
 };
 
 /// What a stored preset says of a check box.
 struct PresetCheckBox {
     QString object;
     bool checked = false;
+
+    bool operator==(const PresetCheckBox&) const = default;
 };
 
 /// A stored preset: states by object name of the control.
@@ -34,6 +40,8 @@ struct PresetContent {
     QList<PresetSlider> sliders;
     QList<PresetColor> colors;
     QList<PresetCheckBox> checkBoxes;
+
+    bool operator==(const PresetContent&) const = default;
 };
 
 /// The keys of the user interface in the settings store, and the presets there:
@@ -61,6 +69,9 @@ QStringList names(EGUIMode mode);
 
 /// The same without the reserved one: what the user is offered.
 QStringList offeredNames(EGUIMode mode);
+
+/// True when the mode has a preset of that name, also the reserved one. Asks for it alone.
+bool exists(EGUIMode mode, const QString& name);
 
 /// True when there is a preset of any mode, also a reserved one.
 bool hasPresets();

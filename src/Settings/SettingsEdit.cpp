@@ -4,6 +4,7 @@
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
 
+#include <QCoreApplication>
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
@@ -17,23 +18,26 @@ namespace {
 
 using Changes = std::vector<SettingsEdit::Change>;
 
-const QString kUnwritten = QStringLiteral("The settings could not be written to %1.");
-
-[[noreturn]] void fail(const QString& text, const QString& store, int line) {
-    throw CGenericEx(text.arg(store), "SettingsEdit.cpp", line);
+[[noreturn]] void fail(const char* text, const QString& store, int line) {
+    throw SettingsError(ErrorText("SettingsEdit", text, {store}), line);
 }
+
+constexpr char kUnwritten[] = QT_TRANSLATE_NOOP("SettingsEdit", "The settings could not be written to %1.");
 
 // Whether the store's parser would keep every line. It drops what it does not understand.
 bool isSettingsText(const QByteArray& text) {
     if (text.contains('\0'))
         return false;
     bool continued = false;
-    for (const QByteArray& each : text.split('\n')) {
-        const QByteArray line = each.trimmed();
+    for (qsizetype start = 0; start < text.size();) {
+        const qsizetype end = text.indexOf('\n', start);
+        const qsizetype length = (end < 0 ? text.size() : end) - start;
+        const QByteArray line = QByteArray::fromRawData(text.constData() + start, length).trimmed();
         const bool isSection = line.startsWith('[') && line.endsWith(']');
         if (!continued && !line.isEmpty() && !isSection && line.indexOf('=') < 1)
             return false;
         continued = line.endsWith('\\');
+        start += length + 1;
     }
     return true;
 }
@@ -47,7 +51,8 @@ void keepForeignFile(const QString& path) {
     for (int number = 2; QFileInfo::exists(copy); ++number)
         copy = first + QString::number(number);
     if (!QFile::copy(path, copy))
-        fail(QStringLiteral("The settings file %1 holds something else, and no copy of it could be made."),
+        fail(QT_TRANSLATE_NOOP("SettingsEdit",
+                               "The settings file %1 holds something else, and no copy of it could be made."),
              path, __LINE__);
     Log::log(LogLevel::Warning, "The settings file held something else; it is kept as %s.",
              copy.toUtf8().constData());
@@ -75,20 +80,26 @@ void checkRoom(const QString& path, const Changes& changes) {
         fail(kUnwritten, path, __LINE__);
 }
 
+// Every key at and below `key`.
+QStringList keysBelow(QSettings& settings, const QString& key) {
+    settings.beginGroup(key);
+    QStringList keys = settings.allKeys();
+    settings.endGroup();
+    for (QString& each : keys)
+        each.prepend(key + QLatin1Char('/'));
+    if (settings.contains(key))
+        keys.append(key);
+    return keys;
+}
+
 // What undoes the changes.
-Changes valuesBefore(const QSettings& settings, const Changes& changes) {
-    const QStringList keys = settings.allKeys();
+Changes valuesBefore(QSettings& settings, const Changes& changes) {
     Changes before;
     for (const auto& [key, value] : changes) {
-        if (value) {
-            before.push_back(
-                {key, settings.contains(key) ? std::optional(settings.value(key)) : std::nullopt});
-            continue;
-        }
-        const QString below = key + QLatin1Char('/');
+        const QStringList keys = value ? QStringList(key) : keysBelow(settings, key);
         for (const QString& each : keys)
-            if (each == key || each.startsWith(below))
-                before.push_back({each, settings.value(each)});
+            before.push_back(
+                {each, settings.contains(each) ? std::optional(settings.value(each)) : std::nullopt});
     }
     return before;
 }
@@ -101,9 +112,10 @@ void apply(QSettings& settings, const Changes& changes) {
 } // namespace
 
 void SettingsEdit::commit() const {
-    // Reading everything once has every complaint about the file made to this object, so that the status of
-    // the other tells of the writing alone.
-    const QSettings reader = openSettings();
+    // Asking at the root has the whole file understood, and every complaint about it made to this object, so
+    // that the status of the other tells of the writing alone.
+    QSettings reader = openSettings();
+    reader.childKeys();
     keepForeignFile(reader.fileName());
     checkRoom(reader.fileName(), mChanges);
     const Changes before = valuesBefore(reader, mChanges);

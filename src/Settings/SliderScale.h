@@ -16,7 +16,7 @@ struct SliderScale {
 
     /// What stands beside a slider at `position`.
     QString text(double position) const;
-    /// The position that this text tells, where a slider comes to stand that is put to `position`.
+    /// The position that this text tells, where a slider comes to stand that is moved to `position`.
     double told(double position) const;
 };
 

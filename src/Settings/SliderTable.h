@@ -29,7 +29,8 @@ enum class ZoneSet : std::int32_t {
     CentredFinalPale = 13, ///< as CentredFinal, strong ones paler
 };
 
-/// One slider, described once: panes, command line, presets and help go by this.
+/// One slider, described once: panes, command line, presets and help go by this. Label and help are texts of
+/// the translation context "SliderTable".
 struct SliderDescription {
     float CSliderParams::*value;  ///< field that holds the position; null when only the state counts
     bool CSliderParams::*enabled; ///< field that holds the on/off state; no two sliders share one

@@ -40,7 +40,7 @@ void CSmartAnalyzer_Digital_Flash::Analyze() {
     Log::log(LogLevel::Debug, "CSmartAnalyzer_Digital_Flash is starting.");
     const double mean = params.m_OriginalLuma;
     const Histogram luma = remap(params.pHisto_Luma, tabulate([mean](int i) { return spread(i, mean); }));
-    const int pixels = mInPlane->pixelCount();
+    const int pixels = picturePixels();
     const double high = risingMass(luma, kHighlights, kSlope);
     const double low = fallingMass(luma, kShadows, kSlope);
     params.m_P_C_H_C_F_L = limitOr(inverseShare(0.20000000298023224, low, pixels, 30), 40);

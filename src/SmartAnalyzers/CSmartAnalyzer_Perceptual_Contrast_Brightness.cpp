@@ -65,7 +65,7 @@ void CSmartAnalyzer_Perceptual_Contrast_Brightness::Analyze() {
 
 void CSmartAnalyzer_Perceptual_Contrast_Brightness::storeBrightnessFactors() {
     CUserParams& params = *mParams;
-    const int pixels = mInPlane->pixelCount();
+    const int pixels = picturePixels();
     params.B_H_F_High = static_cast<float>(risingMass(params.pHisto_Luma, kBrightHighlights, kSlope));
     params.B_H_F_Low = static_cast<float>(fallingMass(params.pHisto_Luma, kBrightShadows, kSlope));
 
@@ -94,6 +94,6 @@ void CSmartAnalyzer_Perceptual_Contrast_Brightness::storeContrastFactors() {
             storeMasses(params, color, curve);
     }
     storeMasses(params, kLuma, curve);
-    params.m_P_C_H_C_High = contrastLimit(params.C_H_F_High, mInPlane->pixelCount());
-    params.m_P_C_H_C_Low = contrastLimit(params.C_H_F_Low, mInPlane->pixelCount());
+    params.m_P_C_H_C_High = contrastLimit(params.C_H_F_High, picturePixels());
+    params.m_P_C_H_C_Low = contrastLimit(params.C_H_F_Low, picturePixels());
 }

@@ -50,7 +50,7 @@ void CSmartAnalyzer_Perceptual_Level_Dark::Analyze() {
 }
 
 int CSmartAnalyzer_Perceptual_Level_Dark::recountCenter() {
-    recount(*mInPlane, *mParams);
+    measured([this] { recount(*mInPlane, *mParams); });
     const int center = leftLimit(*mParams) + kReach;
     Log::log(LogLevel::Debug, "Delta_H: %f", static_cast<double>(kReach));
     Log::log(LogLevel::Debug, "Delta_H_Low AFTER correction: %f", static_cast<double>(center));

@@ -53,7 +53,7 @@ void CSmartAnalyzer_Perceptual_Level_Right::Analyze() {
 }
 
 int CSmartAnalyzer_Perceptual_Level_Right::recountLimit() {
-    recount(*mInPlane, *mParams);
+    measured([this] { recount(*mInPlane, *mParams); });
     const int limit = rightLimit(*mParams);
     Log::log(LogLevel::Debug, "Delta_H: %f", static_cast<double>(kReach));
     Log::log(LogLevel::Debug, "Delta_H AFTER correction: %f", static_cast<double>(limit + kReach));

@@ -23,11 +23,14 @@ bool ISmartAnalyzer::Apply() {
 void ISmartAnalyzer::RunAnalyzer() {
     if (!mParams) {
         Log::log(LogLevel::Error, "The User Settings object was invalid.");
-        throw CBadPtrEx(QStringLiteral("The User Settings object was invalid."), kSource, 26);
+        throw CBadPtrEx(QStringLiteral(QT_TRANSLATE_NOOP("Failure", "The User Settings object was invalid.")),
+                        kSource, 26);
     }
     if (!mInPlane) {
         Log::log(LogLevel::Error, "The Input plane was invalid!");
-        throw CBadPtrEx(QStringLiteral("The analyzer has an invalid Input plane."), kSource, 31);
+        throw CBadPtrEx(
+            QStringLiteral(QT_TRANSLATE_NOOP("Failure", "The analyzer has an invalid Input plane.")), kSource,
+            31);
     }
     try {
         Prepare();

@@ -24,5 +24,5 @@ protected:
     virtual void Analyze() = 0;
 
     /// Pixels of the plane that shares are taken over; 1 for an empty one, whose masses are 0.
-    int pixels() const { return std::max(1, mInPlane->pixelCount()); }
+    int pixels() const { return std::max(1, picturePixels()); }
 };

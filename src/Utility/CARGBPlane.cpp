@@ -79,8 +79,9 @@ void CARGBPlane::copyFrom(const CARGBPlane& source) {
 
 void CARGBPlane::swapSamples(CARGBPlane& other) {
     if (other.mWidth != mWidth || other.mHeight != mHeight)
-        throw CBadPtrEx(QStringLiteral("Only planes of the same size can exchange their samples."), kSource,
-                        __LINE__);
+        throw CBadPtrEx(QStringLiteral(QT_TRANSLATE_NOOP(
+                            "Failure", "Only planes of the same size can exchange their samples.")),
+                        kSource, __LINE__);
     mSamples.swap(other.mSamples);
     std::swap(mColorMode, other.mColorMode);
 }

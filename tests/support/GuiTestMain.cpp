@@ -17,9 +17,13 @@ void collect(QtMsgType type, const QMessageLogContext&, const QString& text) {
         gWarnings.append(text);
 }
 
-/// Fails a test during which Qt warned, such as of a slot that connectSlotsByName finds no signal for.
-class WarningListener : public testing::EmptyTestEventListener {
-    void OnTestStart(const testing::TestInfo&) override { gWarnings.clear(); }
+/// Gives every test an empty settings store, and fails one during which Qt warned, such as of a slot that
+/// connectSlotsByName finds no signal for.
+class FreshStart : public testing::EmptyTestEventListener {
+    void OnTestStart(const testing::TestInfo&) override {
+        gWarnings.clear();
+        orvela::openSettings().clear();
+    }
     void OnTestEnd(const testing::TestInfo&) override {
         for (const QString& text : gWarnings)
             ADD_FAILURE() << "Qt warned: " << qPrintable(text);
@@ -35,6 +39,6 @@ int main(int argc, char** argv) {
     qInstallMessageHandler(collect);
     QApplication application(argc, argv);
     orvela::setSettingsApplication(QStringLiteral("OrvelaGuiTests"));
-    testing::UnitTest::GetInstance()->listeners().Append(new WarningListener);
+    testing::UnitTest::GetInstance()->listeners().Append(new FreshStart);
     return RUN_ALL_TESTS();
 }

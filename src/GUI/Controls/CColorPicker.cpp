@@ -18,9 +18,8 @@ namespace {
 
 constexpr QSize kSize(100, 14);
 constexpr QSize kFieldSize(20, 12);
-constexpr int kFontPixels = 9;
-constexpr int kSwatchLeft = 2;
-constexpr int kSwatchHeight = 16; // the lower edge lies below the widget
+constexpr QSize kDigitsSize(18, 13); // the largest that the field shows whole, line spacing included
+constexpr int kSmallestFont = 6;     // pixels
 constexpr int kPopupShift = 17;
 constexpr int kLightGray = 100; // from here on black reads better than white
 
@@ -29,6 +28,7 @@ constexpr int kLightGray = 100; // from here on black reads better than white
 CColorPicker::CColorPicker(QWidget* parent) : QWidget(parent), mPopup(new CColorPickerPopup(this)) {
     installControlAccessibility();
     setFixedSize(kSize);
+    setFocusPolicy(Qt::StrongFocus);
     setAccessibleName(tr("Color"));
     auto* layout = new QHBoxLayout(this);
     layout->setContentsMargins(5, 1, 3, 1);
@@ -37,6 +37,7 @@ CColorPicker::CColorPicker(QWidget* parent) : QWidget(parent), mPopup(new CColor
     mGreen = addField(layout, QStringLiteral("G"), QStringLiteral("greenValue"), tr("Green"));
     mBlue = addField(layout, QStringLiteral("B"), QStringLiteral("blueValue"), tr("Blue"));
     colorLabels();
+    fitToFont();
     connect(mRed, &QLineEdit::textChanged, this, &CColorPicker::on_redValue_changed);
     connect(mGreen, &QLineEdit::textChanged, this, &CColorPicker::on_greenValue_changed);
     connect(mBlue, &QLineEdit::textChanged, this, &CColorPicker::on_blueValue_changed);
@@ -45,16 +46,13 @@ CColorPicker::CColorPicker(QWidget* parent) : QWidget(parent), mPopup(new CColor
 
 QLineEdit* CColorPicker::addField(QBoxLayout* layout, const QString& label, const QString& object,
                                   const QString& name) {
-    QFont small = font();
-    small.setPixelSize(kFontPixels);
     auto* caption = new QLabel(label, this);
-    caption->setFont(small);
     caption->setAttribute(Qt::WA_TransparentForMouseEvents); // a press there opens the colour field too
     auto* field = new QLineEdit(QStringLiteral("255"), this);
     field->setObjectName(object);
     field->setAccessibleName(name);
-    field->setFont(small);
     field->setFrame(false);
+    field->setAlignment(Qt::AlignRight);
     field->setFixedSize(kFieldSize);
     field->setTextMargins(-1, 0, -2, 0); // three digits need the field's whole width
     field->setValidator(new CIntValidator_FixUp(0, 255, field));
@@ -98,28 +96,73 @@ void CColorPicker::announce() {
 }
 
 // Black or white, whichever reads better on the colour.
+QColor CColorPicker::readable() const {
+    return qGray(mColor.rgb()) > kLightGray ? Qt::black : Qt::white;
+}
+
 void CColorPicker::colorLabels() {
-    QPalette readable = palette();
-    readable.setColor(QPalette::WindowText, qGray(mColor.rgb()) > kLightGray ? Qt::black : Qt::white);
+    QPalette onColor = palette();
+    onColor.setColor(QPalette::WindowText, readable());
     for (QLabel* label : mLabels)
-        label->setPalette(readable);
+        label->setPalette(onColor);
+}
+
+// The font of the surroundings, as large as three digits of it have room.
+void CColorPicker::fitToFont() {
+    QFont fitting = font();
+    int pixels = QFontInfo(fitting).pixelSize();
+    const auto fits = [&fitting](int size) {
+        fitting.setPixelSize(size);
+        const QFontMetrics metrics(fitting);
+        return metrics.horizontalAdvance(QStringLiteral("255")) <= kDigitsSize.width() &&
+               metrics.height() <= kDigitsSize.height();
+    };
+    while (!fits(pixels) && pixels > kSmallestFont)
+        --pixels;
+    for (QWidget* part : findChildren<QWidget*>(QString(), Qt::FindDirectChildrenOnly))
+        if (!part->isWindow())
+            part->setFont(fitting);
 }
 
 void CColorPicker::changeEvent(QEvent* event) {
     if (event->type() == QEvent::PaletteChange)
         colorLabels();
+    if (event->type() == QEvent::FontChange)
+        fitToFont();
+    if (event->type() == QEvent::EnabledChange && !isEnabled())
+        mPopup->hide();
     QWidget::changeEvent(event);
 }
 
-void CColorPicker::mousePressEvent(QMouseEvent*) {
-    mPopup->move(mapToGlobal(QPoint(kPopupShift, 0)));
-    mPopup->setMouseTracking(true);
-    mPopup->show();
+void CColorPicker::hideEvent(QHideEvent* event) {
+    mPopup->hide();
+    QWidget::hideEvent(event);
+}
+
+void CColorPicker::openField(const QPoint& pressed) {
+    mPopup->open(mapToGlobal(QPoint(kPopupShift, 0)), mColor, pressed);
+}
+
+void CColorPicker::mousePressEvent(QMouseEvent* event) {
+    if (event->button() == Qt::LeftButton)
+        openField(event->globalPosition().toPoint());
+    else
+        event->ignore();
+}
+
+void CColorPicker::keyPressEvent(QKeyEvent* event) {
+    if (event->key() == Qt::Key_Space || event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter)
+        openField({});
+    else
+        QWidget::keyPressEvent(event);
 }
 
 void CColorPicker::paintEvent(QPaintEvent*) {
     QPainter painter(this);
-    const QRectF swatch(kSwatchLeft, 0, width() - kSwatchLeft, kSwatchHeight);
+    painter.setOpacity(isEnabled() ? 1 : CrispPaint::kDimmed);
+    const QRectF swatch(kSwatchLeft, 0, width() - kSwatchLeft, height());
     painter.fillRect(CrispPaint::onGrid(painter, swatch), mColor);
     CrispPaint::frame(painter, swatch, Qt::black);
+    if (hasFocus())
+        CrispPaint::frame(painter, swatch.adjusted(1, 1, -1, -1), readable());
 }

@@ -8,11 +8,15 @@ class QLabel;
 class QLineEdit;
 
 /// A colour swatch of 100 x 14 pixels with a field for each of red, green and blue (0 to 255) on it. Pressing
-/// the mouse on it opens a colour field to choose from.
+/// the mouse on it, Space or Return opens a colour field to choose from, which goes when the picker hides or
+/// is disabled.
 class CColorPicker : public QWidget {
     Q_OBJECT
 
 public:
+    /// Where the swatch begins in the control.
+    static constexpr int kSwatchLeft = 2;
+
     /// Opaque white.
     explicit CColorPicker(QWidget* parent = nullptr);
 
@@ -31,12 +35,17 @@ Q_SIGNALS:
 
 protected:
     void mousePressEvent(QMouseEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+    void hideEvent(QHideEvent* event) override;
     void changeEvent(QEvent* event) override;
     void paintEvent(QPaintEvent* event) override;
 
 private:
     QLineEdit* addField(QBoxLayout* layout, const QString& label, const QString& object, const QString& name);
+    void openField(const QPoint& pressed);
+    QColor readable() const;
     void colorLabels();
+    void fitToFont();
     void announce();
 
     QColor mColor{255, 255, 255};

@@ -33,6 +33,7 @@ void COrvelaStatusIndicator::setStep(int Step, int TotalSteps, const QString& Ne
     mTotalSteps = static_cast<unsigned>(TotalSteps);
     if (!NextStepName.isEmpty())
         mStepName = NextStepName;
+    setToolTip(mStepName);
     update();
 }
 

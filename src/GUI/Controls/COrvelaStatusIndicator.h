@@ -5,7 +5,7 @@
 class QPainter;
 
 /// The progress of a run: a bar for the steps done and, along its foot, one for the percentage of the current
-/// step. 18 pixels high. The name of the step is told to assistive tools only.
+/// step. 18 pixels high. The name of the step is its tool tip, and told to assistive tools.
 class COrvelaStatusIndicator : public QWidget {
     Q_OBJECT
 

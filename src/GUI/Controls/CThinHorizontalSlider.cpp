@@ -4,7 +4,6 @@
 #include "GUI/Controls/CrispPaint.h"
 #include "Utility/Logger.h"
 
-#include <QAccessible>
 #include <QKeyEvent>
 #include <QMouseEvent>
 #include <QPainter>
@@ -18,9 +17,12 @@ namespace {
 
 constexpr int kHeight = 7;
 constexpr int kHandleWidth = 5;
-constexpr double kStepShare = 0.01; // of the range, per arrow key and wheel notch
-constexpr double kPageShare = 0.1;
-constexpr double kWheelNotch = 120; // eighths of a degree
+constexpr double kStepShare = 0.01; // of the range
+constexpr double kPageSteps = 10;
+constexpr double kFineSteps = 0.1;
+constexpr double kQuiet = 0.35;     // opacity of a track that is off
+constexpr double kDarkQuiet = 0.15; // the same on a dark ground
+constexpr double kDarkEmpty = 0.35; // opacity of the part behind the handle on a dark ground
 const QColor kOffFill(200, 200, 200);
 const QColor kOutline(110, 110, 110);
 
@@ -56,8 +58,6 @@ void CThinHorizontalSlider::setMaximum(double dNewMax) {
 void CThinHorizontalSlider::setValue(double dNewVal) {
     mValue = dNewVal;
     update();
-    QAccessibleValueChangeEvent change(this, mValue);
-    QAccessible::updateAccessibility(&change);
 }
 
 void CThinHorizontalSlider::moveTo(double value) {
@@ -66,22 +66,28 @@ void CThinHorizontalSlider::moveTo(double value) {
 }
 
 void CThinHorizontalSlider::mousePressEvent(QMouseEvent* event) {
+    if (event->button() != Qt::LeftButton)
+        return event->ignore();
     mDragging = true;
     setMouseTracking(true);
     handlePoint(event->position());
 }
 
 void CThinHorizontalSlider::mouseMoveEvent(QMouseEvent* event) {
-    handlePoint(event->position());
+    if (mDragging)
+        handlePoint(event->position());
 }
 
 void CThinHorizontalSlider::mouseReleaseEvent(QMouseEvent* event) {
-    if (!mDragging)
+    if (!mDragging || event->button() != Qt::LeftButton)
         return;
+    endDrag();
+    handlePoint(event->position());
+}
+
+void CThinHorizontalSlider::endDrag() {
     mDragging = false;
     setMouseTracking(false);
-    handlePoint(event->position());
-    update();
 }
 
 void CThinHorizontalSlider::mouseDoubleClickEvent(QMouseEvent* event) {
@@ -95,32 +101,19 @@ void CThinHorizontalSlider::handlePoint(const QPointF& point) {
     Q_EMIT valueChanged(mValue);
 }
 
-void CThinHorizontalSlider::wheelEvent(QWheelEvent* event) {
-    if (!hasFocus()) {
-        event->ignore(); // the surroundings scroll
-        return;
-    }
-    mWheelRest += event->angleDelta().y() / kWheelNotch;
-    const double notches = std::trunc(mWheelRest);
-    mWheelRest -= notches;
-    if (notches != 0)
-        stepBy(notches * kStepShare * (mMaximum - mMinimum));
-    event->accept();
-}
-
 void CThinHorizontalSlider::keyPressEvent(QKeyEvent* event) {
-    const double range = mMaximum - mMinimum;
+    const double step = event->modifiers().testFlag(Qt::ControlModifier) ? kFineSteps : 1;
     switch (event->key()) {
     case Qt::Key_Left:
     case Qt::Key_Down:
-        return stepBy(-kStepShare * range);
+        return stepBy(-step);
     case Qt::Key_Right:
     case Qt::Key_Up:
-        return stepBy(kStepShare * range);
+        return stepBy(step);
     case Qt::Key_PageDown:
-        return stepBy(-kPageShare * range);
+        return stepBy(-kPageSteps * step);
     case Qt::Key_PageUp:
-        return stepBy(kPageShare * range);
+        return stepBy(kPageSteps * step);
     case Qt::Key_Home:
         return moveTo(mMinimum);
     case Qt::Key_End:
@@ -130,14 +123,14 @@ void CThinHorizontalSlider::keyPressEvent(QKeyEvent* event) {
     }
 }
 
-void CThinHorizontalSlider::stepBy(double delta) {
-    moveTo(mStepper(mValue, delta));
+void CThinHorizontalSlider::stepBy(double steps) {
+    moveTo(mStepper(mValue, steps * kStepShare * (mMaximum - mMinimum)));
 }
 
 void CThinHorizontalSlider::changeEvent(QEvent* event) {
-    if (event->type() == QEvent::EnabledChange && !isEnabled()) {
-        mDragging = false; // a release will not come any more
-        setMouseTracking(false);
+    if (event->type() == QEvent::EnabledChange && !isEnabled() && mDragging) {
+        endDrag(); // a release will not come any more
+        Q_EMIT valueChanged(mValue);
     }
     QWidget::changeEvent(event);
 }
@@ -155,6 +148,10 @@ double CThinHorizontalSlider::share() const {
     return range == 0 ? 0 : std::clamp(mValue / range, 0.0, 1.0);
 }
 
+bool CThinHorizontalSlider::isOn() const {
+    return isEnabledTo(parentWidget());
+}
+
 void CThinHorizontalSlider::paintEvent(QPaintEvent*) {
     ensureStops();
     QPainter painter(this);
@@ -163,29 +160,26 @@ void CThinHorizontalSlider::paintEvent(QPaintEvent*) {
 }
 
 void CThinHorizontalSlider::paintTrack(QPainter& painter) const {
+    const bool dark = CrispPaint::isDark(palette());
+    const double opacity = !isOn() ? (dark ? kDarkQuiet : kQuiet) : isEnabled() ? 1 : CrispPaint::kDimmed;
     const QRectF track(0, 1, width(), height() - 2);
     QLinearGradient shade(0, 0, 0, height());
     shade.setColorAt(0, Qt::white);
     shade.setColorAt(0.5, QColor(210, 210, 210));
     shade.setColorAt(1, Qt::white);
+    painter.setOpacity(dark && isOn() ? opacity * kDarkEmpty : opacity);
     painter.fillRect(CrispPaint::onGrid(painter, track), shade);
+    painter.setOpacity(opacity);
     const QRectF filled(track.left(), track.top(), share() * (width() - 1), track.height());
-    painter.fillRect(CrispPaint::onGrid(painter, filled), isEnabled() ? zoneColor(mStops, mValue) : kOffFill);
-    CrispPaint::frame(painter, track, hasFocus() ? palette().color(QPalette::Highlight) : kOutline);
+    painter.fillRect(CrispPaint::onGrid(painter, filled), isOn() ? zoneColor(mStops, mValue) : kOffFill);
+    CrispPaint::frame(painter, track, kOutline);
 }
 
 void CThinHorizontalSlider::paintHandle(QPainter& painter) const {
+    painter.setOpacity(isOn() && isEnabled() ? 1 : CrispPaint::kDimmed);
     const double left = std::clamp(share() * (width() - 1) + 1 - kHandleWidth / 2.0, 0.0,
                                    std::max(0.0, double(width() - kHandleWidth)));
     const QRectF handle = CrispPaint::onGrid(painter, QRectF(left, 0, kHandleWidth, height()));
-    if (!isEnabled()) { // a struck-through track with a mere notch: off shows without colour too
-        const double middle = height() / 2.0;
-        for (double x = 3; x < width() - 5; x += 6)
-            painter.fillRect(CrispPaint::onGrid(painter, QRectF(x, middle - 0.5, 3, 1)), kOutline);
-        painter.fillRect(CrispPaint::onGrid(painter, QRectF(handle.center().x() - 0.5, 0, 1, height())),
-                         kOutline);
-        return;
-    }
-    painter.fillRect(handle, hasFocus() ? palette().color(QPalette::Highlight) : QColor(250, 250, 250));
-    CrispPaint::frame(painter, handle, QColor(60, 60, 60));
+    painter.fillRect(handle, isOn() ? QColor(250, 250, 250) : palette().color(QPalette::Window));
+    CrispPaint::frame(painter, handle, isOn() ? QColor(60, 60, 60) : QColor(140, 140, 140));
 }

@@ -9,7 +9,8 @@
 class QPainter;
 
 /// A slider 7 pixels high whose track shows, by its colour, whether the value is mild, strong or extreme.
-/// Besides the mouse it takes the wheel and the arrow, page, home and end keys while it has the focus.
+/// It takes the left mouse button and the arrow, page, home and end keys; with Ctrl a key moves a tenth. A
+/// slider that is off itself is quiet, one in disabled surroundings is dimmed and looks the same otherwise.
 class CThinHorizontalSlider : public QWidget {
     Q_OBJECT
 
@@ -33,8 +34,10 @@ public:
     /// Replaces how keys and wheel step; the plain addition at first.
     void setStepper(const Stepper& stepper) { mStepper = stepper; }
 
-    /// Takes `value`, limited to the range, and announces it: what keys and assistive tools do.
+    /// Takes `value`, limited to the range, and announces it: what keys do.
     void moveTo(double value);
+    /// Moves by so many steps of a hundredth of the range, as the stepper has it, and announces the value.
+    void stepBy(double steps);
 
     QSize sizeHint() const override;
 
@@ -53,16 +56,16 @@ protected:
     void mouseMoveEvent(QMouseEvent* event) override;
     void mouseReleaseEvent(QMouseEvent* event) override;
     void mouseDoubleClickEvent(QMouseEvent* event) override;
-    void wheelEvent(QWheelEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
     void changeEvent(QEvent* event) override;
     void paintEvent(QPaintEvent* event) override;
 
 private:
     void handlePoint(const QPointF& point);
-    void stepBy(double delta);
+    void endDrag();
     void ensureStops();
     double share() const;
+    bool isOn() const;
     void paintTrack(QPainter& painter) const;
     void paintHandle(QPainter& painter) const;
 
@@ -70,7 +73,6 @@ private:
     double mMaximum = 1000;
     double mValue = 0;
     bool mDragging = false;
-    double mWheelRest = 0;
     QList<orvela::ZoneStop> mStops;
     Stepper mStepper;
 };

@@ -6,36 +6,48 @@
 #include "GUI/Controls/COrvelaStatusIndicator.h"
 
 #include <QAccessibleWidget>
+#include <QDoubleValidator>
+
+#include <algorithm>
 
 namespace orvela {
 
 namespace {
 
-// A slider: its value is the number shown beside it, its range that of the positions.
+// A slider: its value and range are those of the number shown beside it.
 class SliderAccess : public QAccessibleWidget, public QAccessibleValueInterface {
 public:
     explicit SliderAccess(CThinHorizontalSlider* slider)
-        : QAccessibleWidget(slider, QAccessible::Slider), mSlider(slider) {}
+        : QAccessibleWidget(slider, QAccessible::Slider), mSlider(slider),
+          mBlock(qobject_cast<COrvelaSliderBlockImpl*>(slider->parentWidget())) {}
 
     void* interface_cast(QAccessible::InterfaceType type) override {
-        return type == QAccessible::ValueInterface ? static_cast<QAccessibleValueInterface*>(this)
-                                                   : QAccessibleWidget::interface_cast(type);
+        return type == QAccessible::ValueInterface && mBlock ? static_cast<QAccessibleValueInterface*>(this)
+                                                             : QAccessibleWidget::interface_cast(type);
     }
     QString text(QAccessible::Text kind) const override {
-        const auto* block = qobject_cast<COrvelaSliderBlockImpl*>(mSlider->parentWidget());
-        return kind == QAccessible::Value && block ? block->txtValue->text() : QAccessibleWidget::text(kind);
+        return kind == QAccessible::Value && mBlock ? mBlock->txtValue->text()
+                                                    : QAccessibleWidget::text(kind);
     }
-    QVariant currentValue() const override { return mSlider->value(); }
+    QVariant currentValue() const override { return mBlock->txtValue->text().toDouble(); }
     void setCurrentValue(const QVariant& value) override {
         if (mSlider->isEnabled())
-            mSlider->moveTo(value.toDouble());
+            mBlock->setVirtualValue(std::clamp(value.toDouble(), range()->bottom(), range()->top()));
     }
-    QVariant minimumValue() const override { return mSlider->minimum(); }
-    QVariant maximumValue() const override { return mSlider->maximum(); }
-    QVariant minimumStepSize() const override { return {}; }
+    QVariant minimumValue() const override { return range()->bottom(); }
+    QVariant maximumValue() const override { return range()->top(); }
+    QVariant minimumStepSize() const override {
+        constexpr double kShown = 0.1; // one decimal
+        return std::max((range()->top() - range()->bottom()) / 100, kShown);
+    }
 
 private:
+    const QDoubleValidator* range() const {
+        return qobject_cast<const QDoubleValidator*>(mBlock->txtValue->validator());
+    }
+
     CThinHorizontalSlider* mSlider;
+    COrvelaSliderBlockImpl* mBlock; ///< null for a slider on its own, which has no number
 };
 
 // The progress display: the percentage is its value, the step its description.

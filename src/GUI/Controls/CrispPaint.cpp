@@ -1,6 +1,7 @@
 #include "GUI/Controls/CrispPaint.h"
 
 #include <QPainter>
+#include <QPalette>
 
 #include <algorithm>
 #include <cmath>
@@ -25,6 +26,26 @@ void frame(QPainter& painter, const QRectF& rect, const QColor& color) {
     painter.fillRect(QRectF(outer.left(), outer.bottom() - line, outer.width(), line), color);
     painter.fillRect(QRectF(outer.left(), outer.top(), line, outer.height()), color);
     painter.fillRect(QRectF(outer.right() - line, outer.top(), line, outer.height()), color);
+}
+
+void focusRing(QPainter& painter, const QRectF& rect, const QPalette& palette) {
+    constexpr double kLine = 1.5;
+    painter.save();
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setBrush(Qt::NoBrush);
+    painter.setPen(QPen(palette.color(QPalette::WindowText), kLine));
+    const double inset = kLine / 2;
+    const QRectF ring = rect.adjusted(inset, inset, -inset, -inset);
+    const double radius = std::min({4.0, ring.width() / 2, ring.height() / 2});
+    painter.drawRoundedRect(ring, radius, radius);
+    painter.restore();
+}
+
+bool isDark(const QPalette& palette) {
+    const auto lightness = [&palette](auto role) {
+        return palette.color(QPalette::Active, role).lightness();
+    };
+    return lightness(QPalette::Window) < lightness(QPalette::WindowText);
 }
 
 } // namespace CrispPaint

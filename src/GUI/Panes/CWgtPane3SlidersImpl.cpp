@@ -21,10 +21,13 @@ void CWgtPane3SlidersImpl::doSetSliders(const QString&) {
         DebugBoxes::warningBox(window(), tr("Note:"), tr("invalid mode in CWgtPane3SlidersImpl::setSliders"));
 }
 
+void CWgtPane3SlidersImpl::writeSettings(CSliderParams& settings) const {
+    writeSliders(PaneTable::threeSliders(mode()), settings);
+}
+
 void CWgtPane3SlidersImpl::applyGUIParams(CUserParams& params) {
-    const auto sliders = PaneTable::threeSliders(mode());
-    writeSliders(sliders, params.mSliderParams);
-    if (!sliders.empty())
+    writeSettings(params.mSliderParams);
+    if (!PaneTable::threeSliders(mode()).empty())
         return;
     Log::log(LogLevel::Warning, "in CWgtPane3SlidersImpl::applyGUIParams");
     DebugBoxes::warningBox(window(), tr("Note:"), tr("invalid mode in CWgtPane3SlidersImpl::applyGUIParams"));

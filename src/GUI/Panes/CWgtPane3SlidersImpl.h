@@ -14,6 +14,7 @@ public:
 
     /// A message box when the mode is not one of the two.
     void applyGUIParams(CUserParams& params) override;
+    void writeSettings(CSliderParams& settings) const override;
     CThreadedCore* createCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* owner) override;
 
 protected:

@@ -4,6 +4,8 @@
 #include "Settings/FactoryPresets.h"
 #include "Utility/Logger.h"
 
+#include <QMouseEvent>
+
 using namespace orvela;
 
 CWgtPaneAdvancedImpl::CWgtPaneAdvancedImpl(QWidget* owner, EGUIMode mode) : IWgtPane(owner, mode) {
@@ -11,7 +13,9 @@ CWgtPaneAdvancedImpl::CWgtPaneAdvancedImpl(QWidget* owner, EGUIMode mode) : IWgt
     setupUi(this);
     sldrAutoContrast->hide();
     setUpSliders(PaneTable::sliders(Mode_Advanced), CSliderParams());
-    setUpColorPicker(colrPickAutoColor, sldrColorFilter);
+    setUpColorPicker(colrPickAutoColor, PaneTable::colors(Mode_Advanced).front(), sldrColorFilter);
+    lblExtendedSettings->installEventFilter(this);
+    lblExtendedSettings->setCursor(Qt::PointingHandCursor);
     extendSettings(false);
 }
 
@@ -21,10 +25,13 @@ void CWgtPaneAdvancedImpl::doSetSliders(const QString& presetName) {
     showColors(PaneTable::colors(Mode_Advanced), factory.mSliderParams);
 }
 
-void CWgtPaneAdvancedImpl::applyGUIParams(CUserParams& params) {
-    CSliderParams& settings = params.mSliderParams;
+void CWgtPaneAdvancedImpl::writeSettings(CSliderParams& settings) const {
     writeSliders(PaneTable::sliders(Mode_Advanced), settings);
     writeColors(PaneTable::colors(Mode_Advanced), settings);
+}
+
+void CWgtPaneAdvancedImpl::applyGUIParams(CUserParams& params) {
+    writeSettings(params.mSliderParams);
     Log::log(LogLevel::Debug, "CWgtPaneAdvancedImpl::applyGUIParams");
     params.list(QStringLiteral("CWgtPaneAdvancedImpl::applyGUIParams"));
     Log::log(LogLevel::Debug, "CWgtPaneAdvancedImpl::applyGUIParams finished.");
@@ -48,9 +55,21 @@ void CWgtPaneAdvancedImpl::on_btnCollapseSettings_clicked() {
     extendSettings(false);
 }
 
+// A click on the text does what one on the button before it does.
+bool CWgtPaneAdvancedImpl::eventFilter(QObject* watched, QEvent* event) {
+    if (watched == lblExtendedSettings && event->type() == QEvent::MouseButtonPress && isEnabled() &&
+        static_cast<QMouseEvent*>(event)->button() == Qt::LeftButton)
+        extendSettings(btnCollapseSettings->isHidden());
+    return IWgtPane::eventFilter(watched, event);
+}
+
 void CWgtPaneAdvancedImpl::extendSettings(bool extended) {
-    btnExtendSettings->setVisible(!extended);
-    btnCollapseSettings->setVisible(extended);
+    QToolButton* const gone = extended ? btnExtendSettings : btnCollapseSettings;
+    QToolButton* const shown = extended ? btnCollapseSettings : btnExtendSettings;
+    shown->show();
+    if (gone->hasFocus())
+        shown->setFocus(Qt::OtherFocusReason);
+    gone->hide();
     for (QGroupBox* group : {grpBxPerceptualAbsolute, grpBxArtefacts, grpBxColor})
         group->setVisible(extended);
 }

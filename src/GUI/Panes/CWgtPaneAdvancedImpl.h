@@ -12,6 +12,7 @@ public:
     CWgtPaneAdvancedImpl(QWidget* owner, EGUIMode mode);
 
     void applyGUIParams(CUserParams& params) override;
+    void writeSettings(CSliderParams& settings) const override;
     CThreadedCore* createCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* owner) override;
 
 public Q_SLOTS:
@@ -21,6 +22,7 @@ public Q_SLOTS:
 
 protected:
     void doSetSliders(const QString& presetName) override;
+    bool eventFilter(QObject* watched, QEvent* event) override;
 
 private:
     void extendSettings(bool extended);

@@ -10,12 +10,11 @@ using namespace orvela;
 
 namespace {
 
-// The signal's own value is what was set; the block may have moved it to what its text tells. A block that
-// already has it keeps the text that is being typed.
+// A block that already has the position keeps the text that is being typed.
 void mirror(COrvelaSliderBlockImpl* source, COrvelaSliderBlockImpl* target) {
     QObject::connect(source, &COrvelaSliderBlockImpl::valueChanged, target, [source, target] {
-        if (target->value() != source->value())
-            target->setValue(source->value());
+        if (target->exactValue() != source->exactValue())
+            target->setValue(source->exactValue());
     });
     QObject::connect(source, &COrvelaSliderBlockImpl::stateChanged, target,
                      &COrvelaSliderBlockImpl::setEnabled);
@@ -30,8 +29,9 @@ CWgtPaneFinalTouchImpl::CWgtPaneFinalTouchImpl(QWidget* owner, EGUIMode mode) : 
     nameTabs();
     mirrorColorFilters();
     doSetSliders(QString());
-    setUpColorPicker(colrPickPercColorFilter, sldrPercColorFilter);
-    setUpColorPicker(colrPickAbsColorFilter, sldrAbsColorFilter);
+    const PaneColor& color = PaneTable::colors(Mode_FinalTouch).front();
+    setUpColorPicker(colrPickPercColorFilter, color, sldrPercColorFilter);
+    setUpColorPicker(colrPickAbsColorFilter, color, sldrAbsColorFilter);
 }
 
 // The tabs of the channels show no text.
@@ -55,12 +55,15 @@ void CWgtPaneFinalTouchImpl::doSetSliders(const QString&) {
         setUpSlider(slider, false, slider.initial);
 }
 
-void CWgtPaneFinalTouchImpl::applyGUIParams(CUserParams& params) {
-    CSliderParams& settings = params.mSliderParams;
+void CWgtPaneFinalTouchImpl::writeSettings(CSliderParams& settings) const {
     writeSliders(PaneTable::sliders(Mode_FinalTouch), settings);
     writeColors(PaneTable::colors(Mode_FinalTouch), settings);
+}
+
+void CWgtPaneFinalTouchImpl::applyGUIParams(CUserParams& params) {
+    writeSettings(params.mSliderParams);
     Log::log(LogLevel::Debug, "TMP: params.mSliderParams.mColor_Touch_Enabled %d.",
-             settings.mColor_Touch_Enabled);
+             params.mSliderParams.mColor_Touch_Enabled);
 }
 
 CThreadedCore* CWgtPaneFinalTouchImpl::createCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* owner) {

@@ -14,6 +14,7 @@ public:
     CWgtPaneFinalTouchImpl(QWidget* owner, EGUIMode mode);
 
     void applyGUIParams(CUserParams& params) override;
+    void writeSettings(CSliderParams& settings) const override;
     CThreadedCore* createCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* owner) override;
     void fillPresetList(QComboBox* list) override;
 

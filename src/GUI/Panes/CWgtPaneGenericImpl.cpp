@@ -21,22 +21,19 @@ CWgtPaneGenericImpl::CWgtPaneGenericImpl(QWidget* owner, EGUIMode mode)
     setUpSliders({mSlider, 1}, factory.mSliderParams);
     mColors = PaneTable::colors(mode);
     for (const PaneColor& color : mColors)
-        addColorPicker(color.object);
+        addColorPicker(color);
     showColors(mColors, factory.mSliderParams);
 }
 
-void CWgtPaneGenericImpl::addColorPicker(const char* object) {
-    auto* picker = new CColorPicker(this);
-    picker->setObjectName(QLatin1String(object));
-    picker->setAccessibleName(tr(mSlider->slider.label));
-    setUpColorPicker(picker, sldrGeneric);
-    verticalLayout->insertWidget(1, picker, 0, Qt::AlignRight);
+void CWgtPaneGenericImpl::addColorPicker(const PaneColor& color) {
+    auto* picker = new CColorPicker(frmSliders);
+    picker->setObjectName(QLatin1String(color.object));
+    setUpColorPicker(picker, color, sldrGeneric);
 }
 
-void CWgtPaneGenericImpl::applyGUIParams(CUserParams& params) {
-    CSliderParams& settings = params.mSliderParams;
+void CWgtPaneGenericImpl::writeSettings(CSliderParams& settings) const {
     if (mSlider)
-        settings.*mSlider->slider.value = static_cast<float>(sldrGeneric->value());
+        settings.*mSlider->slider.value = static_cast<float>(sldrGeneric->exactValue());
     writeColors(mColors, settings);
 }
 

@@ -12,11 +12,11 @@ public:
     CWgtPaneGenericImpl(QWidget* owner, EGUIMode mode);
 
     /// Writes the position and the colour; the mode's parameters have the filter switched on.
-    void applyGUIParams(CUserParams& params) override;
+    void writeSettings(CSliderParams& settings) const override;
     CThreadedCore* createCore(CARGBPlane* inPlane, CARGBPlane* outPlane, QObject* owner) override;
 
 private:
-    void addColorPicker(const char* object);
+    void addColorPicker(const orvela::PaneColor& color);
 
     const orvela::PaneSlider* mSlider;
     std::span<const orvela::PaneColor> mColors; ///< none without a slider

@@ -8,11 +8,21 @@
 #include "Utility/CGenericEx.h"
 #include "Utility/Logger.h"
 
+#include <QBoxLayout>
+#include <QCoreApplication>
+#include <QEvent>
+
+#include <algorithm>
+
 using namespace orvela;
 
 namespace {
 
 constexpr double kMiddle = 500;
+
+QString shown(const char* textOfTable) {
+    return QCoreApplication::translate("SliderTable", textOfTable);
+}
 
 // The control of the pane's form with that object name.
 template <class Control>
@@ -26,7 +36,7 @@ Control* controlOf(const IWgtPane& pane, const char* object) {
 
 } // namespace
 
-IWgtPane::IWgtPane(QWidget* owner, EGUIMode mode) : QWidget(owner), mOwner(owner), mMode(mode) {
+IWgtPane::IWgtPane(QWidget* owner, EGUIMode mode) : QWidget(owner), mMode(mode) {
     initArtwork();
 }
 
@@ -46,6 +56,24 @@ void IWgtPane::resetSliders() {
     }
 }
 
+bool IWgtPane::event(QEvent* event) {
+    if (event->type() == QEvent::Polish || event->type() == QEvent::FontChange)
+        alignColumns();
+    return QWidget::event(event);
+}
+
+// Labels of one width let all sliders begin in one column, and the pickers below them.
+void IWgtPane::alignColumns() {
+    const auto blocks = findChildren<COrvelaSliderBlockImpl*>();
+    int width = 0;
+    for (const COrvelaSliderBlockImpl* each : blocks)
+        width = std::max(width, each->labelWidth());
+    for (COrvelaSliderBlockImpl* each : blocks)
+        each->setLabelWidth(width);
+    for (const auto& [row, slider] : mPickerRows)
+        row->setContentsMargins(slider->sliderLeft() - CColorPicker::kSwatchLeft, 0, 0, 0);
+}
+
 COrvelaSliderBlockImpl* IWgtPane::block(const PaneSlider& slider) const {
     return controlOf<COrvelaSliderBlockImpl>(*this, slider.object);
 }
@@ -57,16 +85,14 @@ CColorPicker* IWgtPane::picker(const PaneColor& color) const {
 void IWgtPane::setUpSlider(COrvelaSliderBlockImpl* block, const QString& label) {
     block->setText(label);
     block->setValue(kMiddle);
-    connect(block, SIGNAL(valueChanged(double)), mOwner, SLOT(onMy_slider_valueChanged(double)));
-    connect(block, SIGNAL(stateChanged(bool)), mOwner, SLOT(onMy_slider_stateChanged(bool)));
 }
 
 void IWgtPane::setUpSlider(const PaneSlider& slider, bool on, double position) {
     const auto& [value, enabled, label, scale, stage, zones, help] = slider.slider;
     COrvelaSliderBlockImpl* control = block(slider);
-    setUpSlider(control, tr(label));
-    control->setToolTip(tr(label));
-    control->setHelp(tr(help));
+    setUpSlider(control, shown(label));
+    control->setToolTip(shown(label));
+    control->setHelp(shown(help));
     control->setZoneStops(TrackZones::set(slider.zones()));
     control->setEnabled(on);
     control->setScale(*scale);
@@ -83,8 +109,19 @@ void IWgtPane::setUpSliders(std::span<const PaneSlider> sliders, const CSliderPa
                     each.slider.value ? settings.*each.slider.value : each.initial);
 }
 
-void IWgtPane::setUpColorPicker(CColorPicker* picker, COrvelaSliderBlockImpl* slider) {
-    connect(picker, SIGNAL(colorChanged(QColor)), mOwner, SLOT(onMy_colorPicker_colorChanged(QColor)));
+void IWgtPane::setUpColorPicker(CColorPicker* picker, const PaneColor& color,
+                                COrvelaSliderBlockImpl* slider) {
+    const QString help = shown(color.color.help);
+    picker->setToolTip(help);
+    picker->setWhatsThis(help);
+    picker->setAccessibleDescription(help);
+    picker->setAccessibleName(slider->lblName->text());
+    auto* column = qobject_cast<QBoxLayout*>(slider->parentWidget()->layout());
+    column->removeWidget(picker);
+    auto* row = new QHBoxLayout;
+    row->addWidget(picker, 0, Qt::AlignLeft);
+    column->insertLayout(column->indexOf(slider) + 1, row);
+    mPickerRows.append({row, slider});
     connect(slider, &COrvelaSliderBlockImpl::stateChanged, picker, &CColorPicker::setVisible);
     picker->setVisible(slider->isEnabled());
 }
@@ -102,7 +139,7 @@ void IWgtPane::writeSliders(std::span<const PaneSlider> sliders, CSliderParams& 
             continue;
         const COrvelaSliderBlockImpl* control = block(each);
         if (each.slider.value)
-            settings.*each.slider.value = static_cast<float>(control->value());
+            settings.*each.slider.value = static_cast<float>(control->exactValue());
         settings.*each.slider.enabled = control->isEnabled();
     }
 }

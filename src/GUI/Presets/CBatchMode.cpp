@@ -1,6 +1,9 @@
 #include "GUI/Presets/CBatchMode.h"
 
+#include "GUI/Presets/CPresetStore.h"
+#include "GUI/Presets/StoreWriting.h"
 #include "Platform/Keyboard.h"
+#include "Settings/PaneTable.h"
 #include "Settings/PresetTree.h"
 #include "Settings/SettingsStore.h"
 #include "Utility/DebugBoxes.h"
@@ -19,7 +22,7 @@ const QString kMode = QStringLiteral("batchMode");
 void write(const QString& name, const QVariant& value) {
     SettingsEdit edit;
     edit.set(PresetTree::guiKey(name), value);
-    edit.commit();
+    StoreWriting::commit(edit, StoreWriting::Cause::Program);
 }
 
 } // namespace
@@ -43,6 +46,12 @@ CBatchMode::CBatchMode() {
 
 bool CBatchMode::isBatchModeEnabled() const {
     return PresetTree::switchOf(openSettings().value(PresetTree::guiKey(kEnabled)));
+}
+
+bool CBatchMode::replays() const {
+    const auto mode = static_cast<EGUIMode>(batchMode());
+    return isBatchModeEnabled() &&
+           (CPresetStore::isFactoryMode(mode) || mode == Mode_Custom || !PaneTable::sliders(mode).empty());
 }
 
 void CBatchMode::setBatchModeEnabled(bool enabled) {

@@ -1,7 +1,8 @@
 #pragma once
 
 /// The two values that let the next start replay the last operation without any dialog. They live in the
-/// settings store only: every query reads it, every change writes it.
+/// settings store only: every query reads it, every change writes it. When it cannot be written a warning
+/// names it, once, and the old value stays.
 class CBatchMode {
 public:
     /// The object, made on the first call and kept until the module is unloaded.
@@ -12,17 +13,17 @@ public:
 
     /// Whether the next start replays the last operation.
     bool isBatchModeEnabled() const;
-    /// @throws CGenericEx when the store cannot be written
     void setBatchModeEnabled(bool enabled);
+
+    /// Whether it does: there is nothing to replay before a mode was run.
+    bool replays() const;
 
     /// The number of the last recorded mode (EGUIMode); -1 when there is none.
     int batchMode() const;
-    /// @throws CGenericEx when the store cannot be written
     void setBatchMode(int mode);
 
 protected:
     /// Switches batch mode off, with a message, when the SHIFT key is held.
-    /// @throws CGenericEx when the store cannot be written
     CBatchMode();
     ~CBatchMode() = default;
 };

@@ -2,6 +2,8 @@
 
 #include "GUI/Controls/CColorPicker.h"
 #include "GUI/Controls/COrvelaSliderBlockImpl.h"
+#include "GUI/Presets/StoreWriting.h"
+#include "Settings/SettingsStore.h"
 #include "Utility/DebugBoxes.h"
 #include "Utility/Logger.h"
 
@@ -15,8 +17,13 @@ using namespace orvela;
 
 namespace {
 
-QString text(const char* source) {
-    return QCoreApplication::translate("CPresetStore", source);
+// What the store says to the user, in its own context.
+class Texts {
+    Q_DECLARE_TR_FUNCTIONS(CPresetStore)
+};
+
+void warn(const QString& text) {
+    DebugBoxes::warningBox(DebugBoxes::mainWindow(), Texts::tr("Warning"), text);
 }
 
 void warnOfMissing(const QString& object, const QString& what) {
@@ -53,22 +60,9 @@ QList<Control*> namedControls(const QWidget* parent) {
     return controls;
 }
 
-PresetContent contentOf(const QWidget* parent) {
-    PresetContent content;
-    for (const auto* block : namedControls<COrvelaSliderBlockImpl>(parent))
-        content.sliders.append({block->objectName(), block->value(), block->isEnabled()});
-    for (const auto* picker : namedControls<CColorPicker>(parent)) {
-        const QColor color = picker->color();
-        content.colors.append({picker->objectName(), color.red(), color.green(), color.blue()});
-    }
-    for (const auto* box : namedControls<QCheckBox>(parent))
-        content.checkBoxes.append({box->objectName(), box->isChecked()});
-    return content;
-}
-
 bool mayOverwrite() {
-    return QMessageBox::question(static_cast<QWidget*>(DebugBoxes::mainWindow()), text("Warning"),
-                                 text("This preset already exists. Do you want to overwrite it?"),
+    return QMessageBox::question(static_cast<QWidget*>(DebugBoxes::mainWindow()), Texts::tr("Warning"),
+                                 Texts::tr("This preset already exists. Do you want to overwrite it?"),
                                  QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes;
 }
 
@@ -85,57 +79,71 @@ QStringList listPresets(EGUIMode mode, bool excludeBatch) {
 }
 
 bool presetExists(EGUIMode mode, const QString& name) {
-    return listPresets(mode, true).contains(name);
+    return name != batchPresetName() && PresetTree::exists(mode, name);
 }
 
 bool hasPresets() {
     return PresetTree::hasPresets();
 }
 
-void removePreset(EGUIMode mode, const QString& name) {
+bool removePreset(EGUIMode mode, const QString& name) {
     SettingsEdit edit;
     PresetTree::remove(edit, mode, name);
-    edit.commit();
+    return StoreWriting::commit(edit, StoreWriting::Cause::User);
+}
+
+PresetContent contentOf(const QWidget* parent) {
+    PresetContent content;
+    for (const auto* block : namedControls<COrvelaSliderBlockImpl>(parent))
+        content.sliders.append({block->objectName(), block->exactValue(), block->isEnabled()});
+    for (const auto* picker : namedControls<CColorPicker>(parent)) {
+        const QColor color = picker->color();
+        content.colors.append({picker->objectName(), color.red(), color.green(), color.blue()});
+    }
+    for (const auto* box : namedControls<QCheckBox>(parent))
+        content.checkBoxes.append({box->objectName(), box->isChecked()});
+    return content;
+}
+
+void show(const QWidget* parent, const PresetContent& content) {
+    for (const PresetSlider& slider : content.sliders)
+        load(parent, slider);
+    for (const PresetColor& color : content.colors)
+        load(parent, color);
+    for (const PresetCheckBox& box : content.checkBoxes)
+        load(parent, box);
 }
 
 void loadPreset(QWidget* parent, EGUIMode mode, const QString& name) {
-    const std::optional<PresetContent> stored = PresetTree::read(mode, name);
-    if (!stored)
-        return;
-    for (const PresetSlider& slider : stored->sliders)
-        load(parent, slider);
-    for (const PresetColor& color : stored->colors)
-        load(parent, color);
-    for (const PresetCheckBox& box : stored->checkBoxes)
-        load(parent, box);
+    if (const std::optional<PresetContent> stored = PresetTree::read(mode, name))
+        show(parent, *stored);
 }
 
 void savePreset(QWidget* parent, EGUIMode mode, const QString& name, bool& saved, bool& isNew,
                 bool askOverwrite) {
     saved = isNew = false;
-    if (name.isEmpty()) {
-        DebugBoxes::warningBox(DebugBoxes::mainWindow(), text("Warning"), text("A preset needs a name."));
-        return;
-    }
+    if (name.isEmpty())
+        return warn(Texts::tr("A preset needs a name."));
     const bool asks = askOverwrite && presetExists(mode, name);
     if (asks && !mayOverwrite())
         return;
-    isNew = !asks;
     SettingsEdit edit;
     PresetTree::write(edit, mode, name, contentOf(parent));
-    edit.commit();
-    saved = true;
+    saved = StoreWriting::commit(edit, name == batchPresetName() ? StoreWriting::Cause::Program
+                                                                 : StoreWriting::Cause::User);
+    isNew = saved && !asks;
 }
 
 void ensureFactoryPresets(QWidget*) {
-    const QStringList stored = listPresets(Mode_Advanced, true);
+    const QSettings kept = openSettings(); // so that the file is read once
     const QStringList names = FactoryPresets::names();
-    if (std::all_of(names.begin(), names.end(), [&](const QString& name) { return stored.contains(name); }))
+    if (std::all_of(names.begin(), names.end(),
+                    [](const QString& name) { return presetExists(Mode_Advanced, name); }))
         return;
     SettingsEdit edit;
     for (const QString& name : names)
         PresetTree::write(edit, Mode_Advanced, name, FactoryPresets::contentOf(name));
-    edit.commit();
+    StoreWriting::commit(edit, StoreWriting::Cause::Program);
 }
 
 } // namespace CPresetStore

@@ -21,9 +21,12 @@ void CARGBPlaneProxy::leave(CARGBPlaneProxy* proxy) {
 }
 
 CARGBPlaneProxyDirect::CARGBPlaneProxyDirect(const CARGBPlane& plane)
-    : mPlane(plane, QStringLiteral("Proxy to original image")) {
+    : CARGBPlaneProxyDirect(plane, Private) {
     setCurrent(this);
 }
+
+CARGBPlaneProxyDirect::CARGBPlaneProxyDirect(const CARGBPlane& plane, Use)
+    : mPlane(plane, QStringLiteral("Proxy to original image")) {}
 
 CARGBPlaneProxyDirect::~CARGBPlaneProxyDirect() {
     leave(this);

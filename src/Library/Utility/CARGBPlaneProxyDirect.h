@@ -17,11 +17,14 @@ protected:
     static void leave(CARGBPlaneProxy* proxy);
 };
 
-/// Keeps its own copy of a plane and is the process-wide proxy until it is destroyed or another one is made.
+/// Keeps its own copy of a plane and is the process-wide proxy until it is destroyed or another one is made;
+/// a private one is only that of the runs that it is given to.
 class CARGBPlaneProxyDirect final : public CARGBPlaneProxy {
 public:
     /// @throws CGenericEx when the copy cannot be made
     explicit CARGBPlaneProxyDirect(const CARGBPlane& plane);
+    enum Use { Private };
+    CARGBPlaneProxyDirect(const CARGBPlane& plane, Use use);
     ~CARGBPlaneProxyDirect() override;
 
     /// A programming error for this proxy: read plane() instead. Aborts.

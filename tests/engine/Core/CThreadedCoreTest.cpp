@@ -137,7 +137,7 @@ protected:
                              CARGBPlane*) -> std::unique_ptr<TaskBase> {
             return std::make_unique<FailingAnalyzer>(context, params, in);
         };
-        runTask({"FailingAnalyzer", TaskKind::Analyzer, make});
+        runTask({"FailingAnalyzer", TaskKind::Analyzer, make}, "Failing");
         return true;
     }
 };

@@ -176,6 +176,7 @@ TEST(TaskWalker, CancelledTasksLeaveThePictureAndWhatTheyMeasureAlone) {
             Scene scene(testplanes::noise(60, 50), task.name);
             const auto before = bytes(*scene.in);
             CARGBPlane out(*testplanes::noise(60, 50, 99), QString());
+            const auto untouched = bytes(out);
             CUserParams measured = scene.params;
             scene.params.mCancelRequested = beforeTheFirstRow;
             scene.params.mProgressCallback = [&scene](int) { scene.params.mCancelRequested = true; };
@@ -183,7 +184,8 @@ TEST(TaskWalker, CancelledTasksLeaveThePictureAndWhatTheyMeasureAlone) {
             EXPECT_FALSE(made->Apply());
             EXPECT_EQ(made->outcome(), TaskOutcome::Cancelled);
             EXPECT_EQ(bytes(*scene.in), before);
-            EXPECT_TRUE(task.kind == TaskKind::Histogram || bytes(out) == before);
+            EXPECT_TRUE(task.kind == TaskKind::Histogram ||
+                        bytes(out) == (beforeTheFirstRow ? untouched : before));
             if (task.kind != TaskKind::Histogram)
                 continue;
             if (scene.params.Light_Ave == 0) // two of them clear the averages beforehand

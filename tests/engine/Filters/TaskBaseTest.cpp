@@ -107,6 +107,14 @@ TEST_F(TaskBaseTest, StopRequestEndsThePassBeforeAnyLaterRow) {
     expectUntouched();
 }
 
+TEST_F(TaskBaseTest, AStopBeforeThePassLeavesNothingToRestore) {
+    params.mCancelRequested = true;
+    filter.restores = false;
+    EXPECT_FALSE(filter.Apply());
+    EXPECT_EQ(filter.outcome(), TaskOutcome::Cancelled);
+    EXPECT_EQ(testplanes::bytes(*out), testplanes::bytes(*testplanes::noise(4, 7)));
+}
+
 TEST_F(TaskBaseTest, RowsReportTheirPercentage) {
     std::set<int> percents;
     params.mProgressCallback = [&percents](int percent) { percents.insert(percent); };

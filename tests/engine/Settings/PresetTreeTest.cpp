@@ -51,10 +51,14 @@ TEST_F(PresetTreeTest, EveryNameComesBack) {
         EXPECT_EQ(listed.removeAll(name), 1) << qPrintable(name);
         const auto stored = PresetTree::read(Mode_Advanced, name);
         EXPECT_TRUE(stored && stored->sliders.value(0).object == name) << qPrintable(name);
+        EXPECT_TRUE(PresetTree::exists(Mode_Advanced, name) && !PresetTree::exists(Mode_Portrait, name));
         SettingsEdit edit;
         PresetTree::remove(edit, Mode_Advanced, name);
         edit.commit();
+        EXPECT_FALSE(PresetTree::exists(Mode_Advanced, name)) << qPrintable(name);
     }
+    for (const char* none : {"", "Mi", "Sliders/x"})
+        EXPECT_FALSE(PresetTree::exists(Mode_Advanced, none));
     EXPECT_TRUE(listed.isEmpty()) << qPrintable(listed.join(' '));
     EXPECT_FALSE(PresetTree::hasPresets());
     SettingsEdit edit;

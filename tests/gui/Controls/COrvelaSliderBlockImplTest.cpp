@@ -1,7 +1,10 @@
 // What a slider block does as a user works with it: data/slider_block/*.txt. A line is an action and what is
-// so after it: the text, the position (dragged; off), where the focus is, and what the block told meanwhile.
+// so after it: the text, the position (the exact one, if another; dragged; off), where the focus is, and what
+// the block told meanwhile.
 
 #include "GUI/Controls/COrvelaSliderBlockImpl.h"
+
+#include "Painted.h"
 
 #include <QAccessible>
 #include <QApplication>
@@ -49,8 +52,11 @@ protected:
     QString text() const { return block.txtValue->text(); }
     void setScale(const QString& what);
     void select();
-    void doubleClick(QWidget* part);
-    void wheel(int angle);
+    void click(QWidget* part, Qt::MouseButton button);
+    void doubleClick(QWidget* part, Qt::MouseButton button);
+    void wheel(const QStringList& what);
+    void dragWithout(int x);
+    static void key(const QString& key);
     /// A pixel of the slider as a point of the row, above it.
     QPoint inRow(const QString& x) const { return {slider()->x() + x.toInt(), 1}; }
     std::string state() const;
@@ -59,13 +65,13 @@ protected:
     QWidget window;
     COrvelaSliderBlockImpl block{&window};
     COrvelaSliderBlockImpl next{&window};
-    const std::map<QString, QWidget*> parts = {{"name", block.lblName},
-                                               {"slider", slider()},
-                                               {"text", block.txtValue},
-                                               {"next slider", next.sldrValue},
+    const std::map<QString, QWidget*> parts = {{"lamp", block.lmpState},     {"name", block.lblName},
+                                               {"slider", slider()},         {"text", block.txtValue},
+                                               {"next lamp", next.lmpState}, {"next slider", next.sldrValue},
                                                {"next text", next.txtValue}};
     using Text = const QString&;
     static constexpr Qt::MouseButton kLeft = Qt::LeftButton;
+    static constexpr Qt::MouseButton kRight = Qt::RightButton;
     const std::map<QString, std::function<void(Text)>> actions = {
         {"scale", [this](Text what) { setScale(what); }},
         {"set", [this](Text position) { block.setValue(position.toDouble()); }},
@@ -73,14 +79,17 @@ protected:
         {"switch", [this](Text to) { block.setEnabled(to == "on"); }},
         {"window", [this](Text to) { window.setEnabled(to == "on"); }},
         {"focus", [this](Text part) { parts.at(part)->setFocus(); }},
-        {"key",
-         [](Text key) { QTest::keyClick(QApplication::focusWidget(), Qt::Key(QKeySequence(key)[0].key())); }},
+        {"key", [](Text sequence) { key(sequence); }},
         {"type", [this](Text keys) { select(), QTest::keyClicks(block.txtValue, keys); }},
         {"paste",
          [this](Text text) { select(), QApplication::clipboard()->setText(text), block.txtValue->paste(); }},
         {"tip", [this](Text) { told << QToolTip::text(); }},
-        {"double", [this](Text part) { doubleClick(parts.at(part)); }},
-        {"wheel", [this](Text angle) { wheel(angle.toInt()); }},
+        {"click", [this](Text part) { click(parts.at(part), kLeft); }},
+        {"right-click", [this](Text part) { click(parts.at(part), kRight); }},
+        {"double", [this](Text part) { doubleClick(parts.at(part), kLeft); }},
+        {"right-double", [this](Text part) { doubleClick(parts.at(part), kRight); }},
+        {"right-move", [this](Text x) { dragWithout(x.toInt()); }},
+        {"wheel", [this](Text what) { wheel(what.split(' ')); }},
         {"press", [this](Text x) { QTest::mousePress(slider(), kLeft, {}, QPoint(x.toInt(), 3)); }},
         {"move", [this](Text x) { QTest::mouseMove(slider(), QPoint(x.toInt(), 3)); }},
         {"release", [this](Text x) { QTest::mouseRelease(slider(), kLeft, {}, QPoint(x.toInt(), 3)); }},
@@ -91,7 +100,10 @@ protected:
 
 void COrvelaSliderBlockImplTest::setScale(const QString& what) {
     const QStringList words = what.split(' ');
-    block.setScale(words[0] == "Shadows" ? SliderScales::Shadows : SliderScales::Temperature);
+    const std::map<QString, SliderScale> scales = {{"Shadows", SliderScales::Shadows},
+                                                   {"Highlights", SliderScales::Highlights},
+                                                   {"Temperature", SliderScales::Temperature}};
+    block.setScale(scales.at(words[0]));
     block.setMinMax(words.at(1).toDouble(), words.at(2).toDouble());
 }
 
@@ -100,25 +112,51 @@ void COrvelaSliderBlockImplTest::select() {
     block.txtValue->selectAll();
 }
 
-void COrvelaSliderBlockImplTest::doubleClick(QWidget* part) {
-    const QPoint point = part->mapTo(&window, part->rect().center());
-    QTest::mouseDClick(window.windowHandle(), Qt::LeftButton, {}, point);
+void COrvelaSliderBlockImplTest::click(QWidget* part, Qt::MouseButton button) {
+    QTest::mouseClick(window.windowHandle(), button, {}, part->mapTo(&window, part->rect().center()));
 }
 
-void COrvelaSliderBlockImplTest::wheel(int angle) {
-    QWheelEvent event({50, 3}, slider()->mapToGlobal(QPointF(50, 3)), {}, {0, angle}, Qt::NoButton, {},
-                      Qt::NoScrollPhase, false);
-    QCoreApplication::sendEvent(slider(), &event);
+void COrvelaSliderBlockImplTest::doubleClick(QWidget* part, Qt::MouseButton button) {
+    QTest::mouseDClick(window.windowHandle(), button, {}, part->mapTo(&window, part->rect().center()));
+}
+
+// As the toolkit hands it on: to the part under the mouse and, while it is ignored, to what surrounds it.
+void COrvelaSliderBlockImplTest::wheel(const QStringList& what) {
+    const Qt::KeyboardModifiers keys = what.size() > 2 ? Qt::ControlModifier : Qt::NoModifier;
+    for (QWidget* part = parts.at(what[0]); part; part = part->parentWidget()) {
+        QWheelEvent event({3, 3}, part->mapToGlobal(QPointF(3, 3)), {}, {0, what.at(1).toInt()}, Qt::NoButton,
+                          keys, Qt::NoScrollPhase, false);
+        QCoreApplication::sendEvent(part, &event);
+        if (event.isAccepted())
+            return;
+    }
+}
+
+// A move with another button held, which the slider gets without a drag.
+void COrvelaSliderBlockImplTest::dragWithout(int x) {
+    QMouseEvent move(QEvent::MouseMove, QPointF(x, 3), slider()->mapToGlobal(QPointF(x, 3)), Qt::NoButton,
+                     kRight, {});
+    QCoreApplication::sendEvent(slider(), &move);
+}
+
+void COrvelaSliderBlockImplTest::key(const QString& key) {
+    const QKeyCombination combination = QKeySequence(key)[0];
+    QTest::keyClick(QApplication::focusWidget(), combination.key(), combination.keyboardModifiers());
 }
 
 std::string COrvelaSliderBlockImplTest::state() const {
     const bool on = block.isEnabled();
     EXPECT_TRUE(slider()->isEnabledTo(&block) == on && block.txtValue->font().italic() != on);
+    EXPECT_EQ(block.lmpState->isChecked(), on);
     EXPECT_TRUE(block.lblName->isEnabledTo(&block));
     EXPECT_EQ(slider()->hasMouseTracking(), slider()->isDragging());
     const auto focused =
         std::find_if(parts.begin(), parts.end(), [](const auto& part) { return part.second->hasFocus(); });
-    const QString position = QString::number(block.value()) + (slider()->isDragging() ? " dragged" : "");
+    QString position = QString::number(block.value());
+    if (block.exactValue() != block.value())
+        position += " for " + QString::number(block.exactValue());
+    if (slider()->isDragging())
+        position += " dragged";
     const QString focus = focused == parts.end() ? QStringLiteral("-") : focused->first;
     const QStringList words = {text(), position + (on ? "" : " off"), focus, told.join(' ')};
     return words.join(" | ").trimmed().toStdString();
@@ -160,20 +198,81 @@ TEST_F(COrvelaSliderBlockImplTest, AKeyAlwaysMovesTheShownNumber) {
 }
 
 TEST_F(COrvelaSliderBlockImplTest, TellsAssistiveToolsNameRoleAndValue) {
-    block.setValue(250);
+    block.setScale(SliderScales::Temperature);
+    block.setMinMax(2000, 10000);
+    block.setHelp(QStringLiteral("Warmer or cooler."));
+    block.setValue(500);
     QAccessibleInterface* access = QAccessible::queryAccessibleInterface(slider());
     ASSERT_TRUE(access && access->valueInterface());
     EXPECT_EQ(access->role(), QAccessible::Slider);
     EXPECT_EQ(access->text(QAccessible::Name), QStringLiteral("Fade"));
-    EXPECT_EQ(access->text(QAccessible::Value), QStringLiteral("25.0"));
-    access->valueInterface()->setCurrentValue(2000);
-    EXPECT_EQ(text(), "100.0");
-    block.setEnabled(false);
-    access->valueInterface()->setCurrentValue(500);
-    EXPECT_EQ(block.value(), 1000);
+    EXPECT_EQ(access->text(QAccessible::Value), QStringLiteral("6000.0"));
+    QAccessibleValueInterface* value = access->valueInterface();
+    EXPECT_EQ(value->currentValue(), QVariant(6000.0));
+    EXPECT_EQ(value->minimumValue(), QVariant(2000.0));
+    EXPECT_EQ(value->maximumValue(), QVariant(10000.0));
+    EXPECT_EQ(value->minimumStepSize(), QVariant(80.0));
+    value->setCurrentValue(6080);
+    EXPECT_EQ(block.value(), 510);
+    value->setCurrentValue(1e9);
+    EXPECT_EQ(text(), "10000.0");
+    QAccessibleInterface* lamp = QAccessible::queryAccessibleInterface(block.lmpState);
+    ASSERT_TRUE(lamp && lamp->actionInterface());
+    EXPECT_EQ(lamp->role(), QAccessible::CheckBox);
+    EXPECT_EQ(lamp->text(QAccessible::Name), QStringLiteral("Fade"));
+    EXPECT_EQ(lamp->text(QAccessible::Description), QStringLiteral("Warmer or cooler."));
+    EXPECT_TRUE(lamp->state().checkable && lamp->state().checked);
+    lamp->actionInterface()->doAction(QAccessibleActionInterface::toggleAction());
+    EXPECT_FALSE(lamp->state().checked || block.isEnabled());
+    value->setCurrentValue(2000);
+    EXPECT_EQ(block.value(), 1000) << "it is off";
     EXPECT_EQ(QAccessible::queryAccessibleInterface(&block)->role(), QAccessible::Grouping);
     EXPECT_EQ(QAccessible::queryAccessibleInterface(block.txtValue)->text(QAccessible::Name),
               QStringLiteral("Fade"));
+}
+
+// How far the brightest pixel of the slider's row is from the ground, 0 to 255.
+int contrast(QWidget& window, const QWidget* slider) {
+    const QImage image = painted(window);
+    const int ground = qGray(image.pixel(1, 1));
+    const QRect place(slider->mapTo(&window, QPoint(0, 0)), slider->size());
+    int most = 0;
+    for (int y = place.top(); y <= place.bottom(); ++y)
+        for (int x = place.left() + 20; x <= place.right(); ++x)
+            most = std::max(most, std::abs(qGray(image.pixel(x, y)) - ground));
+    return most;
+}
+
+TEST_F(COrvelaSliderBlockImplTest, OffIsQuietestAndDisabledSurroundingsOnlyDim) {
+    for (const QColor& ground : {QColor(53, 53, 53), QColor(239, 239, 239)}) {
+        window.setPalette(QPalette(ground));
+        block.setZoneStops({{0, QColor(255, 120, 0)}, {1000, QColor(255, 120, 0)}});
+        block.setValue(0); // the handle stands apart, at the left
+        window.setFocus();
+        const int on = contrast(window, slider());
+        window.setEnabled(false);
+        const int dimmed = contrast(window, slider());
+        window.setEnabled(true);
+        block.setEnabled(false);
+        const int off = contrast(window, slider());
+        EXPECT_LT(off, dimmed);
+        EXPECT_LT(dimmed, on);
+        window.setEnabled(false);
+        EXPECT_EQ(contrast(window, slider()), off) << "off looks as it did";
+        window.setEnabled(true);
+        block.setEnabled(true);
+    }
+}
+
+TEST_F(COrvelaSliderBlockImplTest, TheFocusIsARingAroundTheSlider) {
+    const auto ring = [this] { return painted(window).pixelColor(slider()->mapTo(&window, QPoint(50, -3))); };
+    for (const QColor& ground : {QColor(53, 53, 53), QColor(239, 239, 239)}) {
+        window.setPalette(QPalette(ground));
+        next.sldrValue->setFocus();
+        EXPECT_EQ(ring(), ground);
+        slider()->setFocus();
+        EXPECT_GT(std::abs(qGray(ring().rgb()) - qGray(ground.rgb())), 128);
+    }
 }
 
 } // namespace

@@ -28,6 +28,8 @@ TEST(CWgtPaneFinalTouchImpl, ColorFiltersAndPickersMirrorEachOther) {
         QTest::keyClicks(sliders[from]->txtValue, from == 0 ? "12.3" : "45.6");
         EXPECT_EQ(sliders[from]->txtValue->text(), QLatin1String(from == 0 ? "12.3" : "45.6"));
         EXPECT_NEAR(sliders[to]->value(), from == 0 ? 123 : 456, 1e-9);
+        sliders[from]->setValue(501.17);
+        EXPECT_EQ(sliders[to]->exactValue(), 501.17) << "which the text does not tell";
         CThinHorizontalSlider* thin = sliders[from]->sldrValue;
         QTest::mouseClick(thin, Qt::LeftButton, {}, QPoint(thin->width() / 3, 3));
         EXPECT_GT(sliders[to]->value(), 300);

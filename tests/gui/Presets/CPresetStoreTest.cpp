@@ -3,12 +3,13 @@
 #include "GUI/Controls/CColorPicker.h"
 #include "GUI/Controls/COrvelaSliderBlockImpl.h"
 #include "GUI/Panes/CWgtPaneAdvancedImpl.h"
+#include "GUI/Presets/CBatchMode.h"
 #include "Settings/SettingsStore.h"
-#include "Utility/CGenericEx.h"
 #include "gui/Panes/PaneFixture.h"
 #include "support/BoxAnswer.h"
 #include "support/BoxRecorder.h"
 #include "support/LogCapture.h"
+#include "support/SettingsMap.h"
 
 #include <QCheckBox>
 #include <QDir>
@@ -33,7 +34,7 @@ protected:
         return saved;
     }
 
-    RecordingOwner pane;
+    QWidget pane;
     QWidget inner{&pane};
     COrvelaSliderBlockImpl* first = new COrvelaSliderBlockImpl(&inner);
     COrvelaSliderBlockImpl* second = new COrvelaSliderBlockImpl(&pane);
@@ -118,14 +119,32 @@ TEST_F(CPresetStoreTest, AsksBeforeOverwriting) {
     EXPECT_TRUE(CPresetStore::hasPresets());
 }
 
-TEST_F(CPresetStoreTest, ReportsWhatCannotBeWritten) {
+TEST_F(CPresetStoreTest, AStoreThatCannotBeWrittenIsWarnedOfAndStopsNothing) {
     const QString path = openSettings().fileName();
-    QFile::remove(path);
-    ASSERT_TRUE(QDir().mkpath(path));
-    EXPECT_THROW(save("x"), CGenericEx);
-    EXPECT_FALSE(saved || CPresetStore::hasPresets());
-    EXPECT_THROW(CPresetStore::ensureFactoryPresets(&pane), CGenericEx);
-    ASSERT_TRUE(QDir().rmdir(path));
+    const auto warnings = [&path](const std::function<void()>& action) {
+        const QStringList said = boxes(action);
+        for (const QString& each : said)
+            EXPECT_TRUE(each.startsWith("Warning|") && each.contains(path)) << qPrintable(each);
+        return said.size();
+    };
+    const auto nobodyAsked = [this] {
+        CPresetStore::ensureFactoryPresets(&pane);
+        CBatchMode::instance().setBatchMode(Mode_Advanced);
+        EXPECT_FALSE(save(CPresetStore::batchPresetName().toUtf8()));
+    };
+    ASSERT_TRUE(save("kept"));
+    for (int time : {1, 2}) {
+        QFile::remove(path);
+        ASSERT_TRUE(QDir().mkpath(path));
+        EXPECT_EQ(warnings(nobodyAsked), 1) << "of the first alone";
+        EXPECT_EQ(warnings(nobodyAsked), 0);
+        for (const char* name : {"x", "x"})
+            EXPECT_EQ(warnings([&] { EXPECT_FALSE(save(name) || isNew); }), 1) << "asked for, so always";
+        EXPECT_EQ(warnings([] { EXPECT_FALSE(CPresetStore::removePreset(Mode_Advanced, "x")); }), 1);
+        EXPECT_FALSE(CPresetStore::hasPresets());
+        ASSERT_TRUE(QDir().rmdir(path));
+        EXPECT_EQ(warnings([&] { EXPECT_TRUE(save("x")) << time; }), 0);
+    }
 }
 
 TEST_F(CPresetStoreTest, FactoryPresetsAreTheModesAsTheirPaneWouldSaveThem) {
@@ -150,13 +169,12 @@ TEST_F(CPresetStoreTest, FactoryPresetsAreTheModesAsTheirPaneWouldSaveThem) {
         CPresetStore::savePreset(shown.pane, Mode_Advanced, name, saved, isNew, false);
         CUserParams params;
         shown.pane->applyGUIParams(params);
-        for (const auto& [object, slider, initial, zones, mirror] : PaneTable::sliders(Mode_Advanced)) {
-            const auto text = [&slider = slider](const CSliderParams& settings) {
-                return (slider.value ? slider.scale->text(settings.*slider.value) : QString()) +
-                       (settings.*slider.enabled ? " on" : " off");
-            };
-            EXPECT_EQ(text(params.mSliderParams), text(factory.mSliderParams)) << object;
-        }
+        EXPECT_EQ(settingsOf(params.mSliderParams), settingsOf(factory.mSliderParams))
+            << "as the command has it";
+        shown.pane->setSliders("Automatic");
+        CPresetStore::loadPreset(shown.pane, Mode_Advanced, name);
+        shown.pane->applyGUIParams(params);
+        EXPECT_EQ(settingsOf(params.mSliderParams), settingsOf(factory.mSliderParams)) << "from the store";
     }
     EXPECT_EQ(lines(), written);
     EXPECT_EQ(boxes([] {

@@ -22,17 +22,16 @@ struct Answer {
 /// Runs the built program as a user does, in a folder of its own.
 class ProgramTest : public testing::Test {
 protected:
-    /// Runs `orvela` with the arguments, which are parted by blanks.
+    /// Runs `orvela` with the arguments, which are parted by blanks but in double quotes.
     Answer orvela(const char* arguments) {
         QProcess process;
         begin(process, arguments);
         return finish(process);
     }
 
-    void begin(QProcess& process, const char* arguments) {
+    void begin(QProcess& process, const char* arguments, const char* program = ORVELA_PROGRAM) {
         process.setWorkingDirectory(mFolder.path());
-        process.start(QStringLiteral(ORVELA_PROGRAM),
-                      QString::fromUtf8(arguments).split(QLatin1Char(' '), Qt::SkipEmptyParts));
+        process.start(QString::fromUtf8(program), QProcess::splitCommand(QString::fromUtf8(arguments)));
         ASSERT_TRUE(process.waitForStarted());
     }
 

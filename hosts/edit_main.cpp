@@ -1,0 +1,5 @@
+#include "edit/Edit.h"
+
+int main(int argc, char** argv) {
+    return orvela::runEdit(argc, argv);
+}

@@ -1,0 +1,5 @@
+#include "GUI/Windows/CDlgSinglePreviewImpl.h"
+
+CDlgSinglePreviewImpl::CDlgSinglePreviewImpl(QWidget* parent) : PreviewWindow(parent) {
+    setupUi(this);
+}

@@ -1,0 +1,89 @@
+#include "Platform/WebPost.h"
+
+#include <windows.h>
+#include <wininet.h>
+
+#include <exception>
+#include <functional>
+#include <future>
+#include <memory>
+#include <type_traits>
+
+namespace orvela {
+
+namespace WebPost {
+
+namespace {
+
+struct Closer {
+    void operator()(HINTERNET handle) const { InternetCloseHandle(handle); }
+};
+using Handle = std::unique_ptr<std::remove_pointer_t<HINTERNET>, Closer>;
+
+constexpr DWORD kRequestFlags = 1;
+constexpr DWORD kUntilZero = static_cast<DWORD>(-1); // the header ends at its terminating zero
+constexpr char kHeader[] = "Content-Type: application/x-www-form-urlencoded\r\n";
+
+Reply failure(const char* text) {
+    return {{}, QString::fromLatin1(text)};
+}
+
+QByteArray readAll(HINTERNET request) {
+    QByteArray body;
+    char piece[1024];
+    DWORD count = 0;
+    while (body.size() < kMostBytes && InternetReadFile(request, piece, sizeof piece, &count) && count > 0)
+        body.append(piece, static_cast<int>(count));
+    return body.left(kMostBytes);
+}
+
+Reply transfer(HINTERNET internet, const Form& form) {
+    const Handle connection(InternetConnectA(internet, form.host.toLatin1().constData(), form.port, "", "",
+                                             INTERNET_SERVICE_HTTP, 0, 0));
+    if (!connection)
+        return failure("Unable to etablish contact with server.");
+    const Handle request(HttpOpenRequestA(connection.get(), "POST", form.path.constData(), nullptr, nullptr,
+                                          nullptr, kRequestFlags, 0));
+    if (!request)
+        return failure("Unable to etablish contact with server.");
+    QByteArray body = form.body; // the call takes no constant
+    if (!HttpSendRequestA(request.get(), kHeader, kUntilZero, body.data(), static_cast<DWORD>(body.size())))
+        return failure("Unable to send data to server.");
+    return {readAll(request.get()), {}};
+}
+
+void limitEachCall(HINTERNET internet, std::chrono::milliseconds limit) {
+    auto milliseconds = static_cast<DWORD>(limit.count());
+    for (const DWORD option :
+         {INTERNET_OPTION_CONNECT_TIMEOUT, INTERNET_OPTION_SEND_TIMEOUT, INTERNET_OPTION_RECEIVE_TIMEOUT})
+        InternetSetOptionA(internet, option, &milliseconds, sizeof milliseconds);
+    DWORD once = 1;
+    InternetSetOptionA(internet, INTERNET_OPTION_CONNECT_RETRIES, &once, sizeof once);
+}
+
+} // namespace
+
+// The calls have no limit for a transfer as a whole: another thread makes them, and closing the handle that
+// theirs descend from cancels them, as the system's documentation has it. Should one not notice, its own
+// limit ends it; only the lookup of a name has none. The thread is waited for in any case, since the module
+// may be unloaded once this returns. Not yet seen on Windows.
+Reply post(const Form& form) {
+    Handle internet(InternetOpenA(form.agent.constData(), INTERNET_OPEN_TYPE_PRECONFIG, nullptr, nullptr, 0));
+    if (!internet)
+        return failure("No internet connection has been detected.");
+    limitEachCall(internet.get(), form.limit);
+    try {
+        auto reply = std::async(std::launch::async, transfer, internet.get(), std::cref(form));
+        const bool isLate = reply.wait_for(form.limit) == std::future_status::timeout;
+        if (isLate)
+            internet.reset();
+        Reply received = reply.get();
+        return isLate ? failure("Unable to send data to server.") : received;
+    } catch (const std::exception&) { // no thread or no memory to be had
+        return failure("No internet connection has been detected.");
+    }
+}
+
+} // namespace WebPost
+
+} // namespace orvela

@@ -1,0 +1,127 @@
+// A processing window that is closed, in whichever state, leaves nothing behind.
+
+#include "GUI/Controls/CColorPicker.h"
+#include "GUI/Controls/CThinHorizontalSlider.h"
+#include "GUI/Presets/CPresetStore.h"
+#include "gui/Windows/RunsFixture.h"
+
+#include <QComboBox>
+#include <QContextMenuEvent>
+#include <QDir>
+
+using namespace orvela;
+
+namespace {
+
+qsizetype threads() {
+    return QDir(QStringLiteral("/proc/self/task")).entryList(QDir::Dirs | QDir::NoDotAndDotDot).size();
+}
+
+struct State {
+    const char* name;
+    EGUIMode mode;
+    std::function<void(ProcessingWindow&)> lead; ///< leads there
+    bool popup = false;                          ///< something is open then
+};
+
+void atAStep(ProcessingWindow& opened, const std::function<void()>& user) {
+    QObject::connect(opened.core(), &CThreadedCore::stepDone, &opened.window, [user](int step) {
+        if (step == 3)
+            user();
+    });
+    opened.click("btnRefresh");
+}
+
+void moveSlider(ProcessingWindow& opened) {
+    auto* block = opened.window.findChildren<COrvelaSliderBlockImpl*>().first();
+    block->setEnabled(true);
+    block->sldrValue->moveTo(block->value() + 50);
+}
+
+void close(ProcessingWindow& opened) {
+    opened.window.close();
+}
+
+const State kStates[] = {
+    {"nothing happened", Mode_Advanced, close},
+    {"a run is under way", Mode_Advanced, [](auto& opened) { atAStep(opened, [&] { close(opened); }); }},
+    {"its result is to be applied", Mode_Advanced,
+     [](auto& opened) {
+         atAStep(opened, [&] {
+             opened.click("btnOK");
+             close(opened);
+         });
+     }},
+    {"another run is to come", Mode_Advanced,
+     [](auto& opened) {
+         atAStep(opened, [&] { opened.window.on_btnRefresh_clicked(); });
+         close(opened);
+     }},
+    {"a refresh is to come by itself", Mode_Adjustments,
+     [](auto& opened) {
+         opened.click("chkBxAutoRefresh");
+         moveSlider(opened);
+         EXPECT_TRUE(opened.refreshTimer()->isActive());
+         close(opened);
+     }},
+    {"a draft is being made", Mode_Advanced,
+     [](auto& opened) {
+         moveSlider(opened);
+         QCoreApplication::processEvents(); // it has begun
+         close(opened);
+     }},
+    {"the previews are split", Mode_Advanced,
+     [](auto& opened) {
+         opened.click("btnSplitPreviews");
+         close(opened);
+     }},
+    {"the list of presets is open", Mode_Advanced,
+     [](auto& opened) { opened.template find<QComboBox>("lstBxPreset")->showPopup(); }, true},
+    {"the colour field is open", Mode_ColorFilter,
+     [](auto& opened) {
+         opened.window.template findChild<COrvelaSliderBlockImpl*>()->setEnabled(true);
+         QTest::keyClick(opened.window.template findChild<CColorPicker*>(), Qt::Key_Space);
+     },
+     true},
+    {"the menu of undo is open", Mode_Adjustments,
+     [](auto& opened) {
+         auto* pane = opened.window.template findChild<IWgtPane*>();
+         QContextMenuEvent asked(QContextMenuEvent::Keyboard, QPoint(5, 5), pane->mapToGlobal(QPoint(5, 5)));
+         QApplication::sendEvent(pane, &asked);
+     },
+     true},
+};
+
+TEST(ClosedWindow, LeavesNothingWhateverItWasIn) {
+    { // threads and windows that are made once
+        ProcessingWindow first(Mode_Advanced, testplanes::noise(72, 48));
+        first.run([&] { first.click("btnOK"); });
+    }
+    const QStringList presets = CPresetStore::listPresets(Mode_Advanced, true);
+    for (const State& state : kStates) {
+        SCOPED_TRACE(state.name);
+        const qsizetype windows = QApplication::topLevelWidgets().size();
+        const qsizetype before = threads();
+        {
+            ProcessingWindow opened(state.mode, testplanes::noise(72, 48));
+            opened.run([&] {
+                if (state.popup)
+                    QTimer::singleShot(20, &opened.window, [&] {
+                        EXPECT_TRUE(QApplication::activePopupWidget());
+                        close(opened);
+                    });
+                state.lead(opened);
+            });
+            EXPECT_FALSE(opened.window.isVisible() || opened.window.appliesOnFinish());
+            EXPECT_FALSE(QApplication::activePopupWidget());
+            for (const QTimer* timer : opened.window.findChildren<QTimer*>())
+                EXPECT_FALSE(timer->isActive()) << qPrintable(timer->objectName()) << timer->interval();
+        }
+        QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+        EXPECT_EQ(QApplication::topLevelWidgets().size(), windows);
+        EXPECT_TRUE(QTest::qWaitFor([&] { return threads() == before; })) << threads() << " of " << before;
+        EXPECT_EQ(CPresetStore::listPresets(Mode_Advanced, true), presets);
+    }
+}
+
+} // namespace
