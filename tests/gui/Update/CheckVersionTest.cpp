@@ -72,38 +72,33 @@ const QString kMajor = QStringLiteral("Newer version of Orvela is available. You
 } // namespace
 
 TEST_F(CheckVersionTest, TellsOfNewerVersionsOnly) {
+    const QByteArray zeros(2000, '0');
     const struct {
-        const char* answer;
+        QByteArray answer;
         QString message;
         QVariant update;
         bool timed;
     } cases[] = {
         {"2.5", kMinor.arg("2.5"), "2.5", true},
+        // The settings keep what the server said, the message has room for a number.
+        {"2.5" + zeros, kMinor.arg("2.500000000000000000"), QString("2.5" + zeros), true},
         {"2.01", kMinor.arg("2.01"), "2.01", true},
         {"3.1", kMajor.arg("3.1"), double(3.1F), true},
         {"10", kMajor.arg("10"), 10.0, true},
         {"2.0", {}, {}, true},
         {"1.9", {}, {}, false},
-        {"-3", {}, {}, false},
         {"no number", {}, {}, false},
         {"inf", {}, {}, false},
         {"nan", {}, {}, false},
     };
     for (const auto& [answer, message, update, timed] : cases) {
-        const Checked checked = checkAnswer(QByteArray("Kestrand_Server_Said ") + answer);
-        EXPECT_EQ(checked.messages, message.isEmpty() ? QStringList() : QStringList(message)) << answer;
-        EXPECT_EQ(checked.update, update) << answer;
-        EXPECT_EQ(checked.timed, timed) << answer;
+        const Checked checked = checkAnswer("Kestrand_Server_Said " + answer);
+        EXPECT_EQ(checked.messages, message.isEmpty() ? QStringList() : QStringList(message))
+            << answer.left(9).constData();
+        EXPECT_EQ(checked.update, update) << answer.left(9).constData();
+        EXPECT_EQ(checked.timed, timed) << answer.left(9).constData();
     }
     EXPECT_EQ(mServer.requests.size(), std::size(cases));
-}
-
-// The settings keep what the server said, the message has room for a number.
-TEST_F(CheckVersionTest, ShowsNoMoreOfAnAnswerThanANumberNeeds) {
-    const QByteArray answer = "2.5" + QByteArray(2000, '0');
-    const Checked checked = checkAnswer("Kestrand_Server_Said " + answer);
-    EXPECT_EQ(checked.messages, QStringList(kMinor.arg("2.500000000000000000")));
-    EXPECT_EQ(checked.update, QString(answer));
 }
 
 TEST_F(CheckVersionTest, IsSilentWhereTheAnswerIsNone) {
@@ -129,26 +124,15 @@ TEST_F(CheckVersionTest, IsSilentWhereTheAnswerIsNone) {
     }
 }
 
-TEST_F(CheckVersionTest, IsSilentWhereNothingComesOrTooSlowly) {
-    const auto asks = [this](const QByteArray& address) {
-        openSettings().clear();
-        const EnvironmentVariable name("ORVELA_UPDATE_SERVER", address);
-        const Checked checked = check();
-        return checked.messages.isEmpty() && !checked.update.isValid() && checked.timed;
-    };
-    HttpServer hangingUp({}, HttpServer::ByHangingUp);
-    EXPECT_TRUE(asks(hangingUp.address()));
-    HttpServer slow("Kestrand_Server_Said 2.5" + QByteArray(1 << 20, ' '), HttpServer::LittleByLittle);
-    EXPECT_TRUE(asks(slow.address()));
+TEST_F(CheckVersionTest, IsSilentWhereNothingComes) {
     HttpServer silent({}, HttpServer::WithNothing);
+    const EnvironmentVariable name("ORVELA_UPDATE_SERVER", silent.address());
     QElapsedTimer time;
     time.start();
-    EXPECT_TRUE(asks(silent.address()));
+    const Checked checked = check();
     EXPECT_LT(time.elapsed(), 5000) << "the start is held up";
-    EXPECT_FALSE(hangingUp.requests.isEmpty() || slow.requests.isEmpty() || silent.requests.isEmpty());
-    const QByteArray closed = hangingUp.address();
-    hangingUp.close();
-    EXPECT_TRUE(asks(closed));
+    EXPECT_TRUE(checked.messages.isEmpty() && !checked.update.isValid() && checked.timed);
+    EXPECT_EQ(silent.requests.size(), 1);
 }
 
 TEST_F(CheckVersionTest, TakesAnAnswerThatFillsTheBufferAndEndsItAtAZero) {
