@@ -204,22 +204,6 @@ TEST(Translations, KnowsEveryTextOfTheTables) {
     }
 }
 
-TEST(Translations, TellsTheStepsOfARun) {
-    const Language german(QStringLiteral("de"));
-    ProcessingWindow driven(Mode_Advanced, testplanes::noise(32, 24));
-    QStringList steps;
-    driven.run([&] {
-        const auto* progress = driven.find<COrvelaStatusIndicator>("prgBrCoreStatus");
-        QObject::connect(driven.core(), &CThreadedCore::stepDone, progress,
-                         [&] { steps.append(progress->stepName()); });
-        driven.click("btnRefresh");
-        EXPECT_EQ(progress->toolTip(), progress->stepName());
-        driven.window.reject();
-    });
-    EXPECT_TRUE(steps.contains("Automatisches Gamma, erster Durchgang")) << qPrintable(steps.join('|'));
-    EXPECT_TRUE(steps.filter(QRegularExpression("Histo|_|Copying|Done|Super")).isEmpty());
-}
-
 // The log and the command line can be searched for the text of the sources.
 TEST(Translations, SaysInBoxesOnlyWhyThingsFail) {
     const Language german(QStringLiteral("de"));
@@ -246,19 +230,24 @@ TEST(Translations, SaysInBoxesOnlyWhyThingsFail) {
     EXPECT_EQ(Translations::causeOf({"of a library", false}), "of a library");
 }
 
-TEST(Translations, LeavesKeysAsTheyAreAndSpeaksWithButtonsOfTheToolkitToo) {
+TEST(Translations, TellsTheStepsOfARunAndLeavesKeysAsTheyAre) {
     const Language german(QStringLiteral("de"));
-    EXPECT_EQ(Translations::modeName(Mode_AddIllumination), "Mehr Licht");
-    EXPECT_EQ(getModeAsString(Mode_AddIllumination), "Add Illumination");
     QMessageBox box(QMessageBox::Question, {}, {}, QMessageBox::Yes | QMessageBox::No);
     EXPECT_EQ(box.button(QMessageBox::No)->text(), "&Nein");
-    openSettings().clear();
     ProcessingWindow driven(Mode_Advanced, testplanes::noise(32, 24));
+    QStringList steps;
     driven.run([&] {
         EXPECT_EQ(driven.window.windowTitle(), "Erweitert");
-        EXPECT_EQ(openSettings().allKeys().filter("2000/UserPresets/Advanced/LandscapePro/").isEmpty(),
-                  false);
+        const QStringList keys = openSettings().allKeys();
+        EXPECT_FALSE(keys.filter("2000/UserPresets/Advanced/LandscapePro/").isEmpty());
         EXPECT_TRUE(driven.find<QComboBox>("lstBxPreset")->findText("LandscapePro") >= 0);
+        const auto* progress = driven.find<COrvelaStatusIndicator>("prgBrCoreStatus");
+        QObject::connect(driven.core(), &CThreadedCore::stepDone, progress,
+                         [&] { steps.append(progress->stepName()); });
+        driven.click("btnRefresh");
+        EXPECT_EQ(progress->toolTip(), progress->stepName());
         driven.window.reject();
     });
+    EXPECT_TRUE(steps.contains("Automatisches Gamma, erster Durchgang")) << qPrintable(steps.join('|'));
+    EXPECT_TRUE(steps.filter(QRegularExpression("Histo|_|Copying|Done|Super")).isEmpty());
 }
