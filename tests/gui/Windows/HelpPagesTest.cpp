@@ -9,9 +9,7 @@
 #include <QRegularExpression>
 #include <QSet>
 #include <QTextBlock>
-#include <QTextCursor>
 #include <QTextDocument>
-#include <QTextTable>
 
 #include <gtest/gtest.h>
 
@@ -30,43 +28,24 @@ std::unique_ptr<QTextDocument> pageAt(const QUrl& address) {
     return page;
 }
 
-/// A paragraph of a page, or the row of a table.
-struct Part {
-    QString heading; ///< that it stands under
-    QStringList cells;
-};
-
-QList<Part> partsOf(const QTextDocument& page) {
-    QList<Part> parts;
-    QString heading;
-    std::pair<const QTextTable*, int> before{nullptr, 0};
-    for (QTextBlock block = page.begin(); block.isValid(); block = block.next()) {
-        if (block.blockFormat().headingLevel() > 0)
-            heading = block.text();
-        const QTextTable* table = QTextCursor(block).currentTable();
-        const std::pair row(table, table ? table->cellAt(block.position()).row() : 0);
-        if (table && row == before)
-            parts.last().cells.append(block.text());
-        else
-            parts.append({heading, {block.text()}});
-        before = row;
-    }
-    return parts;
-}
-
 /// Where a page states the range of a slider: at the beginning of a paragraph under a heading of its label,
 /// or in a row of a table that names it.
 QStringList statementsAbout(const QString& label, const QTextDocument& page) {
+    static const QRegularExpression link(QStringLiteral("\\[([^]]*)\\]\\([^)]*\\)"));
     static const QRegularExpression range(
         QStringLiteral("^((Perceptual|Absolute), )?-?\\d[\\d.]* (down )?to "));
-    const QRegularExpression named(QStringLiteral("^%1, -?\\d").arg(QRegularExpression::escape(label)));
+    const QRegularExpression named(
+        QStringLiteral("\\| *%1(, -?\\d| *\\|)").arg(QRegularExpression::escape(label)));
+    QString text = page.toMarkdown().remove('*').replace(link, "\\1");
+    text.replace("\n|", "\n\n|"); // each row of a table by itself, as a paragraph is
     QStringList found;
-    for (const auto& [heading, cells] : partsOf(page)) {
-        const bool isRow = std::any_of(cells.begin(), cells.end(), [&](const QString& cell) {
-            return cell == label || named.match(cell).hasMatch();
-        });
-        if (cells.size() > 1 ? isRow : heading == label && range.match(cells.first()).hasMatch())
-            found.append(cells.join(QStringLiteral(" | ")));
+    QString heading;
+    for (const QString& part : text.split("\n\n", Qt::SkipEmptyParts)) {
+        const bool isRow = part.startsWith('|');
+        if (part.startsWith('#'))
+            heading = part.section(' ', 1);
+        else if (isRow ? named.match(part).hasMatch() : heading == label && range.match(part).hasMatch())
+            found.append(part);
     }
     return found;
 }
