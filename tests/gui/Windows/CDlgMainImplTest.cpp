@@ -59,7 +59,7 @@ protected:
         EXPECT_FALSE(run([&] {
             user();
             EXPECT_TRUE(mWindow->isVisible() && mWindow->isEnabled()) << "there is another to choose";
-            mWindow->close();
+            mWindow->reject();
         }));
         return opened.join(QLatin1Char('|')).toStdString();
     }
