@@ -78,52 +78,43 @@ private:
     }
 
     void doSomething() {
-        const unsigned what = upTo(22);
+        const auto undo = [this] { press(Qt::Key_Z, Qt::ControlModifier); };
+        const auto refresh = [this] { click("btnRefresh"); };
+        const auto passTime = [this] { mOpened.letTheSecondPass(); };
+        const auto slide = [this] { moveSlider(); };
+        const std::function<void()> deeds[] = {
+            [this] { click("btnOK"); },
+            [this] { click("btnStopProcessing"); },
+            [this] { upTo(9) == 0 ? click("btnCancel") : void(); },
+            [this] { upTo(9) == 0 ? void(mOpened.window.close()) : void(); },
+            refresh,
+            refresh,
+            passTime,
+            passTime,
+            [this] { click(upTo(1) ? "btnFinalTouch" : "btnBack"); },
+            [this] { changeMode(); },
+            [this] { click("chkBxAutoRefresh"); },
+            [this] { click(upTo(1) ? "btnSplitPreviews" : "btnGluePreviews"); },
+            [this] { click(upTo(1) ? "btnTurnAllOn" : "btnTurnAllOff"); },
+            [this] { choosePreset(); },
+            undo,
+            undo,
+            [this] { press(Qt::Key_Y, Qt::ControlModifier); },
+            [this] { press(Qt::Key(Qt::Key_F1 + upTo(6))); },
+            [this] { drop(&mOpened.window, {QUrl::fromLocalFile(mFiles[upTo(2)])}); },
+            [this] { openPopup(); },
+            slide,
+            slide,
+            slide,
+        };
+        const unsigned what = upTo(std::size(deeds) - 1);
         mTrail += std::to_string(what) + (mRuns ? "r " : " ");
-        switch (what) {
-        case 0:
-            return click("btnOK");
-        case 1:
-            return click("btnStopProcessing");
-        case 2:
-            return upTo(9) == 0 ? click("btnCancel") : void();
-        case 3:
-            return upTo(9) == 0 ? void(mOpened.window.close()) : void();
-        case 4:
-        case 5:
-            return click("btnRefresh");
-        case 6:
-        case 7:
-            return mOpened.letTheSecondPass();
-        case 8:
-            return click(upTo(1) ? "btnFinalTouch" : "btnBack");
-        case 9:
-            return mOpened.find("frmBottomContainer")->isVisible() && upTo(3) == 0
-                       ? mOpened.window.changeMode(kModes[upTo(std::size(kModes) - 1)])
-                       : void();
-        case 10:
-            return click("chkBxAutoRefresh");
-        case 11:
-            return click(upTo(1) ? "btnSplitPreviews" : "btnGluePreviews");
-        case 12:
-            return click(upTo(1) ? "btnTurnAllOn" : "btnTurnAllOff");
-        case 13:
-            choosePreset();
-            return upTo(1) == 0 ? mOpened.letTheSecondPass() : void(); // of a change within a run, too
-        case 14:
-        case 15:
-            return press(Qt::Key_Z, Qt::ControlModifier);
-        case 17:
-            return press(Qt::Key(Qt::Key_F1 + upTo(6)));
-        case 18:
-            return void(drop(&mOpened.window, {QUrl::fromLocalFile(mFiles[upTo(2)])}));
-        case 19:
-            return openPopup();
-        case 16:
-            return press(Qt::Key_Y, Qt::ControlModifier);
-        default:
-            return moveSlider();
-        }
+        deeds[what]();
+    }
+
+    void changeMode() {
+        if (mOpened.find("frmBottomContainer")->isVisible() && upTo(3) == 0)
+            mOpened.window.changeMode(kModes[upTo(std::size(kModes) - 1)]);
     }
 
     void click(const char* button) {
@@ -153,6 +144,8 @@ private:
         auto* presets = mOpened.find<QComboBox>("lstBxPreset");
         if (presets->isVisible() && presets->count() > 0)
             presets->setCurrentIndex(static_cast<int>(upTo(static_cast<unsigned>(presets->count() - 1))));
+        if (upTo(1) == 0)
+            mOpened.letTheSecondPass(); // of a change within a run, too
     }
 
     void moveSlider() {
