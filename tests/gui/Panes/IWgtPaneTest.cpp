@@ -222,14 +222,16 @@ TEST_P(IWgtPaneTest, RowsStandInOneGrid) {
     EXPECT_LE(pitches.size(), 1u) << testing::PrintToString(pitches);
 }
 
-TEST_P(IWgtPaneTest, LeadsOnOnceARunWasCompleted) {
-    auto* button =
-        pane->findChild<QAbstractButton*>(GetParam() == Mode_FinalTouch ? "btnBack" : "btnFinalTouch");
-    if (!button)
-        return;
+TEST_P(IWgtPaneTest, MakesItsCoreAndLeadsOnOnceARunWasCompleted) {
+    const bool touch = GetParam() == Mode_FinalTouch;
     CARGBPlane in(16, 16, QStringLiteral("in"));
     CARGBPlane out(16, 16, QStringLiteral("out"));
     CThreadedCore* core = pane->createCore(&in, &out, pane);
+    EXPECT_STREQ(core->metaObject()->className(),
+                 touch ? "CThreadedCore_FinalTouch" : "CThreadedCore_Orvela");
+    auto* button = pane->findChild<QAbstractButton*>(touch ? "btnBack" : "btnFinalTouch");
+    if (!button)
+        return;
     Q_EMIT core->started();
     EXPECT_FALSE(button->isEnabled());
     Q_EMIT core->finished();

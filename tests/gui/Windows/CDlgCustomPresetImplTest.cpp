@@ -8,8 +8,6 @@
 
 #include <QTest>
 
-#include <gmock/gmock.h>
-
 using namespace orvela;
 
 namespace {
@@ -86,8 +84,12 @@ TEST_F(CDlgCustomPresetImplTest, WithoutAnyPresetItFailsAndWithNoneOfAdvancedItS
         click(chooser.btnOK);
         EXPECT_EQ(chooser.result(), QDialog::Rejected);
     };
-    EXPECT_THAT([&] { choose(work); },
-                testing::ThrowsMessage<CGenericEx>("There are no custom preset to load."));
+    try {
+        choose(work);
+        FAIL() << "There was nothing to choose from.";
+    } catch (const CGenericEx& failure) {
+        EXPECT_EQ(failure.message(), "There are no custom preset to load.");
+    }
     store(Mode_SmartBlur, {"Blurred"});
     QString said;
     answerBox(QMessageBox::Ok, said);
