@@ -53,6 +53,7 @@ public:
     }
 
     void activate() {
+        QTest::qWait(1); // the picture of a window that was just shown finds its place
         target()->window()->activateWindow();
         target()->setFocus();
         ASSERT_TRUE(QTest::qWaitForWindowActive(target()->window()));
