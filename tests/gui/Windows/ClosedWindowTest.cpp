@@ -21,6 +21,14 @@ struct State {
     bool popup = false;                          ///< something is open then
 };
 
+void atAStep(ProcessingWindow& opened, const std::function<void()>& user) {
+    QObject::connect(opened.core(), &CThreadedCore::stepDone, &opened.window, [user](int step) {
+        if (step == 3)
+            user();
+    });
+    opened.click("btnRefresh");
+}
+
 void moveSlider(ProcessingWindow& opened) {
     auto* block = opened.window.findChild<COrvelaSliderBlockImpl*>();
     block->setEnabled(true);
@@ -35,13 +43,15 @@ void close(ProcessingWindow& opened) {
 const State kStates[] = {
     {"the result of a run is to be applied", Mode_Advanced,
      [](auto& opened) {
-         QObject::connect(opened.core(), &CThreadedCore::stepDone, &opened.window, [&opened](int step) {
-             if (step != 3)
-                 return;
+         atAStep(opened, [&] {
              opened.click("btnOK");
              close(opened);
          });
-         opened.click("btnRefresh");
+     }},
+    {"another run is to come", Mode_Advanced,
+     [](auto& opened) {
+         atAStep(opened, [&] { opened.window.on_btnRefresh_clicked(); });
+         close(opened);
      }},
     {"a refresh is to come by itself", Mode_Adjustments,
      [](auto& opened) {
@@ -56,8 +66,7 @@ const State kStates[] = {
          QCoreApplication::processEvents(); // it has begun
          close(opened);
      }},
-    {"the list of presets is open", Mode_Advanced,
-     [](auto& opened) { opened.presets()->showPopup(); }, true},
+    {"the list of presets is open", Mode_Advanced, [](auto& opened) { opened.presets()->showPopup(); }, true},
     {"the menu of undo is open", Mode_Adjustments,
      [](auto& opened) {
          auto* pane = opened.window.template findChild<IWgtPane*>();

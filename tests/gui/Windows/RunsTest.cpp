@@ -55,8 +55,8 @@ TEST_F(Runs, LeaveNothingInUseThatChangesTheSettingsOrOpensABox) {
         opened.click("btnRefresh");
         EXPECT_EQ(tried, 1);
         for (const char* name :
-             {"lstBxPreset", "btnTurnAllOn", "btnSavePreset", "chkBxAutoRefresh", "btnUndo"})
-            EXPECT_TRUE(opened.find(name)->isEnabled()) << name;
+             {"lstBxPreset", "btnTurnAllOn", "btnSavePreset", "chkBxAutoRefresh", "btnUndo", "btnRefresh"})
+            EXPECT_TRUE(opened.find(name)->isEnabled() && opened.find(name)->isVisible()) << name;
         opened.click("btnOK");
     });
     expectWholeResult();
@@ -92,6 +92,14 @@ TEST_F(Runs, AreFollowedByAllThatWaitsForTheirEnd) {
     });
     EXPECT_TRUE(settings().mSliderParams.DigitalFlashEnabled);
     EXPECT_FALSE(settings().mSliderParams.SaturationEnabled);
+    expectWholeResult();
+}
+
+TEST_F(Runs, ByOkAreMadeAnewOfWhatIsChosenMeanwhile) {
+    opened.run([&] {
+        during([&] { opened.presets()->setCurrentText(QStringLiteral("Landscape")); });
+        opened.click("btnOK");
+    });
     expectWholeResult();
 }
 
