@@ -148,8 +148,10 @@ TEST_F(Runs, DoNotBeginByThemselvesWithASliderInHandOrBehindAnythingOpen) {
         EXPECT_EQ(tried, 3);
         opened.letTheSecondPass();
         EXPECT_EQ(runs, 1) << "it was forgotten";
-        opened.click("btnCancel");
+        opened.click("btnOK");
     });
+    EXPECT_EQ(runs, 1) << "what is shown is what is asked for";
+    expectWholeResult();
 }
 
 } // namespace
