@@ -3,8 +3,6 @@
 #include "GUI/Controls/CThinHorizontalSlider.h"
 #include "gui/Windows/RunsFixture.h"
 
-#include <QLineEdit>
-
 using namespace orvela;
 
 namespace {
@@ -93,24 +91,6 @@ TEST_F(Undo, APresetIsOneStepAndItsNameComesBack) {
         redo();
         EXPECT_EQ(controls(), landscape);
         EXPECT_EQ(opened.presets()->currentText(), "LandscapePro");
-        opened.click("btnCancel");
-    });
-}
-
-TEST_F(Undo, ATypedNumberIsUndoneFromWithinItsField) {
-    opened.run([&] {
-        opened.window.activateWindow();
-        block()->setEnabled(true);
-        const PresetContent before = controls();
-        QLineEdit* field = block()->txtValue;
-        field->setFocus();
-        field->selectAll();
-        QTest::keyClicks(field, QStringLiteral("4.5"));
-        EXPECT_NE(controls(), before);
-        QTest::keyClick(field, Qt::Key_Z, Qt::ControlModifier);
-        EXPECT_EQ(controls(), before);
-        QTest::keyClick(field, Qt::Key_Y, Qt::ControlModifier);
-        EXPECT_EQ(field->text(), "4.5");
         opened.click("btnCancel");
     });
 }
