@@ -238,7 +238,7 @@ TEST_F(SettingsWindow, KeepsWhatIsStoredWhenItWasClosedBeforeItCameToStandThere)
     const QString selected = QStringLiteral("2000/GUI/CDlgSettingsImpl/selectedPreset");
     openSettings().setValue(split, true);
     openSettings().setValue(selected, QStringLiteral("Macro"));
-    QTimer::singleShot(0, &opened.window, [this] { opened.window.reject(); });
+    QTimer::singleShot(0, &opened.window, &QDialog::reject);
     opened.window.run();
     EXPECT_TRUE(openSettings().value(split).toBool());
     EXPECT_EQ(openSettings().value(selected).toString(), "Macro");
