@@ -5,6 +5,7 @@
 #include "gui/Windows/RunsFixture.h"
 #include "support/ModalDialog.h"
 
+#include <QCloseEvent>
 #include <QInputDialog>
 #include <QLabel>
 #include <QMessageBox>
@@ -219,13 +220,14 @@ TEST_F(SettingsWindow, NamesEveryButtonAndListForWhoDoesNotSeeIt) {
     EXPECT_FALSE(opened.presets()->accessibleName().isEmpty());
 }
 
-TEST_F(SettingsWindow, AllOnLeavesOffWhatIsNeverShown) {
+TEST(CDlgSettingsImpl, AllOnLeavesOffWhatIsNeverShown) {
+    ProcessingWindow opened(Mode_Advanced, testplanes::noise(72, 48));
     opened.run([&] {
-        COrvelaSliderBlockImpl* hidden = block("sldrAutoContrast");
+        COrvelaSliderBlockImpl* hidden = opened.block("sldrAutoContrast");
         hidden->setEnabled(false);
         opened.click("btnTurnAllOn");
         EXPECT_FALSE(hidden->isEnabled());
-        EXPECT_TRUE(block("sldrGamma_Abs")->isEnabled()) << "of a hidden group";
+        EXPECT_TRUE(opened.block("sldrGamma_Abs")->isEnabled()) << "of a hidden group";
         hidden->setEnabled(true);
         opened.click("btnTurnAllOff");
         EXPECT_FALSE(hidden->isEnabled());
@@ -233,12 +235,13 @@ TEST_F(SettingsWindow, AllOnLeavesOffWhatIsNeverShown) {
     });
 }
 
-TEST_F(SettingsWindow, KeepsWhatIsStoredWhenItWasClosedBeforeItCameToStandThere) {
+TEST(CDlgSettingsImpl, KeepsWhatIsStoredWhenItWasClosedBeforeItCameToStandThere) {
     const QString split = QStringLiteral("2000/GUI/CDlgSettingsImpl/previewsSplitted");
     const QString selected = QStringLiteral("2000/GUI/CDlgSettingsImpl/selectedPreset");
     openSettings().setValue(split, true);
     openSettings().setValue(selected, QStringLiteral("Macro"));
-    QTimer::singleShot(0, &opened.window, &QDialog::reject);
+    ProcessingWindow opened(Mode_Advanced, testplanes::noise(72, 48));
+    QCoreApplication::postEvent(&opened.window, new QCloseEvent);
     opened.window.run();
     EXPECT_TRUE(openSettings().value(split).toBool());
     EXPECT_EQ(openSettings().value(selected).toString(), "Macro");

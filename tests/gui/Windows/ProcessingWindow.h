@@ -61,10 +61,13 @@ public:
 
     /// Runs the mode and does `user` as soon as the window serves events.
     void run(const std::function<void()>& user = [] {}) {
-        QTimer::singleShot(0, &window, [user] {
+        QTimer opened;
+        opened.setSingleShot(true);
+        QObject::connect(&opened, &QTimer::timeout, &window, [&user] {
             QTest::qWait(1); // the window restores its state first
             user();
         });
+        opened.start();
         window.run();
     }
 
