@@ -87,12 +87,15 @@ TEST(ClosedWindow, LeavesNothingWhateverItWasIn) {
         const qsizetype before = threads();
         {
             ProcessingWindow opened(state.mode, testplanes::noise(72, 48));
+            QTimer later;
+            later.setSingleShot(true);
+            QObject::connect(&later, &QTimer::timeout, &opened.window, [&] {
+                EXPECT_TRUE(QApplication::activePopupWidget());
+                close(opened);
+            });
             opened.run([&] {
                 if (state.popup)
-                    QTimer::singleShot(20, &opened.window, [&] {
-                        EXPECT_TRUE(QApplication::activePopupWidget());
-                        close(opened);
-                    });
+                    later.start(20);
                 state.lead(opened);
             });
             EXPECT_FALSE(opened.window.isVisible() || opened.window.appliesOnFinish());
