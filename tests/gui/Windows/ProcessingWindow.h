@@ -1,12 +1,15 @@
 #pragma once
 
 #include "Core/CThreadedCore_Orvela.h"
+#include "GUI/Controls/COrvelaSliderBlockImpl.h"
+#include "GUI/Preview/CSignaledGraphicsView.h"
 #include "GUI/Windows/CDlgSettingsImpl.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
 #include "support/TestPlanes.h"
 
 #include <QAbstractButton>
 #include <QApplication>
+#include <QComboBox>
 #include <QDropEvent>
 #include <QMimeData>
 #include <QTest>
@@ -43,6 +46,12 @@ inline bool drop(QWidget* at, const QList<QUrl>& urls) {
     return true;
 }
 
+/// Moves the mouse over a widget with the left button held.
+inline void moveHeldMouse(QWidget* over, QPointF to) {
+    QMouseEvent move(QEvent::MouseMove, to, over->mapToGlobal(to), Qt::NoButton, Qt::LeftButton, {});
+    QCoreApplication::sendEvent(over, &move);
+}
+
 /// A processing window over a picture, driven while it runs.
 class ProcessingWindow {
 public:
@@ -52,10 +61,13 @@ public:
 
     /// Runs the mode and does `user` as soon as the window serves events.
     void run(const std::function<void()>& user = [] {}) {
-        QTimer::singleShot(0, &window, [user] {
+        QTimer opened;
+        opened.setSingleShot(true);
+        QObject::connect(&opened, &QTimer::timeout, &window, [&user] {
             QTest::qWait(1); // the window restores its state first
             user();
         });
+        opened.start();
         window.run();
     }
 
@@ -64,6 +76,12 @@ public:
         return window.findChild<Widget*>(QLatin1String(name));
     }
 
+    COrvelaSliderBlockImpl* block(const char* name = "sldrSaturation") {
+        return find<COrvelaSliderBlockImpl>(name);
+    }
+    QComboBox* presets() { return find<QComboBox>("lstBxPreset"); }
+    /// Of the original and the processed picture.
+    QList<CSignaledGraphicsView*> views() { return window.findChildren<CSignaledGraphicsView*>(); }
     CThreadedCore* core() { return window.findChildren<CThreadedCore*>().last(); }
 
     QTimer* refreshTimer() { return find<QTimer>("refreshTimer"); }

@@ -3,27 +3,33 @@
 
 #include "GUI/Controls/CThinHorizontalSlider.h"
 #include "GUI/Preview/CGridCell.h"
-#include "GUI/Preview/CSignaledGraphicsView.h"
 #include "gui/Windows/RunsFixture.h"
 #include "support/LogCapture.h"
 #include "support/ModalDialog.h"
 
-#include <QCheckBox>
 #include <QMessageBox>
-#include <QPushButton>
 #include <QScrollBar>
 
 using namespace orvela;
 
 namespace {
 
-using RunEnds = Runs;
+class RunEnds : public Runs {
+protected:
+    // What lies over the whole picture: a draft or a step.
+    QRectF part() {
+        for (const QGraphicsItem* item : opened.views()[1]->scene()->items())
+            if (dynamic_cast<const CGridCell*>(item) && item->zValue() > 1)
+                return item->sceneBoundingRect();
+        return {};
+    }
+};
 
 TEST_F(RunEnds, GiveTheKeyboardBackToWhereItWas) {
     opened.run([&] {
         opened.window.activateWindow();
         opened.click("chkBxAutoRefresh");
-        QWidget* slider = block("sldrSaturation")->sldrValue;
+        QWidget* slider = block()->sldrValue;
         slider->setFocus();
         countRuns();
         during([&] {
@@ -41,7 +47,7 @@ TEST_F(RunEnds, GiveTheKeyboardBackToWhereItWas) {
         QTest::keyClick(&opened.window, Qt::Key_F5);
         EXPECT_EQ(opened.window.focusWidget(), opened.find("btnZoomIn"));
 
-        block("sldrSaturation")->setValue(130);
+        block()->setValue(130);
         opened.find("btnOK")->setFocus();
         during([&] { QTest::keyClick(opened.window.focusWidget(), Qt::Key_Space); }); // twice, by mistake
         QTest::keyClick(opened.find("btnOK"), Qt::Key_Space);
@@ -51,30 +57,35 @@ TEST_F(RunEnds, GiveTheKeyboardBackToWhereItWas) {
 
 TEST_F(RunEnds, OfTheNextPaneFollowTheResultsOfTheOneBefore) {
     opened.run([&] {
-        auto* refresh = opened.find("btnRefresh");
-        EXPECT_TRUE(refresh->isVisible());
+        const auto goBack = [&] {
+            EXPECT_TRUE(QTest::qWaitFor([&] { return opened.find("btnBack")->isEnabled(); }, 3000));
+            opened.click("btnBack");
+        };
+        auto* automatic = opened.find<QAbstractButton>("chkBxAutoRefresh");
+        opened.presets()->setCurrentText(QStringLiteral("Landscape"));
         opened.click("btnRefresh");
+        const std::vector<std::uint8_t> landscape = testplanes::bytes(opened.output);
         opened.click("btnFinalTouch");
-        EXPECT_FALSE(refresh->isVisible());
+        EXPECT_FALSE(opened.find("frmPresets")->isVisible() || opened.find("btnRefresh")->isVisible());
+        EXPECT_TRUE(automatic->isChecked());
+        EXPECT_TRUE(testplanes::bytes(*opened.input) == landscape);
         countRuns();
         EXPECT_TRUE(QTest::qWaitFor([&] { return runs == 1; }, 3000));
-        opened.click("btnBack");
-        EXPECT_TRUE(refresh->isVisible()) << "or nothing would be processed any more";
+        goBack();
+        EXPECT_EQ(opened.presets()->currentText(), "Landscape");
+        EXPECT_TRUE(testplanes::bytes(*opened.input) == testplanes::bytes(opened.proxy.plane()));
+        EXPECT_FALSE(automatic->isChecked());
+        EXPECT_TRUE(opened.find("btnRefresh")->isVisible()) << "or nothing would be processed any more";
 
         opened.click("btnRefresh");
-        block("sldrSaturation")->setValue(130);
+        block()->setValue(130);
         runs = 0;
         countRuns();
-        opened.click("btnFinalTouch");
-        EXPECT_EQ(runs, 1) << "it goes on from the result of the sliders";
-        EXPECT_EQ(opened.window.windowTitle(), "Final Touch");
-        opened.click("btnBack");
-        opened.click("btnRefresh");
         opened.click("chkBxAutoRefresh");
         opened.click("btnFinalTouch");
-        EXPECT_TRUE(QTest::qWaitFor([&] { return opened.find("btnBack")->isEnabled(); }, 3000));
-        opened.click("btnBack");
-        EXPECT_TRUE(opened.find<QCheckBox>("chkBxAutoRefresh")->isChecked());
+        EXPECT_EQ(runs, 1) << "it goes on from the result of the sliders";
+        goBack();
+        EXPECT_TRUE(automatic->isChecked());
         opened.click("btnCancel");
     });
 }
@@ -102,7 +113,7 @@ TEST_F(RunEnds, TellOnceOfAStepThatFailedAndAskBeforeItsPictureIsUsed) {
         opened.click("chkBxAutoRefresh");
         countRuns();
         told = messageBoxes([&] {
-            block("sldrSaturation")->setValue(130);
+            block()->setValue(130);
             EXPECT_TRUE(QTest::qWaitFor([&] { return runs == 1; }, 3000));
         });
         EXPECT_EQ(told.size(), 0) << "it was told";
@@ -113,7 +124,7 @@ TEST_F(RunEnds, TellOnceOfAStepThatFailedAndAskBeforeItsPictureIsUsed) {
                 box->button(asked.size() == 1 ? QMessageBox::No : QMessageBox::Yes)->click();
             }
         });
-        block("sldrSaturation")->setValue(300);
+        block()->setValue(300);
         opened.click("btnOK");
         EXPECT_TRUE(asked.value(0).contains("was left out"));
         EXPECT_TRUE(opened.window.isVisible());
@@ -130,6 +141,7 @@ TEST_F(RunEnds, ThatFailLeaveTheWindowOpenAndCanBeMadeAnew) {
         opened.core()->setObserver([](const TaskReport&) { throw std::bad_alloc(); });
         const QStringList told = messageBoxes([&] { opened.click("btnOK"); });
         EXPECT_EQ(told.size(), 1);
+        EXPECT_TRUE(part().isNull()) << "a step of it lies over the picture before";
         EXPECT_TRUE(opened.window.isVisible());
         EXPECT_FALSE(opened.window.appliesOnFinish());
         opened.core()->setObserver({});
@@ -140,40 +152,25 @@ TEST_F(RunEnds, ThatFailLeaveTheWindowOpenAndCanBeMadeAnew) {
     expectWholeResult();
 }
 
-class RunsAndDrafts : public Runs {
-protected:
-    QGraphicsView* view() { return opened.window.findChildren<CSignaledGraphicsView*>().last(); }
-    QRectF seen() { return view()->mapToScene(view()->viewport()->rect()).boundingRect(); }
-
-    // What lies over the whole picture: a draft or a step.
-    QRectF part() {
-        for (const QGraphicsItem* item : view()->scene()->items())
-            if (dynamic_cast<const CGridCell*>(item) && item->zValue() > 1)
-                return item->sceneBoundingRect();
-        return {};
-    }
-};
-
-TEST_F(RunsAndDrafts, GoWithWhatIsSeenUntilThereIsAResult) {
+TEST_F(RunEnds, AreLookedForwardToByDraftsOfWhatIsSeen) {
     LogCapture log;
     opened.run([&] {
+        const QGraphicsView* view = opened.views()[1];
         const auto covered = [&] {
-            return part().adjusted(-1, -1, 1, 1).contains(seen() & view()->sceneRect());
+            const QRectF seen = view->mapToScene(view->viewport()->rect()).boundingRect();
+            return part().adjusted(-1, -1, 1, 1).contains(seen & view->sceneRect());
         };
         for (int i = 0; i < 4; ++i)
             opened.click("btnZoomIn");
-        block("sldrSaturation")->setValue(130);
+        block()->setValue(130);
         EXPECT_TRUE(QTest::qWaitFor(covered, 3000));
-        for (QScrollBar* bar : {view()->horizontalScrollBar(), view()->verticalScrollBar()})
+        for (QScrollBar* bar : {view->horizontalScrollBar(), view->verticalScrollBar()})
             bar->setValue(bar->maximum());
         EXPECT_TRUE(QTest::qWaitFor(covered, 3000)) << "after scrolling";
         opened.click("btnZoomOut");
         opened.click("btnZoomOut");
         EXPECT_TRUE(QTest::qWaitFor(covered, 3000)) << "after zooming";
         EXPECT_FALSE(log.has("CWgtPaneAdvancedImpl::applyGUIParams")) << "the listing is one of runs";
-        opened.core()->setObserver([](const TaskReport&) { throw std::bad_alloc(); });
-        messageBoxes([&] { opened.click("btnRefresh"); });
-        EXPECT_TRUE(part().isNull()) << "a run that failed left a step over the picture before";
         opened.click("btnCancel");
     });
 }

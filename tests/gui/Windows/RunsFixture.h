@@ -1,7 +1,7 @@
 #pragma once
 
-#include "GUI/Controls/COrvelaSliderBlockImpl.h"
 #include "GUI/Panes/IWgtPane.h"
+#include "GUI/Presets/CPresetStore.h"
 #include "Settings/SettingsStore.h"
 #include "gui/Windows/ProcessingWindow.h"
 
@@ -19,7 +19,8 @@ class Runs : public testing::Test {
 protected:
     explicit Runs(EGUIMode mode = Mode_Advanced) : opened(mode, testplanes::noise(72, 48)) {}
 
-    COrvelaSliderBlockImpl* block(const char* name) { return opened.find<COrvelaSliderBlockImpl>(name); }
+    COrvelaSliderBlockImpl* block(const char* name = "sldrSaturation") { return opened.block(name); }
+    PresetContent controls() { return CPresetStore::contentOf(&opened.window); }
     void countRuns() {
         QObject::connect(opened.core(), &CThreadedCore::started, &opened.window, [this] { ++runs; });
     }
@@ -45,21 +46,16 @@ protected:
         EXPECT_TRUE(testplanes::bytes(opened.output) == opened.engineResult(settings()));
     }
 
-    QString file(const QByteArray& content) {
-        const QString path = mFolder.filePath(QStringLiteral("dropped.json"));
-        QFile file(path);
+    // A file to be dropped.
+    QUrl file(const QByteArray& content, const char* name = "dropped.json") {
+        QFile file(mFolder.filePath(QLatin1String(name)));
         EXPECT_TRUE(file.open(QIODevice::WriteOnly));
         file.write(content);
-        return path;
-    }
-    static void drop(QWidget* at, const QString& path) {
-        EXPECT_TRUE(orvela::drop(at, {QUrl::fromLocalFile(path)}));
+        return QUrl::fromLocalFile(file.fileName());
     }
 
     ProcessingWindow opened;
     int runs = 0;
-
-private:
     QTemporaryDir mFolder;
 };
 

@@ -3,12 +3,8 @@
 
 #include "GUI/Controls/CThinHorizontalSlider.h"
 #include "GUI/Presets/CBatchMode.h"
-#include "GUI/Presets/CPresetStore.h"
 #include "gui/Windows/RunsFixture.h"
 #include "support/ModalDialog.h"
-
-#include <QComboBox>
-#include <QMessageBox>
 
 #include <cmath>
 
@@ -37,32 +33,30 @@ TEST_F(Runs, OfABatchAreWholeHoweverLongTheyTake) {
     }
     EXPECT_TRUE(results[0] == results[1]);
     EXPECT_FALSE(results[0] == testplanes::bytes(opened.proxy.plane()));
-
-    ProcessingWindow stopped(Mode_Batch, testplanes::noise(72, 48));
-    stopped.run([&stopped] { stopped.click("btnStopProcessing"); });
-    EXPECT_FALSE(stopped.window.appliesOnFinish());
 }
 
 TEST_F(Runs, LeaveNothingInUseThatChangesTheSettingsOrOpensABox) {
     opened.run([&] {
+        block()->setValue(130); // which could be undone
         int tried = 0;
         during([&] {
-            const PresetContent before = CPresetStore::contentOf(&opened.window);
-            const QString preset = opened.find<QComboBox>("lstBxPreset")->currentText();
-            QTest::keyClick(opened.find("lstBxPreset"), Qt::Key_Down);
+            const PresetContent before = controls();
+            const QString preset = opened.presets()->currentText();
+            QTest::keyClick(opened.presets(), Qt::Key_Down);
             opened.click("btnTurnAllOn");
             opened.click("btnTurnAllOff");
             for (const char* keys : {"Ctrl+E", "Ctrl+Shift+E", "Ctrl+R", "Ctrl+S", "Ctrl+D", "Ctrl+Z"})
                 QTest::keySequence(&opened.window, QKeySequence(QLatin1String(keys)));
             EXPECT_EQ(QApplication::activeModalWidget(), &opened.window);
-            EXPECT_EQ(CPresetStore::contentOf(&opened.window), before);
-            EXPECT_EQ(opened.find<QComboBox>("lstBxPreset")->currentText(), preset);
+            EXPECT_EQ(controls(), before);
+            EXPECT_EQ(opened.presets()->currentText(), preset);
             ++tried;
         });
         opened.click("btnRefresh");
         EXPECT_EQ(tried, 1);
-        for (const char* name : {"lstBxPreset", "btnTurnAllOn", "btnSavePreset", "chkBxAutoRefresh"})
-            EXPECT_TRUE(opened.find(name)->isEnabled()) << name;
+        for (const char* name :
+             {"lstBxPreset", "btnTurnAllOn", "btnSavePreset", "chkBxAutoRefresh", "btnUndo", "btnRefresh"})
+            EXPECT_TRUE(opened.find(name)->isEnabled() && opened.find(name)->isVisible()) << name;
         opened.click("btnOK");
     });
     expectWholeResult();
@@ -74,52 +68,23 @@ TEST_F(Runs, ReadAThumbThatIsHeldWhereItComesToStand) {
         auto* thumb = block("sldrIllumination")->sldrValue;
         int x = thumb->width() / 3;
         QTest::mousePress(thumb, Qt::LeftButton, {}, QPoint(x, 3));
-        while (std::fmod(thumb->value(), 10) < 0.1 && ++x < thumb->width()) { // tenths of its scale are told
-            QMouseEvent move(QEvent::MouseMove, QPointF(x, 3), thumb->mapToGlobal(QPointF(x, 3)),
-                             Qt::NoButton, Qt::LeftButton, {});
-            QCoreApplication::sendEvent(thumb, &move);
-        }
+        while (std::fmod(thumb->value(), 10) < 0.1 && ++x < thumb->width()) // tenths of its scale are told
+            moveHeldMouse(thumb, QPointF(x, 3));
         ASSERT_LT(x, thumb->width());
         QTest::keyClick(&opened.window, Qt::Key_F5);
         EXPECT_EQ(opened.core()->params().mSliderParams.ClarityFilterValue,
                   settings().mSliderParams.ClarityFilterValue);
-        opened.click("btnOK");
+        opened.click("btnCancel");
     });
-    expectWholeResult();
 }
-
-class RunsAndOk : public Runs, public testing::WithParamInterface<bool> {};
-
-TEST_P(RunsAndOk, StoppedForADroppedFileAreMadeAnew) {
-    const bool pressedBefore = GetParam();
-    QStringList said;
-    const ModalDialogs reader([&said](QDialog& dialog) {
-        if (auto* box = qobject_cast<QMessageBox*>(&dialog)) {
-            said += box->text();
-            box->accept();
-        }
-    });
-    opened.run([&] {
-        during([&] { drop(&opened.window, file("no preset")); });
-        countRuns();
-        opened.click(pressedBefore ? "btnOK" : "btnRefresh");
-        if (pressedBefore)
-            return;
-        EXPECT_TRUE(QTest::qWaitFor([&] { return runs == 2; })) << "the run is made up for";
-        opened.click("btnOK");
-    });
-    EXPECT_EQ(said.size(), 1);
-    EXPECT_EQ(runs, 2);
-    expectWholeResult();
-}
-
-INSTANTIATE_TEST_SUITE_P(BeforeAndAfter, RunsAndOk, testing::Bool());
 
 TEST_F(Runs, AreFollowedByAllThatWaitsForTheirEnd) {
-    const QString flash = file(R"({"version": 1, "settings": {"DigitalFlashEnabled": true}})");
+    const QUrl flash = file(R"({"version": 1, "settings": {"DigitalFlashEnabled": true}})");
     opened.run([&] {
         during([&] {
-            drop(&opened.window, flash);
+            const PresetContent before = controls();
+            EXPECT_TRUE(drop(&opened.window, {flash}));
+            EXPECT_EQ(controls(), before);
             opened.click("btnOK");
         });
         opened.click("btnRefresh");
@@ -130,12 +95,20 @@ TEST_F(Runs, AreFollowedByAllThatWaitsForTheirEnd) {
     expectWholeResult();
 }
 
+TEST_F(Runs, ByOkAreMadeAnewOfWhatIsChosenMeanwhile) {
+    opened.run([&] {
+        during([&] { opened.presets()->setCurrentText(QStringLiteral("Landscape")); });
+        opened.click("btnOK");
+    });
+    expectWholeResult();
+}
+
 TEST_F(Runs, ByOkAreNotSpoiltByTheRefreshThatWasToCome) {
     opened.run([&] {
         countRuns();
         opened.click("chkBxAutoRefresh");
         QTest::qWait(1);
-        block("sldrSaturation")->setValue(130);
+        block()->setValue(130);
         during([&] { opened.letTheSecondPass(); });
         opened.click("btnOK");
     });
@@ -147,7 +120,7 @@ TEST_F(Runs, DoNotBeginByThemselvesWithASliderInHandOrBehindAnythingOpen) {
     opened.run([&] {
         countRuns();
         opened.click("chkBxAutoRefresh");
-        block("sldrSaturation")->setValue(130);
+        block()->setValue(130);
         int tried = 0;
         const auto expectNone = [&] {
             opened.letTheSecondPass();
@@ -160,10 +133,9 @@ TEST_F(Runs, DoNotBeginByThemselvesWithASliderInHandOrBehindAnythingOpen) {
         expectNone();
         EXPECT_TRUE(thumb->isEnabled());
         QTest::mouseRelease(thumb, Qt::LeftButton, {}, QPoint(30, 3));
-        auto* presets = opened.find<QComboBox>("lstBxPreset");
-        presets->showPopup();
+        opened.presets()->showPopup();
         expectNone();
-        presets->hidePopup();
+        opened.presets()->hidePopup();
         {
             const ModalDialogs user([&](QDialog& dialog) {
                 if (&dialog == &opened.window)
@@ -176,8 +148,10 @@ TEST_F(Runs, DoNotBeginByThemselvesWithASliderInHandOrBehindAnythingOpen) {
         EXPECT_EQ(tried, 3);
         opened.letTheSecondPass();
         EXPECT_EQ(runs, 1) << "it was forgotten";
-        opened.click("btnCancel");
+        opened.click("btnOK");
     });
+    EXPECT_EQ(runs, 1) << "what is shown is what is asked for";
+    expectWholeResult();
 }
 
 } // namespace
