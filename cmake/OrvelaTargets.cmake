@@ -23,6 +23,9 @@ if(ORVELA_SANITIZE)
     target_compile_definitions(orvela_options INTERFACE QT_FORCE_ASSERTS _GLIBCXX_ASSERTIONS)
 endif()
 target_compile_definitions(orvela_options INTERFACE QT_NO_KEYWORDS)
+# A symbol that another library of the process could take for its own would keep the module from being unloaded.
+set(CMAKE_CXX_VISIBILITY_PRESET hidden)
+set(CMAKE_VISIBILITY_INLINES_HIDDEN ON)
 
 # orvela_automoc(TARGET): the target's sources go through moc. The build does not notice by itself that a file was
 # added to them: without the time stamp it looks at all of them again.

@@ -41,7 +41,7 @@ grep -q "GNU GENERAL PUBLIC LICENSE" "$share"/doc/*/LICENSE || fail "no licence 
 
 # The manual has every option of the help, and no other.
 page=$share/man/man1/orvela.1
-for command in "" enhance modes presets "presets list" "presets export" "presets import" "presets remove"; do
+for command in "" enhance edit modes presets "presets list" "presets export" "presets import" "presets remove"; do
     orvela $command --help
 done | grep -oE -- '(^|[ ,])--?[a-z][a-z-]*' | tr -d ' ,' | sort -u >"$scratch/in_help"
 sed 's/\\-/-/g; s/\\f[IR]//g' "$page" | grep -E '^\.(B|BR) +"?-' | grep -oE -- '(^|[ ,"])--?[a-z][a-z-]*' |
@@ -51,6 +51,19 @@ expect "the manual's version" "$(head -1 "$page" | grep -oE 'Orvela [0-9.]+')" "
 if command -v groff >/dev/null; then
     expect "warnings of the manual" "$(groff -man -ww -z "$page" 2>&1)" ""
 fi
+
+# The desktop finds the program and its description, and the windows are where it looks for them.
+entry=$share/applications/example.kestrand.Orvela.desktop
+expect "complaints of the desktop entry" "$(desktop-file-validate "$entry")" ""
+appstreamcli validate --no-net "$share/metainfo/example.kestrand.Orvela.metainfo.xml" >"$scratch/log" || fail "$(cat "$scratch/log")"
+for type in $(sed -n 's/^MimeType=//p' "$entry" | tr ';' ' '); do
+    grep -qr "type=\"$type\"" /usr/share/mime/packages || fail "no file has the type $type"
+done
+mkdir -p "$scratch/edit" && printf '[2000]\nGUI\\batchModeEnabled=true\nGUI\\batchMode=0\n' >"$scratch/edit.conf"
+mkdir -p "$XDG_CONFIG_HOME/Kestrand" && cp "$scratch/edit.conf" "$XDG_CONFIG_HOME/Kestrand/Orvela.conf"
+QT_QPA_PLATFORM=offscreen TMP=$scratch orvela edit "$share/orvela/samples/coffee.png" -o "$scratch/edited.png" --quiet
+cmp "$scratch/edited.png" "$scratch/out.png" || fail "the windows give another picture than the command"
+rm "$XDG_CONFIG_HOME/Kestrand/Orvela.conf"
 
 # Icons have the sizes of their folders, and show something.
 for size in 16 24 32 48 64 128 256; do
@@ -66,7 +79,7 @@ completed() {
         _orvela orvela "${@: -1}" "${@: -2:1}"; echo "${COMPREPLY[*]}"' \
         "$share/bash-completion/completions/orvela" "$@"
 }
-expect "commands" "$(completed orvela en)" "enhance"
+expect "commands" "$(completed orvela e)" "enhance edit"
 expect "actions" "$(completed orvela presets '')" "list export import remove"
 expect "options" "$(completed orvela enhance --ch)" "--chroma"
 expect "options of an action" "$(completed orvela presets export --f)" "--force"

@@ -2,12 +2,14 @@
 
 #include "Settings/PresetFile.h"
 #include "Utility/CGenericEx.h"
+#include "command/EditCommand.h"
 #include "command/EnhanceCommand.h"
 #include "command/Messages.h"
 #include "command/ModesCommand.h"
 #include "command/ParseRefusal.h"
-#include "command/PresetFiles.h"
 #include "command/PresetsCommand.h"
+#include "run/PresetFiles.h"
+#include "run/UsageError.h"
 
 #include <QCoreApplication>
 
@@ -36,6 +38,15 @@ void addEnhance(CLI::App& program, Action& action, StopSignals& signals) {
             PresetFiles::checkStore();
             return enhancePhotographs(*options, signals);
         };
+    });
+}
+
+void addEdit(CLI::App& program, Action& action, StopSignals& signals) {
+    CLI::App* command = program.add_subcommand("edit", "Open photographs in the windows of the filter");
+    const auto options = std::make_shared<EditOptions>();
+    options->declare(*command);
+    command->callback([&action, &signals, options] {
+        action = [&signals, options] { return editPhotographs(*options, signals); };
     });
 }
 
@@ -100,6 +111,7 @@ void occupyClosedOutputs() {
 int runProgram(int argc, char** argv) {
     occupyClosedOutputs();
     StopSignals signals;
+    std::signal(SIGCHLD, SIG_DFL); // ignored, it would keep what becomes of the windows to itself
     std::signal(SIGXFSZ, SIG_IGN); // a file above the limit fails like a full disk
     QCoreApplication application(argc, argv);
 
@@ -108,6 +120,7 @@ int runProgram(int argc, char** argv) {
     program.require_subcommand(1);
     Action action;
     addEnhance(program, action, signals);
+    addEdit(program, action, signals);
     addModes(program, action);
     addPresets(program, action, signals);
     refuseEmptyValues(program);

@@ -2,17 +2,15 @@
 
 #include "Utility/CGenericEx.h"
 #include "Utility/RowScheduler.h"
-#include "command/Enhancement.h"
 #include "command/LogFile.h"
 #include "command/Messages.h"
-#include "command/PresetFiles.h"
-#include "command/ProgressLine.h"
+#include "command/PhotographBatch.h"
 #include "command/Sources.h"
-#include "files/FileFormat.h"
 #include "files/Memory.h"
-#include "files/PhotographReader.h"
-#include "files/PhotographWriter.h"
 #include "files/TargetFile.h"
+#include "run/Enhancement.h"
+#include "run/PresetFiles.h"
+#include "run/UsageError.h"
 
 #include <malloc.h>
 
@@ -26,163 +24,72 @@ namespace fs = std::filesystem;
 
 namespace {
 
-// What enhancing takes of memory for each pixel: the samples as they came and as they become, one channel of
-// them on its way, and planes of three colours for what goes in, what comes out, and the host's picture.
-constexpr std::uint64_t kSampleCopies = 2;
-constexpr std::uint64_t kChannelBytes = 2;
-constexpr std::uint64_t kPlanes = 3;
-constexpr std::uint64_t kPlaneBytes = 3;
-
 int threadsOf(const EnhanceOptions& options) {
     return options.threads > 0 ? options.threads : RowScheduler::defaultThreads();
 }
 
-// The work on all photographs of one command.
-class Batch {
+// Shows the run's progress, and ends it or the program when a signal arrives: at once as long as nothing is
+// begun that would have to end in good order.
+class TerminalWatch final : public RunWatch {
 public:
-    Batch(const EnhanceOptions& options, const RunSettings& settings, std::vector<Job> jobs,
-          StopSignals& signals)
-        : mOptions(options), mSettings(settings), mJobs(std::move(jobs)), mSignals(signals),
-          mScheduler(options.threads), mMapped(mappedByThreads(threadsOf(options))),
-          mProgress(static_cast<int>(mJobs.size()), !options.quiet) {}
-
-    ExitStatus run() {
-        ExitStatus worst = ExitStatus::Done;
-        for (mIndex = 0; mIndex < mJobs.size() && !mSignals.stopRequested(); ++mIndex)
-            worst = std::max(worst, runGuarded(mJobs[mIndex]));
-        return worst;
+    TerminalWatch(StopSignals& signals, ProgressLine& progress) : mSignals(signals), mProgress(progress) {
+        mAction.emplace(signals, [&signals] { signals.leave(); });
     }
+    void step(int step, int total, const QString& title) override { mProgress.step(step, total, title); }
+    void percent(int percent) override { mProgress.percent(percent); }
+    void setStop(const std::function<void()>& stop) override {
+        mAction.reset();
+        if (stop)
+            mAction.emplace(mSignals, stop);
+    }
+    bool stopRequested() const override { return mSignals.stopRequested(); }
 
 private:
-    ExitStatus runGuarded(const Job& job);
-    void runJob(const Job& job);
-    void makeFolder();
-    ReadOptions reading() const;
-    bool runPage(const Job& job, PhotographReader& reader, PhotographWriter& writer);
-    Photograph read(PhotographReader& reader);
+    StopSignals& mSignals;
+    ProgressLine& mProgress;
+    std::optional<StopAction> mAction;
+};
+
+class EnhanceBatch final : public PhotographBatch {
+public:
+    EnhanceBatch(const EnhanceOptions& options, const RunSettings& settings, std::vector<Job> jobs,
+                 StopSignals& signals)
+        : PhotographBatch({options.targets.folder, reading(options, settings), options.writing, options.quiet,
+                           false, false, options.log.has_value()},
+                          std::move(jobs), signals),
+          mOptions(options), mSettings(settings), mScheduler(options.threads) {}
+
+private:
+    void runJob(const Job& job) override {
+        mScheduler.execute([&] { PhotographBatch::runJob(job); });
+    }
+    std::optional<Photograph> work(const Job& job, Photograph photograph) override {
+        const std::optional<TraceOptions> trace = traceOf(job, photograph);
+        TerminalWatch watch(signals(), progress());
+        return enhance(std::move(photograph), mSettings, trace, watch);
+    }
+    static ReadOptions reading(const EnhanceOptions& options, const RunSettings& settings);
     std::optional<TraceOptions> traceOf(const Job& job, const Photograph& photograph) const;
-    ExitStatus failed(ExitStatus status, const std::string& text);
-    void note(const std::string& text);
 
     const EnhanceOptions& mOptions;
     const RunSettings& mSettings;
-    const std::vector<Job> mJobs;
-    StopSignals& mSignals;
     RowScheduler mScheduler;
-    const std::uint64_t mMapped; ///< bytes, see ReadLimits
-    ProgressLine mProgress;
-    std::size_t mIndex = 0;
-    std::string mName; ///< of the photograph, and of its page, before what is told about it
 };
 
-ExitStatus Batch::failed(ExitStatus status, const std::string& text) {
-    note(text);
-    return status;
-}
-
-void Batch::note(const std::string& text) {
-    mProgress.clear();
-    Messages::tell(text);
-}
-
-ExitStatus Batch::runGuarded(const Job& job) {
-    mName = job.source.string() + ": ";
-    ExceptionStack::clear(); // of what earlier photographs left
-    try {
-        mScheduler.execute([&] { runJob(job); });
-        return ExitStatus::Done;
-    } catch (const StoppedError&) {
-        return ExitStatus::Done;
-    } catch (const TargetError& error) {
-        return failed(ExitStatus::TargetTrouble, error.what());
-    } catch (const MemoryError& error) {
-        return failed(ExitStatus::OutOfMemory, error.what());
-    } catch (const PhotographError& error) {
-        return failed(ExitStatus::PhotographFailed, error.what());
-    } catch (const EngineFailure& error) {
-        return error.isOutOfMemory()
-                   ? failed(ExitStatus::OutOfMemory, mName + error.what() + "; " + kMemoryAdvice)
-                   : failed(ExitStatus::PhotographFailed, mName + error.what() + "; nothing was written");
-    } catch (const std::exception& error) {
-        if (isOutOfMemory(error))
-            return failed(ExitStatus::OutOfMemory, mName + "not enough memory; " + kMemoryAdvice);
-        return failed(ExitStatus::PhotographFailed, mName + innermostMessage(error).toStdString());
-    } catch (...) {
-        return failed(ExitStatus::PhotographFailed, mName + "failed for an unknown reason; report this");
-    }
-}
-
-void Batch::runJob(const Job& job) {
-    makeFolder();
-    WriteOptions writing = mOptions.writing;
-    writing.stop = &mSignals.stopRequested();
-    checkTargetPath(job.target, job.source, writing.overwrite);
-    mProgress.begin(QString::fromStdString(Messages::shown(job.source.filename().string())));
-    PhotographReader reader(job.source, reading());
-    PhotographWriter writer(job.target, writing);
-    for (int page = 0; page < reader.pages(); ++page) {
-        mProgress.page(page, reader.pages());
-        if (reader.pages() > 1)
-            mName = job.source.string() + ": page " + std::to_string(page + 1) + ": ";
-        if (!runPage(job, reader, writer))
-            return;
-    }
-    for (const std::string& warning : writer.commit())
-        note(warning);
-    mProgress.clear();
-    if (!mOptions.quiet)
-        std::cout << Messages::shown(job.source.string()) << " -> " << Messages::shown(job.target.string())
-                  << std::endl;
-}
-
-// Enhances the next page; false when a signal ended it.
-bool Batch::runPage(const Job& job, PhotographReader& reader, PhotographWriter& writer) {
-    // The temporary file of the first pages has to be removed, the log to be finished.
-    mSignals.stay(writer.hasBegun() || mOptions.log);
-    Photograph photograph = read(reader);
-    checkTarget(photograph, job.target, mOptions.writing);
-    if (!photograph.copied) {
-        const std::optional<TraceOptions> trace = traceOf(job, photograph);
-        std::optional<Photograph> result =
-            enhance(std::move(photograph), mSettings, trace, mSignals, mProgress);
-        if (!result)
-            return false;
-        photograph = std::move(*result);
-    }
-    mProgress.step(1, 1, QStringLiteral("Writing"));
-    writer.add(photograph);
-    return true;
-}
-
-// A failure shows when the first target is looked at.
-void Batch::makeFolder() {
-    std::error_code error;
-    if (mOptions.targets.folder)
-        fs::create_directories(*mOptions.targets.folder, error);
-}
-
-ReadOptions Batch::reading() const {
-    // The final touch keeps one more plane, the trace the last picture and the one to compare it with.
-    const std::uint64_t planes = kPlanes + (mSettings.runsFinalTouch ? 1 : 0) + (mOptions.trace ? 2 : 0);
-    ReadOptions reading = mOptions.reading;
-    reading.limits.sampleCopies = kSampleCopies;
-    reading.limits.workBytes = kChannelBytes + planes * kPlaneBytes;
-    reading.limits.mappedBytes = mMapped;
+ReadOptions EnhanceBatch::reading(const EnhanceOptions& options, const RunSettings& settings) {
+    ReadOptions reading = options.reading;
+    const double megapixels = reading.limits.megapixels;
+    reading.limits = needsOf(settings, options.trace.has_value(), threadsOf(options));
+    reading.limits.megapixels = megapixels;
     return reading;
 }
 
-// Reading cannot be stopped half-way, but leaves nothing behind either: a signal ends the program at once.
-Photograph Batch::read(PhotographReader& reader) {
-    const StopAction leave(mSignals, [this] { mSignals.leave(); });
-    return reader.next();
-}
-
-std::optional<TraceOptions> Batch::traceOf(const Job& job, const Photograph& photograph) const {
+std::optional<TraceOptions> EnhanceBatch::traceOf(const Job& job, const Photograph& photograph) const {
     if (!mOptions.trace)
         return std::nullopt;
     fs::path folder = *mOptions.trace;
-    if (mJobs.size() > 1)
-        folder /= std::to_string(mIndex + 1) + "-" + job.source.filename().string();
+    if (jobs().size() > 1)
+        folder /= std::to_string(index() + 1) + "-" + job.source.filename().string();
     if (photograph.pages > 1)
         folder /= "page-" + std::to_string(photograph.page + 1);
     return TraceOptions{folder, mOptions.writing.overwrite};
@@ -216,16 +123,6 @@ void leaving(const std::string& file, StopSignals& signals, const std::function<
 void savePreset(const EnhanceOptions& options, const RunSettings& settings) {
     static_cast<void>(PresetFiles::toWriteInto(*options.savePreset, options.writing.overwrite));
     PresetFiles::write(settings.preset, *options.savePreset, options.writing.overwrite);
-}
-
-ExitStatus report(const Sources& sources) {
-    for (const std::string& failure : sources.failures)
-        Messages::tell(failure);
-    for (const std::string& argument : sources.unmatched)
-        Messages::tell(argument + ": no photograph matches");
-    if (!sources.failures.empty())
-        return ExitStatus::PhotographFailed;
-    return sources.unmatched.empty() ? ExitStatus::Done : ExitStatus::NothingMatched;
 }
 
 // A library whose threads cannot be started waits for them for ever, or ends the program.
@@ -284,7 +181,7 @@ ExitStatus enhancePhotographs(const EnhanceOptions& options, StopSignals& signal
         return targetTrouble(error.what());
     }
     const ExitStatus found = report(sources);
-    const ExitStatus done = Batch(options, settings, jobs, signals).run();
+    const ExitStatus done = EnhanceBatch(options, settings, jobs, signals).run();
     const ExitStatus worst = std::max(done, finish(log));
     // A photograph that failed says more than an argument that matched nothing.
     return worst == ExitStatus::Done ? found : worst;

@@ -1,34 +1,22 @@
 #pragma once
 
 #include "command/ExitStatus.h"
-#include "command/SettingOptions.h"
+#include "command/PhotographOptions.h"
 #include "command/StopSignals.h"
-#include "command/Targets.h"
-#include "files/PhotographReader.h"
-#include "files/PhotographWriter.h"
+#include "run/SettingOptions.h"
 
 #include <optional>
 #include <string>
-#include <vector>
-
-namespace CLI {
-class App;
-}
 
 namespace orvela {
 
 /// The arguments of `orvela enhance`.
-struct EnhanceOptions {
-    std::vector<std::string> photographs; ///< files, folders and patterns
-    TargetOptions targets;
+struct EnhanceOptions : PhotographOptions {
     SettingOptions settings;
     std::optional<std::string> savePreset;
     std::optional<std::string> log;   ///< file for the engine's log
     std::optional<std::string> trace; ///< folder for what each step did
     int threads = 0;                  ///< 0: one per processor
-    bool quiet = false;
-    ReadOptions reading;
-    WriteOptions writing;
 
     /// Declares the arguments to the parser, which fills this object when it parses.
     void declare(CLI::App& app);

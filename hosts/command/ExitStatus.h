@@ -1,7 +1,5 @@
 #pragma once
 
-#include <stdexcept>
-
 namespace orvela {
 
 /// What the program tells its caller. A batch tells the highest status of its photographs: trouble that the
@@ -14,15 +12,10 @@ enum class ExitStatus : int {
     NothingMatched = 3,
     TargetTrouble = 4, ///< a target that cannot be written or must not be overwritten
     OutOfMemory = 5,
+    Cancelled = 6, ///< the user cancelled in the windows; the other photographs were done
 };
 
 /// The exit status of a program that signal n ended is this plus n.
 inline constexpr int kSignalBase = 128;
-
-/// Arguments that make no sense: refused before any work starts.
-class UsageError : public std::runtime_error {
-public:
-    using std::runtime_error::runtime_error;
-};
 
 } // namespace orvela

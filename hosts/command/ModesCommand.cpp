@@ -1,7 +1,7 @@
 #include "command/ModesCommand.h"
 
-#include "command/ModeNames.h"
-#include "command/TextValues.h"
+#include "run/ModeNames.h"
+#include "run/TextValues.h"
 
 #include <algorithm>
 #include <iostream>

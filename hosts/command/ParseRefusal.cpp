@@ -1,7 +1,7 @@
 #include "command/ParseRefusal.h"
 
-#include "command/NearestNames.h"
-#include "command/TextValues.h"
+#include "run/NearestNames.h"
+#include "run/TextValues.h"
 
 #include <CLI/CLI.hpp>
 #include <algorithm>

@@ -5,10 +5,11 @@
 #include "Settings/PresetFile.h"
 #include "Utility/CGenericEx.h"
 #include "command/Messages.h"
-#include "command/ModeNames.h"
-#include "command/NearestNames.h"
-#include "command/PresetFiles.h"
 #include "files/Photograph.h"
+#include "run/ModeNames.h"
+#include "run/NearestNames.h"
+#include "run/PresetFiles.h"
+#include "run/UsageError.h"
 
 #include <QFileInfo>
 

@@ -1,5 +1,6 @@
 #include "command/Sources.h"
 
+#include "command/Messages.h"
 #include "command/Targets.h"
 #include "files/FileFormat.h"
 
@@ -67,6 +68,16 @@ Sources findSources(const std::vector<std::string>& arguments) {
                 sources.photographs.push_back(photograph);
     }
     return sources;
+}
+
+ExitStatus report(const Sources& sources) {
+    for (const std::string& failure : sources.failures)
+        Messages::tell(failure);
+    for (const std::string& argument : sources.unmatched)
+        Messages::tell(argument + ": no photograph matches");
+    if (!sources.failures.empty())
+        return ExitStatus::PhotographFailed;
+    return sources.unmatched.empty() ? ExitStatus::Done : ExitStatus::NothingMatched;
 }
 
 } // namespace orvela

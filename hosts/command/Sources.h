@@ -1,5 +1,7 @@
 #pragma once
 
+#include "command/ExitStatus.h"
+
 #include <filesystem>
 #include <string>
 #include <vector>
@@ -16,5 +18,8 @@ struct Sources {
 /// An argument is a file (existing or not), a folder (the photographs in it, by name; hidden
 /// files and results of earlier runs left out) or a shell pattern that no file matches literally.
 Sources findSources(const std::vector<std::string>& arguments);
+
+/// Tells what could not be read and which arguments matched nothing.
+ExitStatus report(const Sources& sources);
 
 } // namespace orvela

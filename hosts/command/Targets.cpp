@@ -3,6 +3,7 @@
 #include "command/ExitStatus.h"
 #include "files/FileFormat.h"
 #include "files/PhotographWriter.h"
+#include "run/UsageError.h"
 
 #include <sys/stat.h>
 
@@ -17,6 +18,7 @@ namespace fs = std::filesystem;
 namespace {
 
 constexpr std::string_view kSuffix = "-enhanced";
+constexpr int kMostNumbers = 10000;
 
 // What the file is, whatever its name says; the name decides about files that cannot be read or are nothing
 // known, which fail later on.
@@ -38,6 +40,14 @@ fs::path targetOf(const fs::path& source, const TargetOptions& options) {
         return beside;
     fs::path name = source.stem();
     return *options.folder / (name += beside.extension());
+}
+
+// The target, or, where names that are taken get a number, one that neither a file nor another result has.
+fs::path freeTarget(const fs::path& target, const TargetOptions& options,
+                    const std::map<fs::path, fs::path>& planned) {
+    if (!options.freeNames || options.file)
+        return target;
+    return freeName(target, [&planned](const fs::path& name) { return planned.contains(realPath(name)); });
 }
 
 // What no photograph could be written into.
@@ -76,7 +86,8 @@ std::vector<Job> planTargets(const std::vector<fs::path>& sources, const TargetO
     std::vector<Job> jobs;
     std::map<fs::path, fs::path> sourceOfTarget;
     for (const fs::path& source : sources) {
-        const Job& job = jobs.emplace_back(Job{source, targetOf(source, options)});
+        const fs::path target = freeTarget(targetOf(source, options), options, sourceOfTarget);
+        const Job& job = jobs.emplace_back(Job{source, target});
         if (known.contains(job.target))
             throw UsageError(job.target.string() +
                              ": the result would overwrite a photograph that is read; name another target");
@@ -89,7 +100,27 @@ std::vector<Job> planTargets(const std::vector<fs::path>& sources, const TargetO
 }
 
 bool isEarlierResult(const fs::path& file) {
-    return file.stem().string().ends_with(kSuffix);
+    std::string name = file.stem().string();
+    const auto digits = name.find_last_not_of("0123456789");
+    if (digits != std::string::npos && digits + 1 < name.size() && name[digits] == '-')
+        name.resize(digits);
+    return name.ends_with(kSuffix);
+}
+
+fs::path freeName(const fs::path& file, const std::function<bool(const fs::path&)>& isTaken) {
+    const auto exists = [](const fs::path& name) {
+        std::error_code error;
+        return fs::symlink_status(name, error).type() != fs::file_type::not_found;
+    };
+    fs::path candidate = file;
+    for (int number = 2; (exists(candidate) || (isTaken && isTaken(candidate))) && number < kMostNumbers;
+         ++number) {
+        fs::path name = file.stem();
+        name += '-';
+        name += std::to_string(number);
+        candidate = file.parent_path() / (name += file.extension());
+    }
+    return candidate;
 }
 
 fs::path realPath(const fs::path& path) {

@@ -2,6 +2,7 @@
 
 #include <cstdint>
 #include <filesystem>
+#include <functional>
 #include <optional>
 #include <set>
 #include <utility>
@@ -13,6 +14,7 @@ namespace orvela {
 struct TargetOptions {
     std::optional<std::filesystem::path> file;   ///< of the one result
     std::optional<std::filesystem::path> folder; ///< of all results, under the names of their sources
+    bool freeNames = false; ///< a name that is taken gets a number behind it: NAME-enhanced-2.EXT
 };
 
 /// One photograph and the file that its result goes to.
@@ -27,8 +29,13 @@ struct Job {
 ///         written under its name
 std::vector<Job> planTargets(const std::vector<std::filesystem::path>& sources, const TargetOptions& options);
 
-/// True for a file that a run without a target of its own wrote.
+/// True for a file that a run without a target of its own wrote, also one with a number.
 bool isEarlierResult(const std::filesystem::path& file);
+
+/// The file, or, when there is such a file already or the name is taken otherwise, the first free one with a
+/// number behind it.
+std::filesystem::path freeName(const std::filesystem::path& file,
+                               const std::function<bool(const std::filesystem::path&)>& isTaken = {});
 
 /// The absolute path without links, "." and ".."; with the links where they lead nowhere.
 std::filesystem::path realPath(const std::filesystem::path& path);

@@ -2,6 +2,7 @@
 
 #include <cmath>
 #include <cstring>
+#include <functional>
 #include <limits>
 #include <new>
 #include <utility>
@@ -13,16 +14,15 @@ namespace {
 constexpr host::Fixed kFixedOne = 0x10000;
 // Behind every row, so that a filter which takes the width for the stride goes wrong at once.
 constexpr int kRowPadding = 14;
-constexpr std::uint8_t kPoison = 0xDB;
 
 host::Fixed dotsPerInch(double perMillimetre) {
     const double dpi = perMillimetre > 0 ? std::min(perMillimetre * 25.4, 32767.0) : 72.0;
     return static_cast<host::Fixed>(std::lround(dpi * kFixedOne));
 }
 
-host::ImageMode modeOf(const Photograph& photograph) {
-    const bool deep = photograph.depth == 16;
-    switch (photograph.model) {
+host::ImageMode modeOf(const PictureShape& shape) {
+    const bool deep = shape.depth == 16;
+    switch (shape.model) {
     case ColorModel::Grey:
     case ColorModel::GreyAlpha:
         return deep ? host::ModeGray16 : host::ModeGrayScale;
@@ -33,27 +33,34 @@ host::ImageMode modeOf(const Photograph& photograph) {
     }
 }
 
-// A filter that goes on using a buffer it no longer owns shall not find its pixels there.
-template <typename Buffer>
-void release(Buffer& buffer) {
-    std::fill(buffer.begin(), buffer.end(), kPoison);
-    Buffer().swap(buffer);
-}
-
-std::uint16_t sample16(const std::uint8_t* at) {
-    std::uint16_t value = 0;
+template <typename Sample>
+Sample load(const std::uint8_t* at) {
+    Sample value{};
     std::memcpy(&value, at, sizeof value);
     return value;
+}
+
+// Copies `count` samples, of which each stands some samples behind the one before.
+template <typename Sample, typename Convert>
+void copySamples(std::uint8_t* to, int toStep, const std::uint8_t* from, int fromStep, int count,
+                 Convert convert) {
+    for (int i = 0; i < count;
+         ++i, to += toStep * int{sizeof(Sample)}, from += fromStep * int{sizeof(Sample)}) {
+        const Sample value = convert(load<Sample>(from));
+        std::memcpy(to, &value, sizeof value);
+    }
 }
 
 } // namespace
 
 thread_local ImageHost* ImageHost::sActive = nullptr;
 
-ImageHost::ImageHost(Photograph photograph)
-    : mPrevious(sActive), mSource(std::move(photograph)), mResult(mSource),
+ImageHost::ImageHost(const PictureShape& shape, std::span<const std::uint8_t> source,
+                     std::span<std::uint8_t> result)
+    : mPrevious(sActive), mShape(shape), mSource(source), mResult(result),
       mRecord(new (mRecordBytes.data()) host::FilterRecord{}),
-      mPlanes(mSource.model == ColorModel::GreyAlpha ? 1 : samplesPerPixel(mSource.model)) {
+      mPlanes(shape.model == ColorModel::GreyAlpha ? 1 : samplesPerPixel(shape.model)) {
+    std::copy(source.begin(), source.end(), result.begin());
     fillRecord();
     sActive = this;
 }
@@ -62,31 +69,26 @@ ImageHost::~ImageHost() {
     sActive = mPrevious;
 }
 
-void ImageHost::failAt(int n, std::int16_t code) {
-    mFailIn = n;
-    mFailCode = code;
-}
-
 void ImageHost::fillRecord() {
     host::FilterRecord& record = *mRecord;
-    const auto width = static_cast<std::int16_t>(mSource.width);
-    const auto height = static_cast<std::int16_t>(mSource.height);
-    record.abortProc = abortProc;
-    record.progressProc = progressProc;
+    const auto width = static_cast<std::int16_t>(mShape.width);
+    const auto height = static_cast<std::int16_t>(mShape.height);
+    record.abortProc = [] { return host::Boolean{0}; };
+    record.progressProc = [](std::int32_t, std::int32_t) {};
     record.advanceState = advanceState;
     record.imageSize = {height, width};
     record.wholeSize = {height, width};
     record.filterRect = {0, 0, height, width};
     record.planes = static_cast<std::int16_t>(mPlanes);
-    record.depth = mSource.depth;
-    record.imageMode = modeOf(mSource);
-    record.imageHRes = dotsPerInch(mSource.xResolution);
-    record.imageVRes = dotsPerInch(mSource.yResolution);
+    record.depth = mShape.depth;
+    record.imageMode = modeOf(mShape);
+    record.imageHRes = dotsPerInch(mShape.xResolution);
+    record.imageVRes = dotsPerInch(mShape.yResolution);
     record.maxSpace = std::numeric_limits<std::int32_t>::max();
     record.bufferSpace = record.maxSpace;
     record.hostSig = 0x3842494D; // '8BIM'
     record.filterCase = 1;       // flat, no selection
-    if (mSource.model == ColorModel::RgbAlpha) {
+    if (mShape.model == ColorModel::RgbAlpha) {
         record.filterCase = 4; // editable transparency, no selection
         record.inLayerPlanes = 3;
         record.inTransparencyMask = 1;
@@ -108,22 +110,11 @@ std::int16_t ImageHost::advanceState() {
     return sActive != nullptr ? sActive->advance() : static_cast<std::int16_t>(host::ParamErr);
 }
 
-host::Boolean ImageHost::abortProc() {
-    return sActive != nullptr && sActive->onAbort && sActive->onAbort() ? 1 : 0;
-}
-
-void ImageHost::progressProc(std::int32_t done, std::int32_t total) {
-    if (sActive != nullptr && sActive->onProgress)
-        sActive->onProgress(done, total);
-}
-
 std::int16_t ImageHost::advance() {
-    if (mFailIn > 0 && --mFailIn == 0)
-        return mFailCode;
     host::FilterRecord& record = *mRecord;
     store();
-    release(mIn);
-    release(mOut);
+    Buffer().swap(mIn);
+    Buffer().swap(mOut);
     record.maskData = nullptr;
     record.inData = nullptr;
     record.inRowBytes = 0;
@@ -141,11 +132,11 @@ std::int16_t ImageHost::advance() {
     }
     if (!in.isEmpty()) {
         record.inData = mIn.data();
-        record.inRowBytes = stride(in);
+        record.inRowBytes = static_cast<std::int32_t>(stride(in));
     }
     if (!out.isEmpty()) {
         record.outData = mOut.data();
-        record.outRowBytes = stride(out);
+        record.outRowBytes = static_cast<std::int32_t>(stride(out));
         mPending = out;
     }
     return host::NoErr;
@@ -154,58 +145,59 @@ std::int16_t ImageHost::advance() {
 bool ImageHost::isValid(const Request& request) const {
     if (request.isEmpty())
         return true;
-    return request.area.left >= 0 && request.area.top >= 0 && request.area.right <= mSource.width &&
-           request.area.bottom <= mSource.height && request.low >= 0 && request.low <= request.high &&
+    return request.area.left >= 0 && request.area.top >= 0 && request.area.right <= mShape.width &&
+           request.area.bottom <= mShape.height && request.low >= 0 && request.low <= request.high &&
            request.high < mPlanes;
 }
 
-int ImageHost::stride(const Request& request) const {
-    return request.width() * request.planes() * mSource.depth / 8 + kRowPadding;
+std::size_t ImageHost::stride(const Request& request) const {
+    return static_cast<std::size_t>(request.width() * request.planes() * mShape.depth / 8 + kRowPadding);
 }
 
-// Calls visit(offset in the buffer, offset in the samples) for each sample of the request.
-template <typename Visit>
-void ImageHost::visit(const Request& request, Visit visit) const {
-    const auto bytes = static_cast<std::size_t>(mSource.depth / 8);
-    const auto samples = static_cast<std::size_t>(samplesPerPixel(mSource.model));
-    for (int y = request.area.top; y < request.area.bottom; ++y) {
-        std::size_t buffer =
-            static_cast<std::size_t>(y - request.area.top) * static_cast<std::size_t>(stride(request));
-        const std::size_t first = static_cast<std::size_t>(y) * static_cast<std::size_t>(mSource.width);
-        for (int x = request.area.left; x < request.area.right; ++x)
-            for (int plane = request.low; plane <= request.high; ++plane, buffer += bytes)
-                visit(buffer,
-                      ((first + static_cast<std::size_t>(x)) * samples + static_cast<std::size_t>(plane)) *
-                          bytes);
-    }
+// Of the request's first sample in a row of the picture, which counts from the request's top.
+std::size_t ImageHost::offset(const Request& request, int row) const {
+    const int sample = request.area.left * samplesPerPixel(mShape.model) + request.low;
+    return static_cast<std::size_t>(request.area.top + row) * mShape.bytesPerRow() +
+           static_cast<std::size_t>(sample * mShape.depth / 8);
 }
 
-ImageHost::Buffer ImageHost::take(const Request& request, const Photograph& from) const {
+// Calls copy(offset in the buffer, offset in the picture) for the line of each plane in each row.
+template <typename Copy>
+void ImageHost::forEachLine(const Request& request, Copy copy) const {
+    const auto bytes = static_cast<std::size_t>(mShape.depth / 8);
+    for (int row = 0; row < request.area.bottom - request.area.top; ++row)
+        for (std::size_t plane = 0; plane < static_cast<std::size_t>(request.planes()); ++plane)
+            copy(stride(request) * static_cast<std::size_t>(row) + plane * bytes,
+                 offset(request, row) + plane * bytes);
+}
+
+ImageHost::Buffer ImageHost::take(const Request& request, std::span<const std::uint8_t> from) const {
     if (request.isEmpty())
         return {};
-    const int rows = request.area.bottom - request.area.top;
-    Buffer buffer(static_cast<std::size_t>(stride(request)) * static_cast<std::size_t>(rows), kPoison);
-    if (from.depth == 8)
-        visit(request, [&](std::size_t to, std::size_t at) { buffer[to] = from.samples[at]; });
-    else
-        visit(request, [&](std::size_t to, std::size_t at) {
-            const std::uint16_t value = toHostSample(sample16(from.samples.data() + at));
-            std::memcpy(buffer.data() + to, &value, sizeof value);
-        });
+    Buffer buffer(stride(request) * static_cast<std::size_t>(request.area.bottom - request.area.top));
+    const int step = samplesPerPixel(mShape.model);
+    forEachLine(request, [&](std::size_t to, std::size_t at) {
+        if (mShape.depth == 8)
+            copySamples<std::uint8_t>(&buffer[to], request.planes(), &from[at], step, request.width(),
+                                      std::identity());
+        else
+            copySamples<std::uint16_t>(&buffer[to], request.planes(), &from[at], step, request.width(),
+                                       toHostSample);
+    });
     return buffer;
 }
 
 void ImageHost::store() {
     const Request request = std::exchange(mPending, Request{});
-    if (request.isEmpty())
-        return;
-    if (mResult.depth == 8)
-        visit(request, [&](std::size_t from, std::size_t at) { mResult.samples[at] = mOut[from]; });
-    else
-        visit(request, [&](std::size_t from, std::size_t at) {
-            const std::uint16_t value = toFileSample(sample16(mOut.data() + from));
-            std::memcpy(mResult.samples.data() + at, &value, sizeof value);
-        });
+    const int step = samplesPerPixel(mShape.model);
+    forEachLine(request, [&](std::size_t at, std::size_t to) {
+        if (mShape.depth == 8)
+            copySamples<std::uint8_t>(&mResult[to], step, &mOut[at], request.planes(), request.width(),
+                                      std::identity());
+        else
+            copySamples<std::uint16_t>(&mResult[to], step, &mOut[at], request.planes(), request.width(),
+                                       toFileSample);
+    });
 }
 
 } // namespace orvela

@@ -1,13 +1,12 @@
 #pragma once
 
 #include "Platform/FilterRecord.h"
-#include "files/Photograph.h"
+#include "common/PictureShape.h"
 
 #include <algorithm>
 #include <array>
 #include <cstddef>
-#include <functional>
-#include <memory>
+#include <span>
 #include <vector>
 
 namespace orvela {
@@ -22,8 +21,8 @@ constexpr std::uint16_t toFileSample(std::uint16_t host) {
     return static_cast<std::uint16_t>((std::min<std::uint32_t>(host, 32768U) * 65535U + 16384U) / 32768U);
 }
 
-/// The host side of the filter record over a photograph in memory. Requests read the photograph as it came;
-/// what the filter writes goes to a second one, which starts as a copy, so that samples and channels that are
+/// The host side of the filter record over a picture in memory. Requests read the picture as it came; what
+/// the filter writes goes to a second one, which starts as a copy, so that samples and channels that are
 /// never written stay exactly as they are. Grey is offered as one plane, also with transparency, which the
 /// filter would make opaque; RGB as three; RGB with transparency and CMYK as four.
 ///
@@ -31,7 +30,11 @@ constexpr std::uint16_t toFileSample(std::uint16_t host) {
 /// Construct, use and destroy a host on one thread, and destroy hosts in reverse order.
 class ImageHost {
 public:
-    explicit ImageHost(Photograph photograph);
+    /// @param source, result  the samples, as many bytes as the shape has; they outlive this object. The
+    /// result
+    ///                        holds what the filter has written and handed back by a further advanceState.
+    ImageHost(const PictureShape& shape, std::span<const std::uint8_t> source,
+              std::span<std::uint8_t> result);
     ~ImageHost();
     ImageHost(const ImageHost&) = delete;
     ImageHost& operator=(const ImageHost&) = delete;
@@ -39,14 +42,8 @@ public:
     /// The record for all selectors but about.
     host::FilterRecord& record() { return *mRecord; }
 
-    /// The result: what the filter has written and handed back by a further advanceState.
-    Photograph& photograph() { return mResult; }
-
-    /// Makes the n-th advanceState from now (1: the next) return `code` without doing anything.
-    void failAt(int n, std::int16_t code);
-
-    std::function<bool()> onAbort;            ///< answers the filter's question whether to stop; none: no
-    std::function<void(int, int)> onProgress; ///< done and total, when the filter reports it
+    /// The window above which the filter's windows are to stand, in the system's own terms.
+    void setWindow(void* window) { mPlatform.hostWindow = window; }
 
 private:
     /// An area and planes of the image, both ends of the planes included.
@@ -62,30 +59,28 @@ private:
     using Buffer = std::vector<std::uint8_t>;
 
     static std::int16_t advanceState();
-    static host::Boolean abortProc();
-    static void progressProc(std::int32_t done, std::int32_t total);
 
     void fillRecord();
     std::int16_t advance();
     bool isValid(const Request& request) const;
-    int stride(const Request& request) const;
-    Buffer take(const Request& request, const Photograph& from) const;
+    std::size_t stride(const Request& request) const;
+    std::size_t offset(const Request& request, int row) const;
+    template <typename Copy>
+    void forEachLine(const Request& request, Copy copy) const;
+    Buffer take(const Request& request, std::span<const std::uint8_t> from) const;
     void store();
-    template <typename Visit>
-    void visit(const Request& request, Visit visit) const;
 
     static thread_local ImageHost* sActive;
 
     ImageHost* mPrevious;
-    const Photograph mSource;
-    Photograph mResult;
+    const PictureShape mShape;
+    std::span<const std::uint8_t> mSource;
+    std::span<std::uint8_t> mResult;
     alignas(16) std::array<std::byte, 1024> mRecordBytes{};
     host::FilterRecord* mRecord;
     host::PlatformData mPlatform{};
     std::array<std::uint8_t, 256> mErrorString{};
     int mPlanes;
-    int mFailIn = 0;
-    std::int16_t mFailCode = 0;
     Request mPending;
     Buffer mIn;
     Buffer mOut;

@@ -78,16 +78,16 @@ _orvela() {
         [[ ${COMP_WORDS[at]} == --* ]] || at=$((at - 1))
     done
     for each in "${COMP_WORDS[@]:1:COMP_CWORD-1}"; do
-        case ${command[*]}/$each in /enhance | /modes | /presets | presets/[a-z]*) command+=("$each") ;; esac
+        case ${command[*]}/$each in /enhance | /edit | /modes | /presets | presets/[a-z]*) command+=("$each") ;; esac
     done
     _orvela_value "${COMP_WORDS[at]}" "$word" "${command[0]-}" && return
     case ${command[*]}/$word in
         */-*) _orvela_offer "$word" "$(orvela "${command[@]}" --help 2>/dev/null | grep -oE -- '--[a-z-]+')" ;;
-        /*) _orvela_offer "$word" $'enhance\nmodes\npresets' ;;
+        /*) _orvela_offer "$word" $'enhance\nedit\nmodes\npresets' ;;
         presets/*) _orvela_offer "$word" $'list\nexport\nimport\nremove' ;;
         "presets export/"*) _orvela_offer_presets "$word" presets files ;;
         "presets remove/"*) _orvela_offer_presets "$word" presets ;;
-        enhance/* | "presets import/"*) _orvela_offer_files "$word" ;;
+        enhance/* | edit/* | "presets import/"*) _orvela_offer_files "$word" ;;
     esac
 }
 

@@ -2,7 +2,7 @@
 
 # The options that --help lists, for the subcommands of the line.
 function __orvela_options
-    orvela (commandline -opc | string match -r '^(?:enhance|modes|presets|list|export|import|remove)$') --help 2>/dev/null |
+    orvela (commandline -opc | string match -r '^(?:enhance|edit|modes|presets|list|export|import|remove)$') --help 2>/dev/null |
         string match -rg -- '^ +(?:-[a-z],)?(--[a-z-]+)'
 end
 
@@ -29,7 +29,7 @@ function __orvela_presets
     end
 end
 
-set -l commands enhance modes presets
+set -l commands enhance edit modes presets
 set -l actions list export import remove
 complete -c orvela -n "not __fish_seen_subcommand_from $commands" -f -a "$commands"
 complete -c orvela -n "__fish_seen_subcommand_from presets; and not __fish_seen_subcommand_from $actions" -f -a "$actions"

@@ -44,7 +44,7 @@ _orvela() {
         -d|--directory|--trace) _files -/; return ;;
     esac
     if (( CURRENT == 2 )); then
-        compadd enhance modes presets
+        compadd enhance edit modes presets
     elif [[ $PREFIX == -* ]]; then
         _orvela_options $depth
     elif [[ $words[2] == presets ]] && (( CURRENT == 3 )); then

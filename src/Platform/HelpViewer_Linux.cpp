@@ -2,7 +2,7 @@
 
 namespace orvela {
 
-bool HelpViewer::show(WId, const QString&) {
+bool HelpViewer::show(void*, const std::string&) {
     return false;
 }
 

@@ -35,12 +35,12 @@ ViewerCall loadViewer() {
 
 } // namespace
 
-bool HelpViewer::show(WId owner, const QString& topic) {
+bool HelpViewer::show(void* owner, const std::string& topic) {
     // Loaded once and for the life of the process; what failed once is not tried again.
     static const ViewerCall viewer = loadViewer();
     if (!viewer)
         return false;
-    viewer(reinterpret_cast<HWND>(owner), topic.toLocal8Bit().constData(), kDisplayTopic, 0);
+    viewer(static_cast<HWND>(owner), topic.c_str(), kDisplayTopic, 0);
     return true;
 }
 

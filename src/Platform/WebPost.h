@@ -1,9 +1,9 @@
 #pragma once
 
-#include <QByteArray>
-#include <QString>
-
 #include <chrono>
+#include <cstddef>
+#include <cstdint>
+#include <string>
 
 namespace orvela {
 
@@ -12,22 +12,22 @@ namespace WebPost {
 
 /// A form and where it goes.
 struct Form {
-    QString host;
-    quint16 port = 80;
-    QByteArray path;                       ///< on the server, without a slash at the front
-    QByteArray body;                       ///< its fields, encoded
-    QByteArray agent;                      ///< what the sender calls itself
+    std::string host;
+    std::uint16_t port = 80;
+    std::string path;                      ///< on the server, without a slash at the front
+    std::string body;                      ///< its fields, encoded
+    std::string agent;                     ///< what the sender calls itself
     std::chrono::milliseconds limit{3000}; ///< of the whole transfer, from the server's name to the last byte
 };
 
 /// What the server sent back.
 struct Reply {
-    QByteArray body; ///< whatever its status was; cut at kMostBytes, and where the connection was
-    QString error;   ///< why nothing came back; empty when something did
+    std::string body;  ///< whatever its status was; cut at kMostBytes, and where the connection was
+    std::string error; ///< why nothing came back; empty when something did
 };
 
 /// Nothing is read beyond so many bytes of a reply.
-constexpr int kMostBytes = 4096;
+constexpr std::size_t kMostBytes = 4096;
 
 /// Posts the form and waits for the reply, without serving the user in the meantime. It goes through the
 /// proxy that is set up for the system, on Linux by the variable http_proxy. Only Windows follows

@@ -14,6 +14,8 @@ namespace WebPost {
 
 namespace {
 
+constexpr auto kMost = static_cast<qint64>(kMostBytes);
+
 // The proxy that the environment names. That of the desktop is not asked for: looking it up may itself ask
 // the net, and cannot be given up.
 QNetworkProxy proxyOfEnvironment() {
@@ -27,14 +29,14 @@ QNetworkProxy proxyOfEnvironment() {
 QNetworkRequest requestOf(const Form& form) {
     QUrl url;
     url.setScheme(QStringLiteral("http"));
-    url.setHost(form.host);
+    url.setHost(QString::fromStdString(form.host));
     if (form.port != 80)
         url.setPort(form.port); // the request would name the usual one too
-    url.setPath(QLatin1Char('/') + QString::fromLatin1(form.path));
+    url.setPath(QLatin1Char('/') + QString::fromStdString(form.path));
     QNetworkRequest request(url);
     request.setHeader(QNetworkRequest::ContentTypeHeader,
                       QByteArrayLiteral("application/x-www-form-urlencoded"));
-    request.setHeader(QNetworkRequest::UserAgentHeader, form.agent);
+    request.setHeader(QNetworkRequest::UserAgentHeader, QByteArray::fromStdString(form.agent));
     // As it is: nothing that unpacks to more than was sent.
     request.setRawHeader("Accept-Encoding", "identity");
     request.setAttribute(QNetworkRequest::RedirectPolicyAttribute, QNetworkRequest::ManualRedirectPolicy);
@@ -49,7 +51,7 @@ void await(const QNetworkReply& reply, std::chrono::milliseconds limit) {
     time.start(limit);
     QObject::connect(&reply, &QNetworkReply::finished, &loop, &QEventLoop::quit);
     QObject::connect(&reply, &QNetworkReply::readyRead, &loop, [&reply, &loop] {
-        if (reply.bytesAvailable() >= kMostBytes)
+        if (reply.bytesAvailable() >= kMost)
             loop.quit();
     });
     loop.exec(QEventLoop::ExcludeUserInputEvents);
@@ -60,13 +62,14 @@ void await(const QNetworkReply& reply, std::chrono::milliseconds limit) {
 Reply post(const Form& form) {
     QNetworkAccessManager manager;
     manager.setProxy(proxyOfEnvironment());
-    const std::unique_ptr<QNetworkReply> reply(manager.post(requestOf(form), form.body));
-    reply->setReadBufferSize(kMostBytes);
+    const std::unique_ptr<QNetworkReply> reply(
+        manager.post(requestOf(form), QByteArray::fromStdString(form.body)));
+    reply->setReadBufferSize(kMost);
     await(*reply, form.limit);
-    const bool complete = reply->isFinished() || reply->bytesAvailable() >= kMostBytes;
+    const bool complete = reply->isFinished() || reply->bytesAvailable() >= kMost;
     if (!complete || !reply->attribute(QNetworkRequest::HttpStatusCodeAttribute).isValid())
-        return {{}, QStringLiteral("Unable to send data to server.")};
-    return {reply->read(kMostBytes), {}};
+        return {{}, "Unable to send data to server."};
+    return {reply->read(kMost).toStdString(), {}};
 }
 
 } // namespace WebPost

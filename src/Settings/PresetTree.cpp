@@ -98,6 +98,10 @@ QString guiKey(const QString& name) {
     return QStringLiteral("2000/GUI/") + name;
 }
 
+QString batchModeKey() {
+    return guiKey(QStringLiteral("batchMode"));
+}
+
 QString batchPresetName() {
     return QStringLiteral("__batchmodesettings__");
 }

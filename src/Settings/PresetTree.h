@@ -63,6 +63,9 @@ bool switchOf(const QVariant& value);
 /// The reserved name of the last accepted run's settings.
 QString batchPresetName();
 
+/// The key of the number of the mode whose accepted settings are replayed.
+QString batchModeKey();
+
 /// The names of the mode's presets in the store's order, the reserved one included; none for a value that is
 /// not a mode.
 QStringList names(EGUIMode mode);

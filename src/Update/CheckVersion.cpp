@@ -118,10 +118,11 @@ unsigned CheckVersion::postToServer(const QByteArray& path, const QByteArray& bo
     const UpdateServer server = updateServer();
     if (!server.exists())
         return fail(QStringLiteral("Unable to etablish contact with server."));
-    const auto [received, error] =
-        WebPost::post({server.host, server.port, path, body, QByteArrayLiteral("KestrandProduct")});
-    if (!error.isEmpty())
-        return fail(error);
+    const auto [sent, error] = WebPost::post(
+        {server.host.toStdString(), server.port, path.toStdString(), body.toStdString(), "KestrandProduct"});
+    if (!error.empty())
+        return fail(QString::fromStdString(error));
+    const QByteArray received = QByteArray::fromStdString(sent);
     const QString malformed = QStringLiteral("Malformed server answer.");
     if (received.size() <= kReplyMarker.size() || !received.contains(kReplyMarker))
         return fail(malformed);

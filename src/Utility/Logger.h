@@ -64,6 +64,22 @@ bool writes(LogLevel level);
 
 } // namespace Log
 
+/// A scope of the log: its entry when made, its exit when destroyed.
+class LogScope {
+public:
+    /// @param text  outlives it
+    LogScope(LogLevel level, const char* text) : mLevel(level), mText(text) {
+        Log::scopeEntry(mLevel, "%s", mText);
+    }
+    ~LogScope() { Log::scopeExit(mLevel, "%s", mText); }
+    LogScope(const LogScope&) = delete;
+    LogScope& operator=(const LogScope&) = delete;
+
+private:
+    LogLevel mLevel;
+    const char* mText;
+};
+
 /// While it lives, the lines of its thread are indented by a depth of their own, so that runs on several
 /// threads do not indent each other's. Elsewhere one depth holds for the whole process.
 class LogDepth {

@@ -3,10 +3,10 @@
 
 #include "Core/CThreadedCore_Orvela.h"
 #include "Library/Utility/CARGBPlaneProxyDirect.h"
-#include "PluginEntry/CARGBPlanePhotoshop.h"
+#include "PluginEntry/Exchange/CARGBPlanePhotoshop.h"
 #include "Settings/ModeTable.h"
-#include "common/ImageHost.h"
 #include "files/PhotographReader.h"
+#include "support/HostedPicture.h"
 #include "support/TestPlanes.h"
 
 #include <QCryptographicHash>
@@ -79,7 +79,7 @@ std::string runLine(const std::string& photograph, const CARGBPlane& original, c
 }
 
 std::vector<std::string> linesOf(const fs::path& photograph) {
-    ImageHost host(readPhotograph(photograph));
+    HostedPicture host(readPhotograph(photograph));
     std::int16_t result = 0;
     CARGBPlanePhotoshop plane(0, 0, QStringLiteral("record"));
     plane.FillFrom_Photoshop_Data(&host.record(), &result);

@@ -102,9 +102,13 @@ QAccessibleInterface* makeAccess(const QString&, QObject* object) {
 
 } // namespace
 
+// The toolkit may outlive the module that this is part of.
 void installControlAccessibility() {
-    static const bool installed = (QAccessible::installFactory(makeAccess), true);
-    static_cast<void>(installed);
+    struct Factory {
+        Factory() { QAccessible::installFactory(makeAccess); }
+        ~Factory() { QAccessible::removeFactory(makeAccess); }
+    };
+    static const Factory factory;
 }
 
 } // namespace orvela

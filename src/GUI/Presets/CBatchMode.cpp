@@ -17,11 +17,10 @@ using namespace orvela;
 namespace {
 
 const QString kEnabled = QStringLiteral("batchModeEnabled");
-const QString kMode = QStringLiteral("batchMode");
 
-void write(const QString& name, const QVariant& value) {
+void write(const QString& key, const QVariant& value) {
     SettingsEdit edit;
-    edit.set(PresetTree::guiKey(name), value);
+    edit.set(key, value);
     StoreWriting::commit(edit, StoreWriting::Cause::Program);
 }
 
@@ -55,13 +54,13 @@ bool CBatchMode::replays() const {
 }
 
 void CBatchMode::setBatchModeEnabled(bool enabled) {
-    write(kEnabled, enabled);
+    write(PresetTree::guiKey(kEnabled), enabled);
 }
 
 int CBatchMode::batchMode() const {
-    return openSettings().value(PresetTree::guiKey(kMode), -1).toInt();
+    return openSettings().value(PresetTree::batchModeKey(), -1).toInt();
 }
 
 void CBatchMode::setBatchMode(int mode) {
-    write(kMode, mode);
+    write(PresetTree::batchModeKey(), mode);
 }

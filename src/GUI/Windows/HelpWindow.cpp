@@ -28,6 +28,7 @@
 #include <QWindow>
 
 #include <algorithm>
+#include <bit>
 
 namespace orvela {
 
@@ -253,10 +254,12 @@ void HelpWindow::leaveSearch() {
 
 void openHelp(const QString& topic, QWidget* owner) {
     static QPointer<HelpWindow> window;
-    const QString compiled = HelpViewer::compiledManual();
+    const QString compiled =
+        QCoreApplication::applicationDirPath() + QLatin1String(HelpViewer::kCompiledManual);
     if (!QFile::exists(compiled))
         DebugBoxes::debugWarning(QStringLiteral("Help file missing:") + compiled, QStringLiteral("Warning"));
-    else if (HelpViewer::show(owner->winId(), compiled + QStringLiteral("::/") + topic))
+    else if (HelpViewer::show(std::bit_cast<void*>(owner->winId()),
+                              (compiled + QStringLiteral("::/") + topic).toLocal8Bit().toStdString()))
         return;
     // A window over which a modal one stands is out of reach, and so would its help be.
     QWidget* reachable = QApplication::activeModalWidget() ? QApplication::activeModalWidget() : owner;

@@ -26,6 +26,11 @@ struct Catalogues {
     QTranslator windows;
 };
 
+std::unique_ptr<Catalogues>& installed() {
+    static std::unique_ptr<Catalogues> catalogues;
+    return catalogues;
+}
+
 QString chosenLanguage(const QLocale& locale) {
     const QStringList known = languages();
     for (const QString& wanted : locale.uiLanguages()) {
@@ -38,22 +43,25 @@ QString chosenLanguage(const QLocale& locale) {
 
 } // namespace
 
-QString install(const QLocale& locale) {
-    static std::unique_ptr<Catalogues> installed;
+QString install(const QLocale& locale, Texts texts) {
     initResource();
-    installed.reset(); // takes the translators away
+    remove();
     QString language = chosenLanguage(locale);
     if (language == QLatin1String("en"))
         return language;
     auto catalogues = std::make_unique<Catalogues>();
     if (!catalogues->windows.load(QStringLiteral("orvela_") + language, kFolder))
         return QStringLiteral("en"); // and not the toolkit's buttons in another language than the windows
-    installed = std::move(catalogues);
-    if (installed->toolkit.load(QStringLiteral("qtbase_") + language,
-                                QLibraryInfo::path(QLibraryInfo::TranslationsPath)))
-        QCoreApplication::installTranslator(&installed->toolkit);
-    QCoreApplication::installTranslator(&installed->windows);
+    if (texts == WithToolkit && catalogues->toolkit.load(QStringLiteral("qtbase_") + language,
+                                                         QLibraryInfo::path(QLibraryInfo::TranslationsPath)))
+        QCoreApplication::installTranslator(&catalogues->toolkit);
+    QCoreApplication::installTranslator(&catalogues->windows);
+    installed() = std::move(catalogues);
     return language;
+}
+
+void remove() {
+    installed().reset(); // what is destroyed is no longer asked
 }
 
 QStringList languages() {

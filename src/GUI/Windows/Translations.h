@@ -11,10 +11,16 @@ namespace orvela {
 /// they are shown; as keys of the settings store and on the command line they stay as they are.
 namespace Translations {
 
+enum Texts { WithToolkit, WindowsOnly };
+
 /// Has every window that is made from now on speak the first language of `locale` that there is a catalogue
 /// of, or that the texts are written in. An earlier language is taken away. It needs an application object.
+/// @param texts  whether the toolkit's own texts are translated, too, which a host may have done
 /// @return that language, "en" where there is no other
-QString install(const QLocale& locale = QLocale::system());
+QString install(const QLocale& locale = QLocale::system(), Texts texts = WithToolkit);
+
+/// Takes away the language that was installed.
+void remove();
 
 /// The languages of the catalogues, such as "de".
 QStringList languages();

@@ -957,6 +957,45 @@ Ihre Änderungen verloren. Fortfahren?</translation>
     </message>
 </context>
 <context>
+    <name>PluginMain</name>
+    <message>
+        <source>%1
+(%2)
+
+If the problem persists, review the plug-in&apos;s log, and contact
+the Kestrand support team.</source>
+        <translation>%1
+(%2)
+
+Wenn das Problem bestehen bleibt, sehen Sie im Protokoll des Plug-ins nach und wenden Sie sich
+an den Support von Kestrand.</translation>
+    </message>
+    <message>
+        <source>Error while running Kestrand Orvela</source>
+        <translation>Fehler beim Ausführen von Kestrand Orvela</translation>
+    </message>
+    <message>
+        <source>The plug-in failed to run for an unknown reason.
+If the problem persists, review the plug-in&apos;s log, and contact
+the Kestrand support team.</source>
+        <translation>Das Plug-in konnte aus unbekanntem Grund nicht ausgeführt werden.
+Wenn das Problem bestehen bleibt, sehen Sie im Protokoll des Plug-ins nach und wenden Sie sich
+an den Support von Kestrand.</translation>
+    </message>
+    <message>
+        <source>The was unable to create the About dialog.</source>
+        <translation>Das Fenster mit Angaben zum Programm konnte nicht geöffnet werden.</translation>
+    </message>
+    <message>
+        <source>The plug-in was unable to prepare it&apos;s globals.</source>
+        <translation>Das Plug-in konnte seine Daten nicht vorbereiten.</translation>
+    </message>
+    <message>
+        <source>The plug-in was unable to run it&apos;s main processing method.</source>
+        <translation>Das Plug-in konnte seine Verarbeitung nicht ausführen.</translation>
+    </message>
+</context>
+<context>
     <name>PresetDrop</name>
     <message>
         <source>%1: is not a file; drop one preset file, such as one that --save-preset wrote</source>

@@ -957,6 +957,45 @@ los cambios realizados. ¿Continuar?</translation>
     </message>
 </context>
 <context>
+    <name>PluginMain</name>
+    <message>
+        <source>%1
+(%2)
+
+If the problem persists, review the plug-in&apos;s log, and contact
+the Kestrand support team.</source>
+        <translation>%1
+(%2)
+
+Si el problema persiste, revise el registro del complemento y póngase en contacto
+con el equipo de soporte de Kestrand.</translation>
+    </message>
+    <message>
+        <source>Error while running Kestrand Orvela</source>
+        <translation>Error al ejecutar Kestrand Orvela</translation>
+    </message>
+    <message>
+        <source>The plug-in failed to run for an unknown reason.
+If the problem persists, review the plug-in&apos;s log, and contact
+the Kestrand support team.</source>
+        <translation>El complemento no se pudo ejecutar por un motivo desconocido.
+Si el problema persiste, revise el registro del complemento y póngase en contacto
+con el equipo de soporte de Kestrand.</translation>
+    </message>
+    <message>
+        <source>The was unable to create the About dialog.</source>
+        <translation>No se pudo abrir la ventana de información del programa.</translation>
+    </message>
+    <message>
+        <source>The plug-in was unable to prepare it&apos;s globals.</source>
+        <translation>El complemento no pudo preparar sus datos.</translation>
+    </message>
+    <message>
+        <source>The plug-in was unable to run it&apos;s main processing method.</source>
+        <translation>El complemento no pudo ejecutar su procesamiento.</translation>
+    </message>
+</context>
+<context>
     <name>PresetDrop</name>
     <message>
         <source>%1: is not a file; drop one preset file, such as one that --save-preset wrote</source>

@@ -29,7 +29,7 @@ TEST_F(WebPostTest, SendsTheFormAsItIsAndReturnsTheReply) {
     WebPost::Form form = formFor(server);
     const WebPost::Reply reply = WebPost::post(form);
     EXPECT_EQ(reply.body, "an answer");
-    EXPECT_EQ(reply.error, QString());
+    EXPECT_EQ(reply.error, "");
     ASSERT_EQ(server.requests.size(), 1);
     QByteArrayList lines = server.requests[0].replace("\r\n", "\n").split('\n');
     EXPECT_EQ(lines.takeFirst(), "POST /folder/script.php HTTP/1.1");
@@ -76,6 +76,6 @@ TEST_F(WebPostTest, ReadsNoFurtherThanItsLimit) {
     HttpServer server({}, HttpServer::WithoutEnd);
     WebPost::Form form = formFor(server);
     form.limit = std::chrono::minutes(1);
-    EXPECT_EQ(WebPost::post(form).body, QByteArray(WebPost::kMostBytes, 'x'));
+    EXPECT_EQ(WebPost::post(form).body, std::string(WebPost::kMostBytes, 'x'));
     EXPECT_TRUE(QTest::qWaitFor([&server] { return server.dropped > 0; }));
 }

@@ -48,6 +48,7 @@ TEST_F(Runs, LeaveNothingInUseThatChangesTheSettingsOrOpensABox) {
             for (const char* keys : {"Ctrl+E", "Ctrl+Shift+E", "Ctrl+R", "Ctrl+S", "Ctrl+D", "Ctrl+Z"})
                 QTest::keySequence(&opened.window, QKeySequence(QLatin1String(keys)));
             EXPECT_EQ(QApplication::activeModalWidget(), &opened.window);
+            EXPECT_FALSE(opened.find("btnRefresh")->isVisible());
             EXPECT_EQ(controls(), before);
             EXPECT_EQ(opened.presets()->currentText(), preset);
             ++tried;
@@ -60,6 +61,23 @@ TEST_F(Runs, LeaveNothingInUseThatChangesTheSettingsOrOpensABox) {
         opened.click("btnOK");
     });
     expectWholeResult();
+}
+
+TEST_F(Runs, CanBeStoppedEachTime) {
+    opened.run([&] {
+        int stopped = 0;
+        for (int round = 1; round <= 2; ++round) {
+            during([&] {
+                EXPECT_TRUE(opened.find("btnStopProcessing")->isVisible());
+                EXPECT_TRUE(opened.find("btnStopProcessing")->isEnabled());
+                opened.click("btnStopProcessing");
+                ++stopped;
+            });
+            opened.click("btnRefresh");
+            EXPECT_EQ(stopped, round);
+        }
+        opened.click("btnCancel");
+    });
 }
 
 TEST_F(Runs, ReadAThumbThatIsHeldWhereItComesToStand) {

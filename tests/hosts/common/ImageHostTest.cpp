@@ -1,10 +1,10 @@
-#include "common/ImageHost.h"
-
 #include "hosts/TestPhotograph.h"
+#include "support/HostedPicture.h"
 
 #include <gtest/gtest.h>
 
 #include <cstdlib>
+#include <cstring>
 
 using namespace orvela;
 
@@ -27,7 +27,7 @@ TEST(ImageHost, MapsEndsToEndsAndLosesAtMostOne) {
 
 // A 4 x 3 RGB picture counts its samples: pixel (x, y) plane p holds 3 * (4 * y + x) + p.
 TEST(ImageHost, AnswersRequestsOverPartsOfTheImage) {
-    ImageHost host(counting(ColorModel::Rgb, 4, 3));
+    HostedPicture host(counting(ColorModel::Rgb, 4, 3));
     host::FilterRecord& record = host.record();
     record.inRect = {1, 2, 3, 4};
     record.inLoPlane = 1;
@@ -42,11 +42,11 @@ TEST(ImageHost, AnswersRequestsOverPartsOfTheImage) {
     auto* out = static_cast<std::uint8_t*>(record.outData);
     EXPECT_EQ(out[1], 5); // the current destination
     out[1] = 99;
-    EXPECT_EQ(host.photograph().samples[5], 5); // not before the next call
+    EXPECT_EQ(host.result.samples[5], 5); // not before the next call
     record.outRect = {};
     ASSERT_EQ(record.advanceState(), 0);
-    EXPECT_EQ(host.photograph().samples[5], 99);
-    EXPECT_EQ(host.photograph().samples[8], 8);
+    EXPECT_EQ(host.result.samples[5], 99);
+    EXPECT_EQ(host.result.samples[8], 8);
     EXPECT_TRUE(record.outData == nullptr); // packed: no reference may bind
     EXPECT_EQ(record.outRowBytes, 0);
     record.outRect = {0, 0, 1, 2};
@@ -56,8 +56,33 @@ TEST(ImageHost, AnswersRequestsOverPartsOfTheImage) {
     EXPECT_EQ(static_cast<std::uint8_t*>(record.inData)[2], 4); // input stays the source
 }
 
+// 2 x 1 pixels of 16 bits, planes 0 to 2 of four: numbers 0, 8192, 16384 and so on, all of which come through
+// the host's range.
+TEST(ImageHost, ConvertsSixteenBitsBothWaysAndLeavesWhatIsNotWritten) {
+    Photograph picture = testPhotograph(ColorModel::RgbAlpha, 16, 2, 1, [](std::size_t) { return 0; });
+    std::vector<std::uint16_t> samples = {0, 8192, 16384, 1, 32768, 65535, 49152, 65534};
+    std::memcpy(picture.samples.data(), samples.data(), picture.samples.size());
+    HostedPicture host(picture);
+    host::FilterRecord& record = host.record();
+    EXPECT_EQ(record.planes, 4);
+    EXPECT_EQ(record.filterCase, 4);
+    record.outRect = record.filterRect;
+    record.outLoPlane = 1;
+    record.outHiPlane = 2;
+    ASSERT_EQ(record.advanceState(), 0);
+    auto* out = static_cast<std::uint16_t*>(record.outData);
+    EXPECT_EQ((std::vector<int>(out, out + 4)), (std::vector<int>{4096, 8192, 32768, 24576}));
+    out[0] = 16384;
+    out[3] = 40000; // above full scale
+    record.outRect = {};
+    ASSERT_EQ(record.advanceState(), 0);
+    samples[1] = 32768;
+    samples[6] = 65535;
+    EXPECT_EQ(std::memcmp(host.result.samples.data(), samples.data(), 16), 0);
+}
+
 TEST(ImageHost, RefusesRequestsOutsideTheImage) {
-    ImageHost host(counting(ColorModel::GreyAlpha, 4, 3));
+    HostedPicture host(counting(ColorModel::GreyAlpha, 4, 3));
     host::FilterRecord& record = host.record();
     EXPECT_EQ(record.planes, 1);
     const host::Rect inside = record.filterRect;
@@ -75,15 +100,16 @@ TEST(ImageHost, RefusesRequestsOutsideTheImage) {
     }
 }
 
-// That it fails on demand is seen by the picture session's tests.
 TEST(ImageHost, AnswersForTheYoungest) {
-    ImageHost host(counting(ColorModel::Rgb, 4, 3));
+    HostedPicture host(counting(ColorModel::Rgb, 4, 3));
+    host.record().inRect = host.record().filterRect;
     {
-        ImageHost younger(counting(ColorModel::Grey, 1, 1));
-        younger.onAbort = [] { return true; };
-        EXPECT_EQ(host.record().abortProc(), 1);
+        const HostedPicture younger(counting(ColorModel::Grey, 1, 1));
+        EXPECT_EQ(host.record().advanceState(), 0);
+        EXPECT_TRUE(host.record().inData == nullptr);
     }
-    EXPECT_EQ(host.record().abortProc(), 0);
+    EXPECT_EQ(host.record().advanceState(), 0);
+    EXPECT_FALSE(host.record().inData == nullptr);
 }
 
 } // namespace

@@ -1,8 +1,8 @@
-#include "PluginEntry/CARGBPlanePhotoshop.h"
-#include "common/ImageHost.h"
+#include "PluginEntry/Exchange/CARGBPlanePhotoshop.h"
 #include "files/PhotographReader.h"
 #include "files/PhotographWriter.h"
 #include "hosts/TestFiles.h"
+#include "support/HostedPicture.h"
 
 #include <gmock/gmock.h>
 
@@ -16,13 +16,13 @@ using namespace orvela;
 namespace {
 
 // What the filter does when no task changes anything.
-Photograph identityRun(Photograph photograph) {
-    ImageHost host(std::move(photograph));
+Photograph identityRun(const Photograph& photograph) {
+    HostedPicture host(photograph);
     CARGBPlanePhotoshop plane(0, 0, QStringLiteral("identity"));
     std::int16_t result = 0;
     plane.FillFrom_Photoshop_Data(&host.record(), &result);
     plane.copyPlaneToPS(&host.record(), &result);
-    return std::move(host.photograph());
+    return std::move(host.result);
 }
 
 struct Case {
