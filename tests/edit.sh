@@ -10,6 +10,8 @@ scratch=$(mktemp -d)
 trap 'kill $(jobs -p) 2>/dev/null || :; rm -r "$scratch"' EXIT
 export XDG_CONFIG_HOME=$scratch/config XDG_RUNTIME_DIR=$scratch/run TMP=$scratch LC_ALL=C.UTF-8
 export QT_QPA_PLATFORM=xcb TMPDIR=$scratch/tmp
+# A crash ends the process by its signal in a sanitized build, too.
+export ASAN_OPTIONS=${ASAN_OPTIONS:+$ASAN_OPTIONS:}handle_segv=0
 mkdir -m 700 "$XDG_RUNTIME_DIR" "$TMPDIR"
 openbox --sm-disable 2>/dev/null &
 cd "$scratch"
